@@ -1,0 +1,32 @@
+# Compile options of every target, as one interface library.
+add_library(orvane_options INTERFACE)
+target_compile_options(
+  orvane_options
+  INTERFACE -Wall
+            -Wextra
+            -Wconversion
+            -Wshadow
+            -Wformat=2
+            -Wnon-virtual-dtor
+            -Woverloaded-virtual
+            -Werror)
+
+if(ORVANE_SANITIZERS)
+  target_compile_options(
+    orvane_options INTERFACE -fsanitize=${ORVANE_SANITIZERS} -fno-omit-frame-pointer
+                             -fno-sanitize-recover=all)
+  target_link_options(orvane_options INTERFACE -fsanitize=${ORVANE_SANITIZERS})
+endif()
+
+if(ORVANE_FUZZ)
+  if(NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
+    message(FATAL_ERROR "ORVANE_FUZZ needs clang: cmake --preset fuzz, or -DCMAKE_CXX_COMPILER=clang++")
+  endif()
+  target_compile_options(orvane_options INTERFACE -fsanitize=fuzzer-no-link)
+  target_link_options(orvane_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
+
+if(ORVANE_COVERAGE)
+  target_compile_options(orvane_options INTERFACE --coverage -O0)
+  target_link_options(orvane_options INTERFACE --coverage)
+endif()

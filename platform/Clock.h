@@ -1,0 +1,53 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+
+namespace orvane
+{
+
+// The local time zone at some moment.
+struct TimeZone {
+    int secondsFromGmt = 0; // east is positive
+    bool isDaylightSaving = false;
+};
+
+// Wall-clock time and the local time zone.
+class Clock
+{
+public:
+    virtual ~Clock() = default;
+    // Seconds since 1970-01-01 00:00:00 UTC, with fraction.
+    [[nodiscard]] virtual double secondsSince1970() const = 0;
+    [[nodiscard]] virtual TimeZone timeZoneAt(double secondsSince1970) const = 0;
+};
+
+// This machine's clock and zone.
+class RealClock final : public Clock
+{
+public:
+    [[nodiscard]] double secondsSince1970() const override;
+    [[nodiscard]] TimeZone timeZoneAt(double secondsSince1970) const override;
+};
+
+// A date and time of day in the proleptic Gregorian calendar.
+struct CalendarTime {
+    std::int64_t year = 1970;
+    int month = 1; // 1 to 12
+    int day = 1;   // 1 to 31
+    int hour = 0;
+    int minute = 0;
+    int second = 0;
+};
+
+// The calendar time of a whole second since 1970, shifted by `secondsFromGmt`.
+CalendarTime calendarTime(std::int64_t secondsSince1970, int secondsFromGmt = 0);
+// The inverse, in UTC. The fields must be in their ranges.
+std::int64_t secondsSince1970(const CalendarTime& time);
+
+// "2026-11-21 10:00:00 +0000", always in UTC, fraction dropped.
+std::string absoluteDateText(double secondsSince1970);
+// "Updated 2026-11-21 at 10:00:00" in the clock's local zone.
+std::string updatedText(const Clock& clock);
+
+} // namespace orvane

@@ -1,0 +1,44 @@
+#include "platform/Resources.h"
+
+#include "platform/FileSystem.h"
+#include "platform/PropertyList.h"
+#include "platform/SystemLog.h"
+
+#include <algorithm>
+#include <filesystem>
+
+namespace orvane
+{
+
+std::optional<Bytes> DirectoryResources::load(std::string_view name, std::string_view type) const
+{
+    return readFile(_directory + "/" + std::string(name) + "." + std::string(type));
+}
+
+std::vector<std::string> DirectoryResources::pathsOfType(std::string_view type) const
+{
+    const std::string extension = "." + std::string(type);
+    std::vector<std::string> paths;
+    std::error_code error;
+    for (const auto& entry : std::filesystem::directory_iterator(_directory, error))
+        if (entry.path().extension() == extension)
+            paths.push_back(entry.path().string());
+    std::sort(paths.begin(), paths.end());
+    return paths;
+}
+
+PropertyValue loadDictionaryResource(const Resources& resources, std::string_view name)
+{
+    const std::optional<Bytes> content = resources.load(name, "plist");
+    if (!content)
+        return {};
+    const PropertyListResult result = readPropertyList(*content);
+    if (!result.value) {
+        logError("Resource \"%s\" cannot be read: %s", std::string(name).c_str(),
+                 result.error.c_str());
+        return {};
+    }
+    return result.value.asDictionary() ? result.value : PropertyValue();
+}
+
+} // namespace orvane

@@ -1,0 +1,104 @@
+#include "platform/SystemLog.h"
+
+#include "platform/Services.h"
+
+#include <cstdarg>
+#include <cstdio>
+#include <string>
+#include <syslog.h>
+
+namespace orvane
+{
+
+namespace
+{
+
+std::string_view withoutNewline(std::string_view text)
+{
+    return text.ends_with('\n') ? text.substr(0, text.size() - 1) : text;
+}
+
+void logFormatted(LogPriority priority, const char* format, std::va_list arguments)
+{
+    SystemLog& log = Services::current().log();
+    if (!log.accepts(priority))
+        return;
+    std::va_list again;
+    va_copy(again, arguments);
+    char text[256];
+    const int length = std::vsnprintf(text, sizeof text, format, arguments);
+    if (length >= 0 && static_cast<std::size_t>(length) < sizeof text) {
+        log.write(priority, std::string_view(text, static_cast<std::size_t>(length)));
+    } else if (length > 0) {
+        std::string longText(static_cast<std::size_t>(length), '\0');
+        std::vsnprintf(longText.data(), longText.size() + 1, format, again);
+        log.write(priority, longText);
+    }
+    va_end(again);
+}
+
+} // namespace
+
+const char* logPriorityName(LogPriority priority)
+{
+    switch (priority) {
+    case LogPriority::Error:
+        return "error";
+    case LogPriority::Warning:
+        return "warning";
+    case LogPriority::Notice:
+        return "notice";
+    case LogPriority::Info:
+        return "info";
+    }
+    return "info";
+}
+
+void StandardErrorLog::write(LogPriority priority, std::string_view text)
+{
+    // One call a line, so that lines of several threads and processes do not mix.
+    std::string line = logPriorityName(priority);
+    line += ": ";
+    line += withoutNewline(text);
+    line += '\n';
+    std::fwrite(line.data(), 1, line.size(), stderr);
+}
+
+SyslogLog::SyslogLog(const char* programName, LogPriority lowest) : SystemLog(lowest)
+{
+    openlog(programName, LOG_PID, LOG_USER);
+}
+
+SyslogLog::~SyslogLog() { closelog(); }
+
+void SyslogLog::write(LogPriority priority, std::string_view text)
+{
+    text = withoutNewline(text);
+    syslog(static_cast<int>(priority), "%.*s", static_cast<int>(text.size()), text.data());
+}
+
+void logLine(LogPriority priority, const char* format, ...)
+{
+    std::va_list arguments;
+    va_start(arguments, format);
+    logFormatted(priority, format, arguments);
+    va_end(arguments);
+}
+
+void logError(const char* format, ...)
+{
+    std::va_list arguments;
+    va_start(arguments, format);
+    logFormatted(LogPriority::Error, format, arguments);
+    va_end(arguments);
+}
+
+void logWarning(const char* format, ...)
+{
+    std::va_list arguments;
+    va_start(arguments, format);
+    logFormatted(LogPriority::Warning, format, arguments);
+    va_end(arguments);
+}
+
+} // namespace orvane
