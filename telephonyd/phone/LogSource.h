@@ -1,0 +1,44 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <set>
+#include <string>
+
+namespace orvane
+{
+
+// What a start command asked a log channel for. Modem codes are 16-bit log codes; extra codes are
+// the numbers of the items that the server makes itself (0 SIM files, 1 cells, 2 data connections).
+// A start command without log codes (the cell-monitor channel) leaves both empty.
+struct LogSelection {
+    std::set<std::uint32_t> modemCodes;
+    std::set<std::uint32_t> extraCodes;
+};
+
+// Where the messages of one log channel come from: a simulated phone or a recording. Made anew for
+// each channel, in the thread of the server's queue.
+class LogSource
+{
+public:
+    // Takes one log message as it goes over the wire and returns whether more is wanted right now:
+    // false means that the client is behind. A source that can wait then does until resume(); one
+    // that cannot (a live phone) goes on and leaves it to the channel to end.
+    using Send = std::function<bool(ByteView message)>;
+
+    virtual ~LogSource() = default;
+    // The technology constant that answers the technology query.
+    [[nodiscard]] virtual std::string technology() const = 0;
+    // Begins to send what the selection asks for, never from within this call. Called once.
+    virtual void start(const LogSelection& selection, Send send) = 0;
+    // The client has taken what was queued.
+    virtual void resume() {}
+};
+
+// Makes the source of a new channel.
+using LogSourceFactory = std::function<std::unique_ptr<LogSource>()>;
+
+} // namespace orvane
