@@ -1,5 +1,7 @@
 #include "platform/PropertyValue.h"
 
+#include "platform/Clock.h"
+
 #include <cmath>
 #include <cstdio>
 #include <initializer_list>
@@ -60,6 +62,11 @@ PropertyValue::PropertyValue(std::shared_ptr<PropertyArray> array)
         _value = std::move(array);
 }
 
+PropertyValue PropertyValue::data(Bytes bytes)
+{
+    return PropertyValue(Storage(std::make_shared<const Bytes>(std::move(bytes))));
+}
+
 PropertyValue PropertyValue::newDictionary() { return std::make_shared<PropertyDictionary>(); }
 
 PropertyValue PropertyValue::newArray() { return std::make_shared<PropertyArray>(); }
@@ -79,6 +86,12 @@ PropertyValue PropertyValue::arrayOf(std::initializer_list<PropertyValue> elemen
     for (const PropertyValue& element : elements)
         array->append(element);
     return array;
+}
+
+const Bytes* PropertyValue::asData() const
+{
+    const DataPointer* pointer = std::get_if<DataPointer>(&_value);
+    return pointer ? pointer->get() : nullptr;
 }
 
 PropertyDictionary* PropertyValue::asDictionary() const
@@ -138,6 +151,8 @@ bool operator==(const PropertyValue& left, const PropertyValue& right)
                equalDictionaries(*left.asDictionary(), *right.asDictionary());
     case PropertyValue::Type::Array:
         return left.asArray()->elements() == right.asArray()->elements();
+    case PropertyValue::Type::Data:
+        return *left.asData() == *right.asData();
     case PropertyValue::Type::Real:
         return equalReals(*left.asReal(), *right.asReal());
     case PropertyValue::Type::Date:
@@ -203,7 +218,7 @@ std::string PropertyValue::description() const
     case Type::Data:
         return hexadecimal(*asData());
     case Type::Date:
-        return formattedReal(asDate()->secondsSince1970);
+        return absoluteDateText(asDate()->secondsSince1970);
     case Type::Absent:
         break;
     }
@@ -227,6 +242,13 @@ void PropertyDictionary::set(std::string_view key, PropertyValue value)
 const PropertyValue& PropertyArray::operator[](std::size_t index) const
 {
     return index < _elements.size() ? _elements[index] : kAbsent;
+}
+
+void PropertyArray::append(PropertyValue value)
+{
+    if (value.isAbsent())
+        throw std::invalid_argument("an absent value cannot be stored in an array");
+    _elements.push_back(std::move(value));
 }
 
 void PropertyArray::removeFirst(std::size_t count)

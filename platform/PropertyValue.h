@@ -29,7 +29,7 @@ struct PropertyDate {
 
 // The one value type of commands, replies, templates, state, display and files.
 //
-// Scalars are values. Dictionaries and arrays have reference semantics: copying a PropertyValue
+// Scalars are values; the bytes of data are never changed, so copies share them. Dictionaries and arrays have reference semantics: copying a PropertyValue
 // shares them, so that a section can keep writing into a subtree that the state owns; deepCopy()
 // makes an independent tree. A default-made value is absent: asking it for anything yields nothing.
 // Texts are UTF-8.
@@ -49,7 +49,7 @@ public:
     static PropertyValue integer(std::int64_t number) { return PropertyValue(Storage(number)); }
     static PropertyValue real(double number) { return PropertyValue(Storage(number)); }
     static PropertyValue boolean(bool flag) { return PropertyValue(Storage(flag)); }
-    static PropertyValue data(Bytes bytes) { return PropertyValue(Storage(std::move(bytes))); }
+    static PropertyValue data(Bytes bytes);
     static PropertyValue date(PropertyDate date) { return PropertyValue(Storage(date)); }
     static PropertyValue newDictionary();
     static PropertyValue newArray();
@@ -69,7 +69,7 @@ public:
     [[nodiscard]] std::optional<std::int64_t> asInteger() const { return scalar<std::int64_t>(); }
     [[nodiscard]] std::optional<double> asReal() const { return scalar<double>(); }
     [[nodiscard]] std::optional<bool> asBoolean() const { return scalar<bool>(); }
-    [[nodiscard]] const Bytes* asData() const { return std::get_if<Bytes>(&_value); }
+    [[nodiscard]] const Bytes* asData() const;
     [[nodiscard]] std::optional<PropertyDate> asDate() const { return scalar<PropertyDate>(); }
     // The container is shared, hence changeable also through a constant value.
     [[nodiscard]] PropertyDictionary* asDictionary() const;
@@ -96,9 +96,10 @@ public:
 private:
     using DictionaryPointer = std::shared_ptr<PropertyDictionary>;
     using ArrayPointer = std::shared_ptr<PropertyArray>;
+    using DataPointer = std::shared_ptr<const Bytes>;
     // The order of the alternatives is the order of Type.
     using Storage = std::variant<std::monostate, DictionaryPointer, ArrayPointer, std::string,
-                                 std::int64_t, double, bool, Bytes, PropertyDate>;
+                                 std::int64_t, double, bool, DataPointer, PropertyDate>;
 
     explicit PropertyValue(Storage value) : _value(std::move(value)) {}
 
@@ -150,7 +151,8 @@ public:
     [[nodiscard]] const PropertyValue& operator[](std::size_t index) const;
     [[nodiscard]] const std::vector<PropertyValue>& elements() const { return _elements; }
 
-    void append(PropertyValue value) { _elements.push_back(std::move(value)); }
+    // Like PropertyDictionary::set, refuses an absent value.
+    void append(PropertyValue value);
     // Removes `count` elements from the front, or all if there are fewer.
     void removeFirst(std::size_t count);
     void replaceElements(std::vector<PropertyValue> elements) { _elements = std::move(elements); }

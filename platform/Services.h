@@ -5,6 +5,10 @@
 #include "platform/Resources.h"
 #include "platform/SystemLog.h"
 
+#include <optional>
+#include <string>
+#include <utility>
+
 namespace orvane
 {
 
@@ -27,6 +31,10 @@ public:
     void setResources(Resources* resources);
     void setClock(Clock* clock);
 
+    // The application's version, if it has one.
+    [[nodiscard]] const std::optional<std::string>& version() const { return _version; }
+    void setVersion(std::optional<std::string> version) { _version = std::move(version); }
+
 private:
     Services();
 
@@ -34,6 +42,7 @@ private:
     Console* _console;
     Resources* _resources;
     Clock* _clock;
+    std::optional<std::string> _version;
 };
 
 } // namespace orvane
