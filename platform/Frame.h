@@ -4,12 +4,15 @@
 
 #include <cstdint>
 #include <optional>
+#include <string>
 
 namespace orvane
 {
 
 // One message on a connection: a 16-byte header (length of the data, message id, serial, flags; all
-// 32-bit little-endian), then the data.
+// 32-bit little-endian), then the data. Flag bit 0 says that a reply is wanted, bit 1 that this is
+// a reply. The other bits are written as 0 and not looked at when reading, so that a later version
+// may give them a meaning that older readers can do without.
 struct Frame {
     std::int32_t messageId = 0;
     std::uint32_t serial = 0; // chosen by the sender; a reply carries its request's
@@ -25,7 +28,9 @@ constexpr std::size_t kFrameDataLimit = 16U * 1024 * 1024;
 void appendFrame(Bytes& to, std::int32_t messageId, std::uint32_t serial, bool wantsReply,
                  bool isReply, ByteView data);
 
-// Cuts a byte stream into frames. Never holds more than one frame's bytes beyond what it was given.
+// Cuts a byte stream into frames, however the stream is split. Holds only bytes that it was given:
+// an announced length takes no memory before the bytes come. Each byte is moved a bounded number of
+// times, also where one append() brings many small frames.
 class FrameReader
 {
 public:
@@ -45,8 +50,12 @@ public:
     [[nodiscard]] bool hasFailed() const { return _failed; }
     // The announced length that made it fail.
     [[nodiscard]] std::uint32_t failedLength() const { return _failedLength; }
+    // The error line for a reader that has failed.
+    [[nodiscard]] std::string failureText() const;
 
 private:
+    void discardRead();
+
     Bytes _buffer;
     std::size_t _start = 0; // of the next frame in _buffer
     bool _failed = false;

@@ -28,8 +28,12 @@ public:
 
     [[nodiscard]] virtual bool isOpen() const = 0;
     // Queues a frame; what the peer does not take at once is sent as it reads. False when closed.
+    // The data must be within kFrameDataLimit (std::length_error otherwise).
     virtual bool send(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
                       ByteView data) = 0;
+    // Takes back the frame queued last, if none of its bytes has been written yet. False when some
+    // have been, or where the transport cannot: the frame then stays queued.
+    virtual bool withdrawLast() { return false; }
     [[nodiscard]] virtual std::size_t queuedBytes() const = 0;
     // For the few calls that must wait: serves this connection alone (sending what is queued,
     // calling its frame callback) until `done` is true, the timeout is over or the connection has

@@ -71,7 +71,7 @@ public:
     virtual std::unique_ptr<RemoteMessagePort> createRemote(const std::string& name) = 0;
 };
 
-// A name of 1 to 64 bytes of letters, digits, '.', '-' and '_'.
+// A name of 1 to 64 bytes of letters, digits, '.', '-' and '_', other than "." and "..".
 bool isUsablePortName(std::string_view name);
 
 } // namespace orvane
