@@ -1,0 +1,38 @@
+#pragma once
+
+#include "LogGenerator/LogMessage.h"
+#include "platform/PropertyValue.h"
+
+#include <cstdint>
+#include <optional>
+#include <span>
+
+namespace orvane
+{
+
+// Cell-monitor records: after the 13-byte header a property list whose root is an array of cell
+// dictionaries, which the telephony server makes.
+
+// The array of cells; null when the record cannot be parsed (one error line) or its root is no
+// array.
+std::shared_ptr<PropertyArray> cellArray(PacketView record);
+
+// Whether the cell's technology and type are these (kTSCellMonitor... texts); a cell that lacks
+// either is not.
+bool isCell(const PropertyValue& cell, const char* technology, const char* type);
+
+// A number of a cell or nothing: an integer, or a real without fraction, within 32 signed bits.
+std::optional<std::int32_t> cellNumber(const PropertyValue& cell, const char* key);
+
+// One row that a cell's number fills, with "%d".
+struct CellRow {
+    const char* key;
+    const char* row;
+    const char* failure; // logged at error priority when there is no such number
+};
+
+// Writes the rows in order; a number that is not there leaves its row as it was.
+void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
+                   std::span<const CellRow> cellRows);
+
+} // namespace orvane

@@ -1,0 +1,49 @@
+#include "LogGenerator/Field.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+std::int64_t bigEndian(std::uint64_t value, unsigned bits)
+{
+    std::int64_t swapped = 0;
+    for (unsigned shift = 0; shift < bits; shift += 8)
+        swapped = swapped << 8 | static_cast<std::int64_t>(value >> shift & 0xFF);
+    return swapped;
+}
+
+} // namespace
+
+std::optional<std::int64_t> Field::valueIn(PacketView packet) const
+{
+    const auto raw = packet.bitsAt(offset, bit, bits);
+    if (!raw)
+        return std::nullopt;
+    const auto value = static_cast<std::int64_t>(*raw);
+    if (coding == Coding::BigEndian)
+        return bigEndian(*raw, bits);
+    const bool isNegative = coding == Coding::Signed && (value >> (bits - 1) & 1) != 0;
+    return isNegative ? value - (std::int64_t{1} << bits) : value;
+}
+
+void writeRows(PropertyDictionary* rows, PacketView packet, std::span<const Field> fields)
+{
+    if (!rows)
+        return;
+    for (const Field& field : fields)
+        if (const auto raw = field.valueIn(packet))
+            if (RowText text = field.format(*raw))
+                rows->set(field.row, std::move(*text));
+}
+
+void setRow(PropertyDictionary* rows, const char* row, std::string text)
+{
+    if (rows)
+        rows->set(row, std::move(text));
+}
+
+} // namespace orvane

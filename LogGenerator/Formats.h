@@ -1,0 +1,39 @@
+#pragma once
+
+#include "LogGenerator/Field.h"
+
+#include <cstdint>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace orvane
+{
+
+// printf into a text.
+[[gnu::format(printf, 1, 2)]] std::string printed(const char* format, ...);
+
+// Names of a field's values.
+struct ValueName {
+    std::int64_t value;
+    const char* name;
+};
+
+// The value's name, or the fallback for one that the table lacks.
+constexpr const char* nameOf(std::span<const ValueName> table, std::int64_t value,
+                             const char* fallback)
+{
+    for (const ValueName& entry : table)
+        if (entry.value == value)
+            return entry.name;
+    return fallback;
+}
+
+// Formats that several sections share. Each holds one printf format.
+
+// "%d": an unsigned 32-bit value beyond 2147483647 shows as C shows it, negative.
+RowText decimal(std::int64_t raw);
+// "%d dBm".
+RowText decibelMilliwatts(std::int64_t raw);
+
+} // namespace orvane

@@ -1,0 +1,41 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <memory>
+
+namespace orvane
+{
+
+// The abstract base of everything that turns log messages into a display. The state dictionary
+// belongs to the caller and is passed into every call; its keys are in LogGenerator/StateKeys.h.
+class LogGenerator
+{
+public:
+    LogGenerator() = default;
+    virtual ~LogGenerator() = default;
+    LogGenerator(const LogGenerator&) = delete;
+    LogGenerator& operator=(const LogGenerator&) = delete;
+
+    // Logs the creation. Subclasses call it from their own `init`.
+    void init();
+
+    // The abstract operations throw UnrecognisedOperation here.
+
+    // Takes one message. What it throws ends that message only.
+    virtual void updateState(PropertyDictionary& state, ByteView data);
+    // The display to show, absent when there is none yet. Records a snapshot in the history.
+    virtual PropertyValue generateLogUsingState(PropertyDictionary& state);
+    // The dictionary that starts the log channel.
+    [[nodiscard]] virtual PropertyValue getStartCommand() const;
+    // An array of the entries that a snapshot file holds.
+    virtual PropertyValue getSaveContentsFromState(PropertyDictionary& state);
+
+    // A new generator for the technology that the server named, or null for any other value.
+    static std::unique_ptr<LogGenerator> generatorFromTechnology(const PropertyValue& technology);
+
+    // Appends a snapshot of the state to its "History", which keeps the newest five.
+    static void updateHistoryInState(PropertyDictionary& state);
+};
+
+} // namespace orvane

@@ -1,0 +1,39 @@
+#pragma once
+
+#include "LogGenerator/Field.h"
+#include "LogGenerator/PacketView.h"
+
+#include <optional>
+#include <span>
+#include <vector>
+
+namespace orvane
+{
+
+// The repeated records of a packet: `count` of them, the first at `first`, each `stride` bytes
+// after the one before. The count is only the packet's claim.
+class Records
+{
+public:
+    Records(PacketView packet, std::size_t first, std::size_t stride, std::size_t count)
+        : _packet(packet), _first(first), _stride(stride), _count(count)
+    {
+    }
+
+    [[nodiscard]] std::size_t count() const { return _count; }
+    // A window from the record's first byte to the packet's end, which may be short or empty.
+    // Throws ArrayOutOfBoundsException for an index that is not below the count.
+    [[nodiscard]] PacketView at(std::size_t index) const;
+
+private:
+    PacketView _packet;
+    std::size_t _first;
+    std::size_t _stride;
+    std::size_t _count;
+};
+
+// One dictionary a record, rows in the fields' order, as far as the packet goes: the walk stops at
+// the first record that is not whole, that is, of which any byte to be read is missing.
+std::vector<PropertyValue> recordRows(const Records& records, std::span<const Field> fields);
+
+} // namespace orvane

@@ -1,0 +1,51 @@
+#include "LogGenerator/Section.h"
+
+namespace orvane
+{
+
+void Section::updateWithData(ByteView data, std::uint32_t logCode)
+{
+    logLine(_layout->callPriority, "%s", _layout->callText);
+    for (const PacketLayout& layout : _layout->packets) {
+        if (layout.logCode != logCode)
+            continue;
+        if (data.size() >= layout.minimumBytes)
+            decode(PacketView(data), layout);
+        return;
+    }
+    if (_layout->unknownCode == UnknownCode::Report)
+        reportUnknownCode(logCode);
+}
+
+std::vector<std::uint32_t> Section::getLogCodeArray() const
+{
+    std::vector<std::uint32_t> codes;
+    for (const PacketLayout& layout : _layout->packets)
+        codes.push_back(layout.logCode);
+    return codes;
+}
+
+void Section::decode(PacketView packet, const PacketLayout& layout)
+{
+    writeRows(rows().get(), packet, layout.fields);
+}
+
+void Section::reportUnknownCode(std::uint32_t logCode)
+{
+    logError("Received an unknown log message: %d", static_cast<int>(logCode));
+}
+
+void ListSection::decode(PacketView packet, const PacketLayout& layout)
+{
+    const std::shared_ptr<PropertyArray> shown = list();
+    clearElementsInArray(shown.get());
+    replaceArray(shown.get(), elements(packet, layout));
+}
+
+std::vector<PropertyValue> ListSection::elements(PacketView packet, const PacketLayout& layout)
+{
+    return layout.records ? recordRows(layout.records->in(packet), layout.records->fields)
+                          : std::vector<PropertyValue>();
+}
+
+} // namespace orvane

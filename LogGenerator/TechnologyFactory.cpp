@@ -1,0 +1,33 @@
+#include "LogGenerator/LTE/LTELogGenerator.h"
+#include "LogGenerator/LogGenerator.h"
+#include "platform/TelephonyServer.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+struct Technology {
+    const char* identifier;
+    std::unique_ptr<LogGenerator> (*generator)();
+};
+
+constexpr Technology kTechnologies[] = {
+    {kTSLogChannelTechnology_Varnel_LTE, LTELogGenerator::generator},
+};
+
+} // namespace
+
+std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(const PropertyValue& technology)
+{
+    const std::string* identifier = technology.asString();
+    if (!identifier)
+        return nullptr;
+    for (const Technology& known : kTechnologies)
+        if (*identifier == known.identifier)
+            return known.generator();
+    return nullptr;
+}
+
+} // namespace orvane

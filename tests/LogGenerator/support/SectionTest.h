@@ -1,0 +1,78 @@
+#pragma once
+
+#include "LogGenerator/Base.h"
+#include "LogGenerator/support/PacketBuilder.h"
+#include "support/Recording.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace orvane
+{
+
+// What a display dictionary shows, in order: a row's text, or for a nested array its description.
+using Rows = std::vector<std::pair<std::string, std::string>>;
+
+inline Rows rowsOf(const PropertyValue& value)
+{
+    Rows rows;
+    if (const PropertyDictionary* dictionary = value.asDictionary())
+        for (const auto& [key, row] : *dictionary)
+            rows.emplace_back(key, row.description());
+    return rows;
+}
+
+// A section with a display of its own, as if a template had given it one.
+template <typename SectionUnderTest>
+class SectionTest : public ::testing::Test
+{
+protected:
+    SectionTest()
+        : display(section.subtreeType() == PropertyValue::Type::Array
+                      ? PropertyValue::newArray()
+                      : PropertyValue::newDictionary())
+    {
+        section.initWithDict(classDict, codeDict);
+        section.updateSectionRef(display);
+        services.log.lines.clear();
+    }
+
+    // Sends an exactly sized copy, so that the address sanitizer sees one byte too many.
+    void send(std::uint32_t code, const Bytes& packet)
+    {
+        const Bytes exact(packet.begin(), packet.end());
+        section.updateWithData(exact, code);
+    }
+    // The same, cut to the first `size` bytes.
+    void sendCut(std::uint32_t code, const Bytes& packet, std::size_t size)
+    {
+        send(code, Bytes(packet.begin(), packet.begin() + static_cast<std::ptrdiff_t>(size)));
+    }
+
+    [[nodiscard]] std::string row(std::string_view key) const
+    {
+        return display[key] ? display[key].description() : "(no row)";
+    }
+    [[nodiscard]] Rows rows() const { return rowsOf(display); }
+    // The rows of each element of a list section.
+    [[nodiscard]] std::vector<Rows> records() const
+    {
+        std::vector<Rows> all;
+        if (const PropertyArray* array = display.asArray())
+            for (const PropertyValue& element : *array)
+                all.push_back(rowsOf(element));
+        return all;
+    }
+
+    TestServices services;
+    ClassDictionary classDict;
+    CodeDictionary codeDict;
+    SectionUnderTest section;
+    PropertyValue display;
+};
+
+} // namespace orvane
