@@ -28,8 +28,8 @@ private:
     std::string _path;
 };
 
-// A new ports directory that nobody else knows of, in $XDG_RUNTIME_DIR or $TMPDIR or /tmp. Removed,
-// with what is left in it, at the end.
+// A new ports directory that nobody else knows of, in $XDG_RUNTIME_DIR or else in /tmp, whose paths
+// are short enough for sockets. Removed, with what is left in it, at the end.
 class PrivatePortsDirectory
 {
 public:
