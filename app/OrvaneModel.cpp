@@ -1,0 +1,96 @@
+#include "app/OrvaneModel.h"
+
+#include "LogGenerator/StateKeys.h"
+#include "platform/SystemLog.h"
+
+#include <exception>
+#include <typeinfo>
+#include <utility>
+
+namespace orvane
+{
+
+OrvaneModel::OrvaneModel(ModelEnvironment environment, ModelObserver* observer)
+    : _environment(std::move(environment)), _observer(observer),
+      _state(std::make_shared<PropertyDictionary>())
+{
+}
+
+OrvaneModel::~OrvaneModel() { destroyPorts(); }
+
+NodePointer OrvaneModel::topLevelNodes()
+{
+    if (_nodes || !_logGenerator)
+        return _nodes;
+    const PropertyValue display = _logGenerator->generateLogUsingState(*_state);
+    PathDictionary paths;
+    _nodes = OrvaneModelNode::makeTreeFromObject(display, paths);
+    _nodesByPath = std::move(paths);
+    return _nodes;
+}
+
+NodePointer OrvaneModel::nodeAtPath(const std::string& path)
+{
+    if (!_nodesByPath)
+        topLevelNodes();
+    if (!_nodesByPath)
+        return nullptr;
+    const auto found = _nodesByPath->find(path);
+    return found == _nodesByPath->end() ? nullptr : found->second;
+}
+
+void OrvaneModel::updateWithData(ByteView data)
+{
+    if (_logGenerator)
+        _logGenerator->updateState(*_state, data);
+    _updated = true;
+}
+
+void OrvaneModel::refresh()
+{
+    checkHealth();
+    if (!_updated)
+        return;
+    _updated = false;
+    _nodes = nullptr;
+    _nodesByPath.reset();
+    _environment.queue.async([weak = weak_from_this()] {
+        const auto model = weak.lock();
+        if (!model || !model->_observer)
+            return;
+        // The display is generated in here, from a template that may be bad.
+        try {
+            model->_observer->updateViewControllerFromModel();
+        } catch (const std::exception& failure) {
+            logError("The display cannot be shown: %s", failure.what());
+        }
+    });
+}
+
+PropertyValue OrvaneModel::getSaveContents()
+{
+    return _logGenerator ? _logGenerator->getSaveContentsFromState(*_state)
+                         : PropertyValue::newArray();
+}
+
+// A display belongs to one generator: a new one starts with a state of its own, or its sections
+// would have nothing to write into. Only the history goes over, to a generator of the same class.
+void OrvaneModel::adoptGenerator(std::unique_ptr<LogGenerator> generator)
+{
+    if (generator) {
+        // The tree on the screen stays until the new generator has taken a message. Where a refresh
+        // has just dropped it, this is the last chance to make it again.
+        topLevelNodes();
+        LogGenerator& adopted = *generator;
+        const std::type_index generatorClass = typeid(adopted);
+        const PropertyValue history = (*_state)[kHistoryKey];
+        _state = std::make_shared<PropertyDictionary>();
+        if (history && _historyClass == generatorClass)
+            _state->set(kHistoryKey, history);
+        _historyClass = generatorClass;
+        _updated = false;
+    }
+    _logGenerator = std::move(generator);
+}
+
+} // namespace orvane

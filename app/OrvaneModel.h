@@ -1,0 +1,101 @@
+#pragma once
+
+#include "LogGenerator/LogGenerator.h"
+#include "platform/MainQueue.h"
+#include "platform/MessagePort.h"
+#include "platform/TelephonyServer.h"
+#include "ui/OrvaneModelNode.h"
+
+#include <chrono>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+#include <typeindex>
+
+namespace orvane
+{
+
+// What the model asks of the shell. Both are called on the main queue, never from within a message.
+class ModelObserver
+{
+public:
+    virtual ~ModelObserver() = default;
+    // New data has arrived since the last call: read the tree again.
+    virtual void updateViewControllerFromModel() = 0;
+    // A start or restart has ended; whether the model is connected may have changed.
+    virtual void monitorStartEnded() = 0;
+};
+
+// What a model is made of. Referred to, not owned; all must outlive the model.
+struct ModelEnvironment {
+    MainQueue& queue;
+    MessagePorts& ports;
+    TelephonyServer& server;
+    std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
+    // Makes the unique part of the local port's name.
+    std::function<std::optional<std::string>()> makeUuid;
+};
+
+// The one model: owns the log-channel connection, the generator and the state that the generator
+// fills, and gives the display as a tree. Main thread only.
+//
+// The connection (OrvaneModelConnection.cpp) is Stopped, Connecting (within startMonitor), Waiting
+// (for a retry 5 s after any failure, without limit) or Running.
+class OrvaneModel : public std::enable_shared_from_this<OrvaneModel>
+{
+public:
+    // The observer may be null; it must outlive the model.
+    OrvaneModel(ModelEnvironment environment, ModelObserver* observer);
+    ~OrvaneModel();
+    OrvaneModel(const OrvaneModel&) = delete;
+    OrvaneModel& operator=(const OrvaneModel&) = delete;
+
+    // The root of the display tree, made when there is none; null without a generator.
+    NodePointer topLevelNodes();
+    // The node under that path or null.
+    NodePointer nodeAtPath(const std::string& path);
+
+    // Hands one message to the generator.
+    void updateWithData(ByteView data);
+    // The timer's action: checks the connection and, if data came since the last time, drops the
+    // tree and has the view updated.
+    void refresh();
+    // The generator's save contents, an empty array without a generator.
+    PropertyValue getSaveContents();
+
+    bool createPorts();
+    void destroyPorts();
+    [[nodiscard]] bool isConnected() const { return _recvPort && _sendPort; }
+    void configureGenerator();
+    // Does nothing while running.
+    void startMonitor();
+    void restartMonitor();
+
+private:
+    // The platform's callbacks; the context is the model, or null.
+    static std::optional<Bytes> messageReceived(std::int32_t messageId, ByteView data,
+                                                OrvaneModel* context);
+    static void portInvalidated(const MessagePort& port, OrvaneModel* context);
+    static void serverNotification(OrvaneModel* context);
+
+    bool openSession();
+    void adoptGenerator(std::unique_ptr<LogGenerator> generator);
+    void checkHealth();
+    void scheduleRetry();
+
+    ModelEnvironment _environment;
+    ModelObserver* _observer;
+    std::shared_ptr<PropertyDictionary> _state;
+    std::unique_ptr<LogGenerator> _logGenerator;
+    // The class of the generator that the state's history is of.
+    std::optional<std::type_index> _historyClass;
+    bool _updated = false;
+    NodePointer _nodes;
+    std::optional<PathDictionary> _nodesByPath;
+    std::unique_ptr<LocalMessagePort> _recvPort;
+    std::unique_ptr<RemoteMessagePort> _sendPort;
+    std::unique_ptr<Timer> _displayUpdateTimer;
+};
+
+} // namespace orvane

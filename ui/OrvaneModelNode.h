@@ -1,0 +1,78 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <memory>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <utility>
+#include <vector>
+
+namespace orvane
+{
+
+class OrvaneModelNode;
+
+// Nodes are shared: by their parent, by the path dictionary and by a pane that still shows one
+// after the tree was dropped. They are never changed once made.
+using NodePointer = std::shared_ptr<const OrvaneModelNode>;
+// Node path ("/Serving Cell Info/Cell Identity"; the root's is "/") to node.
+using PathDictionary = std::unordered_map<std::string, NodePointer>;
+
+// A named node of the display tree.
+class OrvaneModelNode
+{
+public:
+    explicit OrvaneModelNode(std::string displayName) : name(std::move(displayName)) {}
+    virtual ~OrvaneModelNode() = default;
+
+    [[nodiscard]] const std::string& displayName() const { return name; }
+    // Null where this is no group: having child nodes and being a group are the same test.
+    [[nodiscard]] virtual const std::vector<NodePointer>* childNodes() const { return nullptr; }
+    // The shown value; null for a group.
+    [[nodiscard]] virtual const std::string* value() const { return nullptr; }
+
+    // Turns a display into a tree whose root is named "Orvane", and stores every node in `paths`
+    // under its path. An absent display gives a leaf of the value "(unknown)".
+    static NodePointer makeTreeFromObject(const PropertyValue& object, PathDictionary& paths);
+
+private:
+    std::string name;
+};
+
+// A row: a name and the value shown.
+class OrvaneModelLeafNode final : public OrvaneModelNode
+{
+public:
+    OrvaneModelLeafNode(std::string name, std::string value)
+        : OrvaneModelNode(std::move(name)), string(std::move(value))
+    {
+    }
+    [[nodiscard]] const std::string* value() const override { return &string; }
+
+private:
+    std::string string;
+};
+
+// A group of nodes, possibly without any.
+class OrvaneModelTreeNode final : public OrvaneModelNode
+{
+public:
+    OrvaneModelTreeNode(std::string name, std::vector<NodePointer> children)
+        : OrvaneModelNode(std::move(name)), _childNodes(std::move(children))
+    {
+    }
+    [[nodiscard]] const std::vector<NodePointer>* childNodes() const override
+    {
+        return &_childNodes;
+    }
+
+private:
+    std::vector<NodePointer> _childNodes;
+};
+
+// The path with the component appended: exactly one "/" between them, none doubled or trailing.
+std::string pathByAppending(std::string_view path, std::string_view component);
+
+} // namespace orvane

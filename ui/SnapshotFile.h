@@ -1,0 +1,27 @@
+#pragma once
+
+#include "platform/FileSystem.h"
+#include "platform/PropertyValue.h"
+
+#include <string>
+
+namespace orvane
+{
+
+// What the alert of a failed save says.
+inline constexpr const char* kFileErrorTitle = "File Error";
+inline constexpr const char* kFileErrorMessage = "Unable to write file to disk";
+
+struct SnapshotResult {
+    bool isWritten;
+    std::string path; // as written to, root included
+};
+
+// Writes a snapshot file "OrvaneSnapshot-SECONDS.orvane" into the system's log folder, SECONDS
+// being the current time since 1970: an XML property list of `timeStamp` (when the save screen was
+// opened, seconds since 1970), the save contents unchanged and the user's description. A failure is
+// logged; no half file is left behind.
+SnapshotResult writeSnapshotFile(const FileSystem& files, const PropertyValue& saveHistory,
+                                 double timeStamp, const std::string& description);
+
+} // namespace orvane
