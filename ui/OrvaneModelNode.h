@@ -45,8 +45,8 @@ private:
 class OrvaneModelLeafNode final : public OrvaneModelNode
 {
 public:
-    OrvaneModelLeafNode(std::string name, std::string value)
-        : OrvaneModelNode(std::move(name)), string(std::move(value))
+    OrvaneModelLeafNode(std::string displayName, std::string value)
+        : OrvaneModelNode(std::move(displayName)), string(std::move(value))
     {
     }
     [[nodiscard]] const std::string* value() const override { return &string; }
@@ -59,8 +59,8 @@ private:
 class OrvaneModelTreeNode final : public OrvaneModelNode
 {
 public:
-    OrvaneModelTreeNode(std::string name, std::vector<NodePointer> children)
-        : OrvaneModelNode(std::move(name)), _childNodes(std::move(children))
+    OrvaneModelTreeNode(std::string displayName, std::vector<NodePointer> children)
+        : OrvaneModelNode(std::move(displayName)), _childNodes(std::move(children))
     {
     }
     [[nodiscard]] const std::vector<NodePointer>* childNodes() const override

@@ -1,0 +1,51 @@
+#include "platform/Utf8.h"
+
+#include "platform/PropertyList.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr std::string_view kReplacement = "\xEF\xBF\xBD";
+
+// The length that the first byte of a sequence announces, 0 for a byte that cannot begin one.
+std::size_t announcedLength(unsigned char first)
+{
+    if (first < 0x80)
+        return 1;
+    if (first >= 0xC2 && first < 0xE0)
+        return 2;
+    if (first >= 0xE0 && first < 0xF0)
+        return 3;
+    return first >= 0xF0 && first < 0xF5 ? 4 : 0;
+}
+
+bool isControl(unsigned char byte) { return (byte < 0x20 && byte != '\t') || byte == 0x7F; }
+
+} // namespace
+
+std::string shownText(std::string_view text)
+{
+    std::string shown;
+    shown.reserve(text.size());
+    for (std::size_t at = 0; at < text.size();) {
+        const auto first = static_cast<unsigned char>(text[at]);
+        const std::size_t length = announcedLength(first);
+        const std::string_view sequence = text.substr(at, length);
+        if (length == 0 || sequence.size() < length || !isValidUtf8(sequence)) {
+            shown += kReplacement;
+            ++at;
+            continue;
+        }
+        if (isControl(first))
+            shown += ' ';
+        else
+            shown += sequence;
+        at += length;
+    }
+    return shown;
+}
+
+} // namespace orvane

@@ -1,0 +1,49 @@
+#pragma once
+
+#include "ui/Pane.h"
+#include "ui/SnapshotFile.h"
+
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace orvane
+{
+
+// The root pane of a front end that prints: one output for every change of the status and for every
+// reload, a reload and the status that comes with it being one. Answers to commands are printed in
+// between. JSON and text differ in the forms only.
+class OutputPane : public Pane
+{
+public:
+    // Takes one finished output, newline included.
+    using Write = std::function<void(std::string_view output)>;
+
+    explicit OutputPane(Write write) : _write(std::move(write)) {}
+
+    [[nodiscard]] std::string path() const override { return "/"; }
+    void reloadWithNode(NodePointer node) override;
+    void setStatus(std::optional<std::string> status, bool isLoading) override;
+    [[nodiscard]] bool isLoading() const override { return _isLoading; }
+
+    void showSaved(const SnapshotResult& result);
+    void showError(const std::string& text);
+
+protected:
+    [[nodiscard]] virtual std::string statusOutput(const std::string& status, bool isLoading,
+                                                   const OrvaneModelNode* tree) const = 0;
+    [[nodiscard]] virtual std::string savedOutput(const std::string& path) const = 0;
+    [[nodiscard]] virtual std::string alertOutput(const std::string& title,
+                                                  const std::string& message) const = 0;
+    [[nodiscard]] virtual std::string errorOutput(const std::string& text) const = 0;
+
+private:
+    Write _write;
+    NodePointer _node;
+    std::optional<std::string> _status;
+    bool _isLoading = true;
+    bool _isReloaded = false;
+};
+
+} // namespace orvane
