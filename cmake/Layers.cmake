@@ -1,3 +1,6 @@
+# Builds every layer and nothing else.
+add_custom_target(layers)
+
 # One static library a layer. A layer sees the headers of the layers that it names under USES and no
 # others: each has an include directory of its own that holds nothing but a link to its folder, so
 # `#include "app/OrvaneModel.h"` below LogGenerator/ fails to build.
@@ -22,4 +25,5 @@ function(orvane_layer name)
     target_link_libraries(orvane_${name} PUBLIC orvane_${used})
   endforeach()
   target_link_libraries(orvane_${name} PRIVATE orvane_options)
+  add_dependencies(layers orvane_${name})
 endfunction()
