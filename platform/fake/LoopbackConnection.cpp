@@ -66,6 +66,8 @@ bool LoopbackEnd::withdrawLast()
 
 void LoopbackEnd::arrive(ByteView bytes)
 {
+    if (!_open)
+        return;
     _arrived.insert(_arrived.end(), bytes.begin(), bytes.end());
     scheduleDelivery();
 }

@@ -69,6 +69,7 @@ public:
         LoopbackEnd::join(connector, accepted);
         connector->setSegmentBytes(_segmentBytes);
         accepted->setSegmentBytes(_segmentBytes);
+        connector->setRoom(found->second.roomFromPort);
         accepted->setRoom(found->second.room);
         auto& connections = found->second.connections;
         std::erase_if(connections, [](const Connection& each) {
@@ -96,33 +97,35 @@ public:
     void setRoom(const std::string& name, std::optional<std::size_t> room)
     {
         _ports[name].room = room;
-        forEach(name, [room](auto&, auto& accepted) { accepted.setRoom(room); });
+        forPort(name, [room](LoopbackEnd& end) { end.setRoom(room); });
+    }
+
+    void setRoomFromPort(const std::string& name, std::optional<std::size_t> room)
+    {
+        _ports[name].roomFromPort = room;
+        forConnectors(name, [room](LoopbackEnd& end) { end.setRoom(room); });
     }
 
     void setSegmentBytes(std::optional<std::size_t> bytes)
     {
         _segmentBytes = bytes;
-        for (const auto& [name, port] : _ports)
-            forEach(name, [bytes](auto& connector, auto& accepted) {
-                connector.setSegmentBytes(bytes);
-                accepted.setSegmentBytes(bytes);
-            });
+        for (const auto& [name, port] : _ports) {
+            const auto set = [bytes](LoopbackEnd& end) { end.setSegmentBytes(bytes); };
+            forConnectors(name, set);
+            forPort(name, set);
+        }
     }
 
-    // Calls action(connector, accepted) for each connection of which both ends are there.
+    // Calls action(end) for each end at the name's connectors, or at the port, that is there.
     template <typename Action>
-    void forEach(const std::string& name, const Action& action) const
+    void forConnectors(const std::string& name, const Action& action) const
     {
-        const auto found = _ports.find(name);
-        if (found == _ports.end())
-            return;
-        const auto connections = found->second.connections; // the action may connect
-        for (const Connection& connection : connections) {
-            const auto connector = connection.connector.lock();
-            const auto accepted = connection.accepted.lock();
-            if (connector && accepted)
-                action(*connector, *accepted);
-        }
+        forEnds(name, &Connection::connector, action);
+    }
+    template <typename Action>
+    void forPort(const std::string& name, const Action& action) const
+    {
+        forEnds(name, &Connection::accepted, action);
     }
 
 private:
@@ -134,8 +137,22 @@ private:
         std::weak_ptr<LoopbackListening> listening;
         bool refuses = false;
         std::optional<std::size_t> room; // nothing = it reads
+        std::optional<std::size_t> roomFromPort;
         std::vector<Connection> connections;
     };
+
+    template <typename Action>
+    void forEnds(const std::string& name, std::weak_ptr<LoopbackEnd> Connection::*which,
+                 const Action& action) const
+    {
+        const auto found = _ports.find(name);
+        if (found == _ports.end())
+            return;
+        const auto connections = found->second.connections; // the action may connect
+        for (const Connection& connection : connections)
+            if (const auto end = (connection.*which).lock())
+                action(*end);
+    }
 
     std::map<std::string, Port> _ports;
     std::optional<std::size_t> _segmentBytes;
@@ -209,9 +226,8 @@ bool LoopbackTransport::hasListener(const std::string& name) const
 std::size_t LoopbackTransport::openConnections(const std::string& name) const
 {
     std::size_t count = 0;
-    _network->forEach(name, [&count](const auto& connector, const auto&) {
-        count += connector.isOpen() ? 1 : 0;
-    });
+    _network->forConnectors(name,
+                            [&count](const LoopbackEnd& end) { count += end.isOpen() ? 1 : 0; });
     return count;
 }
 
@@ -230,22 +246,31 @@ void LoopbackTransport::resumeReading(const std::string& name)
     _network->setRoom(name, std::nullopt);
 }
 
+void LoopbackTransport::stopReadingFromPort(const std::string& name, std::size_t room)
+{
+    _network->setRoomFromPort(name, room);
+}
+
+void LoopbackTransport::resumeReadingFromPort(const std::string& name)
+{
+    _network->setRoomFromPort(name, std::nullopt);
+}
+
 void LoopbackTransport::cutConnections(const std::string& name)
 {
-    _network->forEach(name, [](auto& connector, auto& accepted) {
-        connector.fail();
-        accepted.fail();
-    });
+    const auto fail = [](LoopbackEnd& end) { end.fail(); };
+    _network->forConnectors(name, fail);
+    _network->forPort(name, fail);
 }
 
 void LoopbackTransport::injectToPort(const std::string& name, ByteView bytes)
 {
-    _network->forEach(name, [bytes](auto&, auto& accepted) { accepted.arrive(bytes); });
+    _network->forPort(name, [bytes](LoopbackEnd& end) { end.arrive(bytes); });
 }
 
 void LoopbackTransport::injectFromPort(const std::string& name, ByteView bytes)
 {
-    _network->forEach(name, [bytes](auto& connector, auto&) { connector.arrive(bytes); });
+    _network->forConnectors(name, [bytes](LoopbackEnd& end) { end.arrive(bytes); });
 }
 
 void LoopbackTransport::setSegmentBytes(std::optional<std::size_t> bytes)

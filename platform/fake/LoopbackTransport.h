@@ -47,6 +47,9 @@ public:
     // connection are taken, the rest stays unsent with the sender.
     void stopReading(const std::string& name, std::size_t room = 0);
     void resumeReading(const std::string& name);
+    // The same for the ends that connected to the name: what the port sends is not read.
+    void stopReadingFromPort(const std::string& name, std::size_t room = 0);
+    void resumeReadingFromPort(const std::string& name);
     // Breaks all connections to the name: both ends find them closed.
     void cutConnections(const std::string& name);
     // Bytes as though they had been sent on each connection to the name, to the port or from it.
