@@ -54,6 +54,15 @@ const char* logPriorityName(LogPriority priority)
     return "info";
 }
 
+std::optional<LogPriority> logPriorityNamed(std::string_view name)
+{
+    for (const LogPriority priority :
+         {LogPriority::Error, LogPriority::Warning, LogPriority::Notice, LogPriority::Info})
+        if (name == logPriorityName(priority))
+            return priority;
+    return std::nullopt;
+}
+
 void StandardErrorLog::write(LogPriority priority, std::string_view text)
 {
     // One call a line, so that lines of several threads and processes do not mix.
