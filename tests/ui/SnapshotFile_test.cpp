@@ -1,0 +1,94 @@
+#include "ui/SnapshotFile.h"
+
+#include "platform/PropertyList.h"
+#include "support/Recording.h"
+#include "support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <filesystem>
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+
+constexpr const char* kFolder = "/var/mobile/Library/Logs/DiagDrop";
+
+class SnapshotFileTest : public ::testing::Test
+{
+protected:
+    void makeFolder() { std::filesystem::create_directories(root.path() + kFolder); }
+    static PropertyValue read(const std::string& path)
+    {
+        const auto content = readFile(path);
+        return content ? readPropertyList(*content).value : PropertyValue();
+    }
+
+    TestServices services;
+    TemporaryDirectory root;
+    FileSystem files{root.path()};
+};
+
+} // namespace
+
+TEST_F(SnapshotFileTest, HoldsTheThreeKeysAndTheEntriesUnchanged)
+{
+    makeFolder();
+    const PropertyValue history = PropertyValue::arrayOf({
+        PropertyValue::newDictionary(),
+        PropertyValue::dictionaryOf(
+            {{"Description", "DLF binary (3 bytes)"}, {"DLF", PropertyValue::data({1, 2, 3})}}
+            )
+    });
+    const SnapshotResult result = writeSnapshotFile(files, history, 0, "at the <bridge> & beyond");
+    EXPECT_TRUE(result.isWritten);
+    EXPECT_EQ(read(result.path), PropertyValue::dictionaryOf({
+                                     {"Timestamp",   "1970-01-01 00:00:00 +0000"},
+                                     {"Data",        history                    },
+                                     {"Description", "at the <bridge> & beyond" }
+    }));
+}
+
+TEST_F(SnapshotFileTest, IsNamedByTheTimeOfSavingNotByTheTimestamp)
+{
+    makeFolder();
+    services.clock.now = 1795255201.9;
+    const SnapshotResult result =
+        writeSnapshotFile(files, PropertyValue::newArray(), 1795255100, "");
+    EXPECT_EQ(result.path, root.path() + kFolder + "/OrvaneSnapshot-1795255201.orvane");
+    EXPECT_EQ(read(result.path)["Timestamp"], PropertyValue("2026-11-21 09:58:20 +0000"));
+}
+
+TEST_F(SnapshotFileTest, EmptyContentsAndDescriptionAreSavedAsSuch)
+{
+    makeFolder();
+    const PropertyValue saved =
+        read(writeSnapshotFile(files, PropertyValue::newArray(), 0, "").path);
+    EXPECT_EQ(saved["Data"], PropertyValue::newArray());
+    EXPECT_EQ(saved["Description"], PropertyValue(""));
+}
+
+TEST_F(SnapshotFileTest, AMissingFolderFailsWithALineAndMakesNothing)
+{
+    const SnapshotResult result = writeSnapshotFile(files, PropertyValue::newArray(), 0, "");
+    EXPECT_FALSE(result.isWritten);
+    EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + result.path));
+    EXPECT_TRUE(std::filesystem::is_empty(root.path()));
+}
+
+TEST_F(SnapshotFileTest, ASecondSaveWithinTheSecondReplacesTheFirst)
+{
+    makeFolder();
+    const std::string first =
+        writeSnapshotFile(files, PropertyValue::newArray(), 0, "a longer description").path;
+    const std::string second = writeSnapshotFile(files, PropertyValue::newArray(), 0, "b").path;
+    EXPECT_EQ(first, second);
+    EXPECT_EQ(read(second)["Description"], PropertyValue("b"));
+}
+
+} // namespace orvane
