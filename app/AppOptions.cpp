@@ -1,0 +1,125 @@
+#include "app/AppOptions.h"
+
+#include "platform/CommandLine.h"
+#include "platform/LogOption.h"
+
+#include <algorithm>
+
+namespace orvane
+{
+
+namespace
+{
+
+using Value = CommandLineOption::Value;
+
+constexpr CommandLineOption kOptions[] = {
+    {"help",          Value::None    },
+    {"version",       Value::None    },
+    {"demo",          Value::Optional},
+    {"ui",            Value::Required},
+    {"ports",         Value::Required},
+    {"root",          Value::Required},
+    {"refresh",       Value::Required},
+    {kLogOption,      Value::Required},
+    {kLogLevelOption, Value::Required},
+};
+
+constexpr const char* kDefaultScenario = "lte";
+constexpr double kShortestRefresh = 0.01;
+constexpr double kLongestRefresh = 86400;
+
+std::string joined(std::span<const std::string> names)
+{
+    std::string text;
+    for (const std::string& name : names)
+        text += (text.empty() ? "" : ", ") + name;
+    return text;
+}
+
+void takeFrontEnd(AppOptions& options, CommandLine& line)
+{
+    const std::optional<std::string> name = line.value("ui");
+    if (!name || *name == "text")
+        return;
+    if (*name == "json")
+        options.frontEnd = FrontEnd::Json;
+    else if (*name == "window" || *name == "terminal")
+        line.fail("--ui " + *name + " is not available yet: use --ui text or --ui json");
+    else
+        line.fail("--ui takes text or json, not \"" + *name + "\"");
+}
+
+void takeDemo(AppOptions& options, CommandLine& line, std::span<const std::string> scenarios)
+{
+    if (!line.has("demo"))
+        return;
+    const std::string scenario = line.value("demo").value_or("");
+    options.demo = scenario.empty() ? kDefaultScenario : scenario;
+    if (std::find(scenarios.begin(), scenarios.end(), *options.demo) == scenarios.end())
+        line.fail("there is no simulated phone \"" + *options.demo + "\": --demo takes " +
+                  joined(scenarios));
+    if (line.has("ports"))
+        line.fail("--ports cannot be used with --demo, which has a private directory of its own");
+}
+
+} // namespace
+
+AppOptions parseAppOptions(std::span<const std::string> arguments,
+                           std::span<const std::string> scenarios)
+{
+    CommandLine line(kOptions, arguments);
+    AppOptions options;
+    if (!line.error()) {
+        options.wantsHelp = line.has("help");
+        options.wantsVersion = line.has("version");
+        if (options.wantsHelp || options.wantsVersion)
+            return options;
+        if (!line.words().empty())
+            line.fail("\"" + line.words().front() + "\" is no command: see orvane --help");
+        takeFrontEnd(options, line);
+        takeDemo(options, line, scenarios);
+        options.ports = line.value("ports").value_or("");
+        if (line.has("ports") && options.ports.empty())
+            line.fail("--ports needs the name of a directory");
+        options.root = line.value("root");
+        if (options.root && options.root->empty())
+            line.fail("--root needs the name of a directory");
+        if (const auto seconds = line.number("refresh", kShortestRefresh, kLongestRefresh))
+            options.refreshInterval = std::chrono::duration_cast<std::chrono::nanoseconds>(
+                std::chrono::duration<double>(*seconds));
+        options.log = logFromOptions(line, "orvane");
+    }
+    options.error = line.error();
+    return options;
+}
+
+std::string appHelp(std::span<const std::string> scenarios)
+{
+    return "Usage: orvane [OPTION...]\n"
+           "Shows what the modem knows about the radio network, from this machine's telephony "
+           "server.\n"
+           "\n"
+           "  --demo[=SCENARIO]         attach to a simulated phone: " +
+           joined(scenarios) +
+           "\n"
+           "                            (default lte)\n"
+           "  --ui text|json            how to show it (default text)\n"
+           "  --ports DIR               where the telephony server's ports are (default\n"
+           "                            $ORVANE_PORTS, $XDG_RUNTIME_DIR/telephony or\n"
+           "                            /tmp/telephony-UID)\n"
+           "  --root DIR                take the log folder and the install marker below DIR\n"
+           "  --refresh SECONDS         the refresh period (default 2.0)\n" +
+           kLogOptionsHelp +
+           "  --help                    show this\n"
+           "  --version                 show the version\n"
+           "\n"
+           "Lines on standard input are commands: \"save DESCRIPTION\" saves a snapshot where "
+           "saving\n"
+           "is offered, \"quit\" ends the program.\n"
+           "\n"
+           "Exit status: 0 after a normal end, 2 for unusable arguments, 1 for any other "
+           "failure.\n";
+}
+
+} // namespace orvane
