@@ -10,8 +10,6 @@ namespace orvane
 namespace
 {
 
-constexpr const char* kInstallMarker =
-    "/Tarnwell/Library/PreferenceBundles/Carrier Settings.bundle";
 constexpr const char* kConnecting = "Connecting...";
 
 } // namespace

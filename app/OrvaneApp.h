@@ -12,6 +12,10 @@
 namespace orvane
 {
 
+// Saving is offered where this path exists, below the file system's root.
+inline constexpr const char* kInstallMarker =
+    "/Tarnwell/Library/PreferenceBundles/Carrier Settings.bundle";
+
 // The application object: owns the model, starts the monitor, keeps the status line of the visible
 // pane current, reloads the panes after each refresh, and decides whether saving is offered.
 class OrvaneApp final : public ModelObserver

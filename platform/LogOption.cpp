@@ -3,24 +3,10 @@
 namespace orvane
 {
 
-namespace
-{
-
-std::optional<LogPriority> priorityNamed(std::string_view name)
-{
-    for (const LogPriority priority :
-         {LogPriority::Error, LogPriority::Warning, LogPriority::Notice, LogPriority::Info})
-        if (name == logPriorityName(priority))
-            return priority;
-    return std::nullopt;
-}
-
-} // namespace
-
 std::unique_ptr<SystemLog> logFromOptions(CommandLine& line, const char* programName)
 {
     const std::string level = line.value(kLogLevelOption).value_or("warning");
-    const std::optional<LogPriority> lowest = priorityNamed(level);
+    const std::optional<LogPriority> lowest = logPriorityNamed(level);
     if (!lowest) {
         line.fail("--log-level takes error, warning, notice or info, not \"" + level + "\"");
         return nullptr;

@@ -11,8 +11,6 @@ namespace orvane
 namespace
 {
 
-constexpr const char* kLogFolder = "/var/mobile/Library/Logs/DiagDrop";
-
 bool write(const std::string& path, const PropertyValue& snapshot)
 {
     const std::optional<std::string> xml = writeXmlPropertyList(snapshot);

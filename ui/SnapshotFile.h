@@ -8,6 +8,9 @@
 namespace orvane
 {
 
+// The system's folder of diagnostic files, below the file system's root.
+inline constexpr const char* kLogFolder = "/var/mobile/Library/Logs/DiagDrop";
+
 // What the alert of a failed save says.
 inline constexpr const char* kFileErrorTitle = "File Error";
 inline constexpr const char* kFileErrorMessage = "Unable to write file to disk";

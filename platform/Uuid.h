@@ -1,0 +1,13 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+// A new random UUID as text, upper-case with hyphens; nothing when the machine gives no random
+// numbers.
+std::optional<std::string> makeUuid();
+
+} // namespace orvane
