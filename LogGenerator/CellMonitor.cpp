@@ -1,10 +1,10 @@
 #include "LogGenerator/CellMonitor.h"
 
-#include "LogGenerator/Formats.h"
 #include "platform/PropertyList.h"
 #include "platform/SystemLog.h"
 #include "platform/TelephonyServer.h"
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -18,6 +18,14 @@ bool isText(const PropertyValue& value, const char* text)
 {
     const std::string* string = value.asString();
     return string && *string == text;
+}
+
+std::shared_ptr<PropertyArray> cellArrayOrReport(PacketView record)
+{
+    std::shared_ptr<PropertyArray> cells = cellArray(record);
+    if (!cells)
+        logError("Failed to get Cell Array\n");
+    return cells;
 }
 
 } // namespace
@@ -56,11 +64,37 @@ void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
                    std::span<const CellRow> cellRows)
 {
     for (const CellRow& cellRow : cellRows) {
-        if (const auto number = cellNumber(cell, cellRow.key))
-            setRow(rows, cellRow.row, *decimal(*number));
-        else
+        const auto number = cellNumber(cell, cellRow.key);
+        if (!number)
             logError("%s", cellRow.failure);
+        else if (auto text = cellRow.format(*number))
+            setRow(rows, cellRow.row, std::move(*text));
     }
+}
+
+void writeFirstCell(PropertyDictionary* rows, PacketView record, const CellLayout& layout)
+{
+    const std::shared_ptr<PropertyArray> cells = cellArrayOrReport(record);
+    if (!cells)
+        return;
+    const auto cell = std::find_if(cells->begin(), cells->end(), layout.isWanted);
+    if (cell != cells->end())
+        writeCellRows(rows, *cell, layout.rows);
+}
+
+std::vector<PropertyValue> cellDictionaries(PacketView record, const CellLayout& layout)
+{
+    std::vector<PropertyValue> dictionaries;
+    const std::shared_ptr<PropertyArray> cells = cellArrayOrReport(record);
+    if (!cells)
+        return dictionaries;
+    for (const PropertyValue& cell : *cells) {
+        if (!layout.isWanted(cell))
+            continue;
+        dictionaries.push_back(PropertyValue::newDictionary());
+        writeCellRows(dictionaries.back().asDictionary(), cell, layout.rows);
+    }
+    return dictionaries;
 }
 
 } // namespace orvane

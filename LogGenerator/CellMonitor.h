@@ -1,11 +1,13 @@
 #pragma once
 
+#include "LogGenerator/Formats.h"
 #include "LogGenerator/LogMessage.h"
 #include "platform/PropertyValue.h"
 
 #include <cstdint>
 #include <optional>
 #include <span>
+#include <vector>
 
 namespace orvane
 {
@@ -24,15 +26,28 @@ bool isCell(const PropertyValue& cell, const char* technology, const char* type)
 // A number of a cell or nothing: an integer, or a real without fraction, within 32 signed bits.
 std::optional<std::int32_t> cellNumber(const PropertyValue& cell, const char* key);
 
-// One row that a cell's number fills, with "%d".
+// One row that a cell's number fills.
 struct CellRow {
     const char* key;
     const char* row;
     const char* failure; // logged at error priority when there is no such number
+    Format format = decimal;
+};
+
+// What a section takes from the cells: which of them, and their rows.
+struct CellLayout {
+    bool (*isWanted)(const PropertyValue& cell);
+    std::span<const CellRow> rows;
 };
 
 // Writes the rows in order; a number that is not there leaves its row as it was.
 void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
                    std::span<const CellRow> cellRows);
+// Writes the rows of the first wanted cell of the record. A record without an array of cells is
+// reported.
+void writeFirstCell(PropertyDictionary* rows, PacketView record, const CellLayout& layout);
+// One dictionary for each wanted cell of the record, which may be empty. A record without an array
+// of cells is reported.
+std::vector<PropertyValue> cellDictionaries(PacketView record, const CellLayout& layout);
 
 } // namespace orvane

@@ -46,4 +46,13 @@ void setRow(PropertyDictionary* rows, const char* row, std::string text)
         rows->set(row, std::move(text));
 }
 
+void setListRow(PropertyDictionary* rows, const char* row, std::vector<PropertyValue> elements)
+{
+    if (!rows)
+        return;
+    PropertyValue list = PropertyValue::newArray();
+    list.asArray()->replaceElements(std::move(elements));
+    rows->set(row, std::move(list));
+}
+
 } // namespace orvane

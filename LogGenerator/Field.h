@@ -6,6 +6,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <vector>
 
 namespace orvane
 {
@@ -66,5 +67,7 @@ void writeRows(PropertyDictionary* rows, PacketView packet, std::span<const Fiel
 
 // Stores the text under the row's key, reusing what is there.
 void setRow(PropertyDictionary* rows, const char* row, std::string text);
+// Stores a new array of the elements under the row's key, in place of what is there.
+void setListRow(PropertyDictionary* rows, const char* row, std::vector<PropertyValue> elements);
 
 } // namespace orvane

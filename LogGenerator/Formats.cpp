@@ -35,6 +35,10 @@ RowText decimal(std::int64_t raw)
     return std::string(text, end);
 }
 
+RowText unsignedDecimal(std::int64_t raw) { return printed("%u", static_cast<std::uint32_t>(raw)); }
+
+RowText decibels(std::int64_t raw) { return printed("%d dB", static_cast<std::int32_t>(raw)); }
+
 RowText decibelMilliwatts(std::int64_t raw)
 {
     return printed("%d dBm", static_cast<std::int32_t>(raw));

@@ -29,10 +29,21 @@ constexpr const char* nameOf(std::span<const ValueName> table, std::int64_t valu
     return fallback;
 }
 
+// A format that names the values of a table; others show "Unknown".
+template <const auto& Table>
+RowText named(std::int64_t raw)
+{
+    return nameOf(Table, raw, "Unknown");
+}
+
 // Formats that several sections share. Each holds one printf format.
 
 // "%d": an unsigned 32-bit value beyond 2147483647 shows as C shows it, negative.
 RowText decimal(std::int64_t raw);
+// "%u".
+RowText unsignedDecimal(std::int64_t raw);
+// "%d dB".
+RowText decibels(std::int64_t raw);
 // "%d dBm".
 RowText decibelMilliwatts(std::int64_t raw);
 

@@ -32,8 +32,20 @@ private:
     std::size_t _count;
 };
 
-// One dictionary a record, rows in the fields' order, as far as the packet goes: the walk stops at
-// the first record that is not whole, that is, of which any byte to be read is missing.
+// Calls `visit` with each record in order, as far as the packet goes: the walk stops at the first
+// that is not whole, that is, of which any of the `wholeBytes` bytes is missing.
+template <typename Visit>
+void forEachWholeRecord(const Records& records, std::size_t wholeBytes, Visit visit)
+{
+    for (std::size_t i = 0; i < records.count(); ++i) {
+        const PacketView record = records.at(i);
+        if (!record.holds(0, wholeBytes))
+            break;
+        visit(record);
+    }
+}
+
+// One dictionary a whole record, rows in the fields' order.
 std::vector<PropertyValue> recordRows(const Records& records, std::span<const Field> fields);
 
 } // namespace orvane

@@ -27,7 +27,10 @@ std::vector<std::uint32_t> Section::getLogCodeArray() const
 
 void Section::decode(PacketView packet, const PacketLayout& layout)
 {
-    writeRows(rows().get(), packet, layout.fields);
+    if (layout.cells)
+        writeFirstCell(rows().get(), packet, *layout.cells);
+    else
+        writeRows(rows().get(), packet, layout.fields);
 }
 
 void Section::reportUnknownCode(std::uint32_t logCode)
@@ -44,8 +47,9 @@ void ListSection::decode(PacketView packet, const PacketLayout& layout)
 
 std::vector<PropertyValue> ListSection::elements(PacketView packet, const PacketLayout& layout)
 {
-    return layout.records ? recordRows(layout.records->in(packet), layout.records->fields)
-                          : std::vector<PropertyValue>();
+    if (layout.cells)
+        return cellDictionaries(packet, *layout.cells);
+    return layout.records ? layout.records->rowsIn(packet) : std::vector<PropertyValue>();
 }
 
 } // namespace orvane

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/CellMonitor.h"
 #include "LogGenerator/Field.h"
 #include "LogGenerator/Records.h"
 #include "platform/SystemLog.h"
@@ -9,6 +10,18 @@
 
 namespace orvane
 {
+
+// For RecordLayout: a count in the byte at a fixed offset, and records that start at one.
+template <std::size_t Offset>
+std::size_t countAt(PacketView packet)
+{
+    return packet.unsignedAt(Offset, 1).value_or(0);
+}
+template <std::size_t Offset>
+std::size_t startAt(PacketView)
+{
+    return Offset;
+}
 
 // Where a packet's records stand: how many, and at which offset the first.
 struct RecordLayout {
@@ -21,16 +34,43 @@ struct RecordLayout {
     {
         return Records(packet, first(packet), stride, count(packet));
     }
+    // A dictionary of rows a record.
+    [[nodiscard]] std::vector<PropertyValue> rowsIn(PacketView packet) const
+    {
+        return recordRows(in(packet), fields);
+    }
 };
 
 // One packet that a section understands. `fields` are the rows that it writes; a list section's
-// packet has `records` instead.
+// packet has `records` instead, a cell-monitor record `cells`.
 struct PacketLayout {
     std::uint32_t logCode;
     std::size_t minimumBytes;
     std::span<const Field> fields = {};
     const RecordLayout* records = nullptr;
+    const CellLayout* cells = nullptr;
 };
+
+// For tables of packets of different kinds.
+constexpr PacketLayout rowsPacket(std::uint32_t logCode, std::size_t minimumBytes,
+                                  std::span<const Field> fields)
+{
+    return {logCode, minimumBytes, fields};
+}
+constexpr PacketLayout recordsPacket(std::uint32_t logCode, std::size_t minimumBytes,
+                                     const RecordLayout& records)
+{
+    return {logCode, minimumBytes, {}, &records};
+}
+constexpr PacketLayout cellsPacket(const CellLayout& cells)
+{
+    return {kCellMonitorCode, 0, {}, nullptr, &cells};
+}
+// One that the section decodes by itself.
+constexpr PacketLayout ownPacket(std::uint32_t logCode, std::size_t minimumBytes)
+{
+    return {logCode, minimumBytes};
+}
 
 // What a section does with a log code that none of its packets has.
 enum class UnknownCode { Report, Ignore };
@@ -46,8 +86,8 @@ struct SectionLayout {
 };
 
 // A section that a layout describes. Every call logs the call text, finds the packet by its code,
-// drops one that is too short, and decodes it: writes the packet's rows into the display. Sections
-// with rules of their own override decode().
+// drops one that is too short, and decodes it: writes the packet's rows, or those of the first
+// wanted cell, into the display. Sections with rules of their own override decode().
 class Section : public Base
 {
 public:
@@ -78,8 +118,9 @@ public:
 
 protected:
     using Section::Section;
-    void decode(PacketView packet, const PacketLayout& layout) final;
-    // The elements that the packet's list has; by default a dictionary of rows a record.
+    void decode(PacketView packet, const PacketLayout& layout) override;
+    // The elements that the packet's list has; by default a dictionary of rows a record, or one for
+    // each wanted cell.
     virtual std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout);
 };
 

@@ -1,10 +1,7 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
-#include "LogGenerator/CellMonitor.h"
 #include "LogGenerator/Formats.h"
 #include "platform/TelephonyServer.h"
-
-#include <algorithm>
 
 namespace orvane
 {
@@ -44,15 +41,6 @@ constexpr Field kBroadcastFields[] = {
     bytesField("Num Tx Antennas", 20, 1, decimal),
 };
 
-constexpr PacketLayout kPackets[] = {
-    {kConfigurationCode, 38, kConfigurationFields},
-    {kBroadcastCode,     22, kBroadcastFields    },
-    {kCellMonitorCode,   0,  {}                  },
-};
-
-constexpr SectionLayout kLayout = {"Serving Cell Info", "LTE Serving Cell Info",
-                                   UnknownCode::Report, kPackets};
-
 constexpr const char* kChannelRow = "UARFCN";
 
 constexpr CellRow kCellRows[] = {
@@ -70,16 +58,23 @@ bool isServingLteCell(const PropertyValue& cell)
     return isCell(cell, kTSCellMonitorRadioAccessTechnologyLTE, kTSCellMonitorCellTypeServing);
 }
 
+constexpr CellLayout kServingCell = {isServingLteCell, kCellRows};
+
+constexpr PacketLayout kPackets[] = {
+    rowsPacket(kConfigurationCode, 38, kConfigurationFields),
+    rowsPacket(kBroadcastCode, 22, kBroadcastFields),
+    cellsPacket(kServingCell),
+};
+
+constexpr SectionLayout kLayout = {"Serving Cell Info", "LTE Serving Cell Info",
+                                   UnknownCode::Report, kPackets};
+
 } // namespace
 
 LTEServingCellInfo::LTEServingCellInfo() : Section(kLayout) {}
 
 void LTEServingCellInfo::decode(PacketView packet, const PacketLayout& layout)
 {
-    if (layout.logCode == kCellMonitorCode) {
-        decodeCells(packet);
-        return;
-    }
     Section::decode(packet, layout);
     // The modem's channels replace the one that the telephony server reports.
     if (layout.logCode == kConfigurationCode)
@@ -88,18 +83,6 @@ void LTEServingCellInfo::decode(PacketView packet, const PacketLayout& layout)
     // Goes on to the unknown-code report although the row is written: both effects are meant.
     if (layout.logCode == kBroadcastCode)
         reportUnknownCode(layout.logCode);
-}
-
-void LTEServingCellInfo::decodeCells(PacketView record)
-{
-    const std::shared_ptr<PropertyArray> cells = cellArray(record);
-    if (!cells) {
-        logError("Failed to get Cell Array\n");
-        return;
-    }
-    const auto serving = std::find_if(cells->begin(), cells->end(), isServingLteCell);
-    if (serving != cells->end())
-        writeCellRows(rows().get(), *serving, kCellRows);
 }
 
 } // namespace orvane

@@ -14,7 +14,6 @@ public:
 
 private:
     void decode(PacketView packet, const PacketLayout& layout) override;
-    void decodeCells(PacketView record);
 };
 
 } // namespace orvane
