@@ -77,10 +77,10 @@ void FrameStream::setDrainedCallback(std::function<void()> callback)
 bool FrameStream::send(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
                        ByteView data)
 {
-    if (!isOpen() || data.size() > kFrameDataLimit)
+    if (!isOpen())
         return false;
     _out.add(messageId, serial, wantsReply, isReply, data);
-    if (!_turnEndQueued || _out.size() >= kWriteTogetherBytes)
+    if (_out.size() >= kWriteTogetherBytes && !_writeBlocked)
         flush();
     if (!_turnEndQueued && isOpen()) {
         _turnEndQueued = true;
@@ -237,8 +237,8 @@ void FrameStream::abandon()
     _drainedCallback = nullptr;
 }
 
-// Whether anything came before the deadline. At least one look, however late it is.
-bool FrameStream::waitForEvent(SteadyClock::time_point deadline, short& events) const
+// The events that came on the socket by the deadline; none if nothing did.
+short FrameStream::waitForEvents(SteadyClock::time_point deadline) const
 {
     using std::chrono::milliseconds;
     const auto remaining = std::chrono::ceil<milliseconds>(deadline - SteadyClock::now());
@@ -246,36 +246,41 @@ bool FrameStream::waitForEvent(SteadyClock::time_point deadline, short& events) 
     const int result = ::poll(&watched, 1,
                               static_cast<int>(std::clamp<milliseconds::rep>(
                                   remaining.count(), 0, std::numeric_limits<int>::max())));
-    events = result > 0 ? watched.revents : static_cast<short>(0);
-    return result > 0 || SteadyClock::now() < deadline;
+    return result > 0 ? watched.revents : static_cast<short>(0);
+}
+
+void FrameStream::keepDeliveredFrame()
+{
+    if (_deliveries == 0)
+        return;
+    FrameReader copy = _in;
+    std::swap(copy, _in); // the frame stays where it is, and reading goes on in the copy
+    _keptReaders.push_back(std::move(copy));
 }
 
 bool FrameStream::waitUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout)
 {
     constexpr std::chrono::milliseconds kLongest = std::chrono::hours(24 * 365);
     const auto deadline = SteadyClock::now() + std::min(timeout, kLongest);
-    if (_deliveries > 0) {
-        // The frame that is being delivered stays where it is, and reading goes on in a copy.
-        FrameReader copy = _in;
-        std::swap(copy, _in);
-        _keptReaders.push_back(std::move(copy));
-    }
+    keepDeliveredFrame();
     ++_waits;
     const std::size_t queuedBefore = _out.size();
     flush();
-    bool isDone = done() || deliver(&done);
-    while (!isDone && _socket && !_ended && !_abandoned && _heldBytes < kHeldBytesLimit) {
+    bool mayHaveLeft = false; // frames that are read and not delivered
+    bool isDone = done() || (mayHaveLeft = deliver(&done));
+    bool isLate = false;
+    while (!isDone && !isLate && _socket && !_ended && !_abandoned &&
+           _heldBytes < kHeldBytesLimit) {
         if (!_writeBlocked)
-            flush(); // what callbacks have sent
-        short events = 0;
-        if (!waitForEvent(deadline, events))
-            break;
+            flush();                             // what callbacks have sent
+        isLate = SteadyClock::now() >= deadline; // what is there already still counts
+        const short events = waitForEvents(deadline);
         if ((events & POLLOUT) != 0)
             flush();
         Received received = Received::Nothing;
         if ((events & ~POLLOUT) != 0 || _writeFailed)
             received = receive();
-        isDone = deliver(&done);
+        isDone = mayHaveLeft = deliver(&done);
         if (!isDone) {
             settle(received);
             isDone = !_abandoned && done();
@@ -284,10 +289,10 @@ bool FrameStream::waitUntil(const std::function<bool()>& done, std::chrono::mill
     --_waits;
     if (_abandoned)
         return false; // with the connection, what `done` looks at may be gone
-    if (_out.size() < queuedBefore)
+    if (_drainedCallback && _out.size() < queuedBefore)
         later(&FrameStream::tellDrained);
-    if (_socket)
-        later(&FrameStream::readable); // frames may be left
+    if (_socket && mayHaveLeft)
+        later(&FrameStream::readable);
     return isDone || done();
 }
 

@@ -31,6 +31,7 @@ public:
     [[nodiscard]] bool isOpen() const { return _socket && !_writeFailed && !_ended; }
     bool send(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
               ByteView data);
+    bool withdrawLast() { return _out.withdrawLast(); }
     [[nodiscard]] std::size_t queuedBytes() const { return _out.size(); }
     bool waitUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout);
     void close();
@@ -52,7 +53,9 @@ private:
     void tellClosed();
     void tellDrained();
     void later(void (FrameStream::*step)());
-    bool waitForEvent(std::chrono::steady_clock::time_point deadline, short& events) const;
+    short waitForEvents(std::chrono::steady_clock::time_point deadline) const;
+    // Before a wait reads on within a frame's delivery.
+    void keepDeliveredFrame();
 
     FileDescriptor _socket; // none once closed
     std::unique_ptr<DescriptorWatcher> _readWatcher;

@@ -36,6 +36,8 @@ bool QtFrameConnection::send(std::int32_t messageId, std::uint32_t serial, bool 
     return _stream->send(messageId, serial, wantsReply, isReply, data);
 }
 
+bool QtFrameConnection::withdrawLast() { return _stream->withdrawLast(); }
+
 std::size_t QtFrameConnection::queuedBytes() const { return _stream->queuedBytes(); }
 
 bool QtFrameConnection::waitUntil(const std::function<bool()>& done,

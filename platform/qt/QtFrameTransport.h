@@ -11,8 +11,8 @@ namespace orvane
 // listens or connects. Only peers of the same effective user, or root, are served.
 //
 // Connections and listeners may outlive the transport. Frames that arrive while a connection has no
-// frame callback wait in it, a few of them; the peer waits with the rest. A frame of more than
-// kFrameDataLimit bytes is not sent (send() is false) and, when announced, ends the connection.
+// frame callback wait in it, a few of them; the peer waits with the rest. A frame that announces
+// more than kFrameDataLimit bytes ends its connection, with a line in the log.
 class QtFrameTransport final : public FrameTransport
 {
 public:

@@ -22,7 +22,18 @@ void SendQueue::add(std::int32_t messageId, std::uint32_t serial, bool wantsRepl
         _bytes.erase(_bytes.begin(), _bytes.begin() + static_cast<std::ptrdiff_t>(_start));
         _start = 0;
     }
+    const std::size_t before = _bytes.size();
     appendFrame(_bytes, messageId, serial, wantsReply, isReply, data);
+    _lastFrameBytes = _bytes.size() - before;
+}
+
+bool SendQueue::withdrawLast()
+{
+    if (_lastFrameBytes == 0 || size() < _lastFrameBytes)
+        return false;
+    _bytes.resize(_bytes.size() - _lastFrameBytes);
+    _lastFrameBytes = 0;
+    return true;
 }
 
 SendQueue::Result SendQueue::writeTo(int socket)
@@ -47,6 +58,7 @@ void SendQueue::clear()
     else
         _bytes.clear();
     _start = 0;
+    _lastFrameBytes = 0;
 }
 
 } // namespace orvane

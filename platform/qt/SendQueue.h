@@ -15,13 +15,16 @@ public:
     // As appendFrame() does.
     void add(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
              ByteView data);
+    // Takes the frame added last away again, unless some of it has been written.
+    bool withdrawLast();
     // Writes what the socket takes without waiting.
     Result writeTo(int socket);
     void clear();
 
 private:
     Bytes _bytes;
-    std::size_t _start = 0; // of what is not written yet
+    std::size_t _start = 0;          // of what is not written yet
+    std::size_t _lastFrameBytes = 0; // 0 once it cannot be withdrawn
 };
 
 } // namespace orvane
