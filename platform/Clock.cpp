@@ -82,7 +82,8 @@ std::int64_t secondsSince1970(const CalendarTime& time)
     const std::int64_t dayOfYear = (153 * monthFromMarch + 2) / 5 + time.day - 1;
     const std::int64_t dayOfEra = yearOfEra * 365 + yearOfEra / 4 - yearOfEra / 100 + dayOfYear;
     const std::int64_t days = era * 146097 + dayOfEra - 719468;
-    return days * kSecondsADay + time.hour * 3600 + time.minute * 60 + time.second;
+    const std::int64_t minutes = std::int64_t{time.hour} * 60 + time.minute;
+    return days * kSecondsADay + minutes * 60 + time.second;
 }
 
 std::string absoluteDateText(double seconds)

@@ -45,7 +45,7 @@ std::optional<Bytes> readFile(const std::string& path, std::size_t limit)
             return std::nullopt;
         content.insert(content.end(), block, block + count);
     }
-    if (std::ferror(file.get()))
+    if (std::ferror(file.get()) != 0)
         return std::nullopt;
     return content;
 }

@@ -29,10 +29,10 @@ struct PropertyDate {
 
 // The one value type of commands, replies, templates, state, display and files.
 //
-// Scalars are values; the bytes of data are never changed, so copies share them. Dictionaries and arrays have reference semantics: copying a PropertyValue
-// shares them, so that a section can keep writing into a subtree that the state owns; deepCopy()
-// makes an independent tree. A default-made value is absent: asking it for anything yields nothing.
-// Texts are UTF-8.
+// Scalars are values; the bytes of data are never changed, so copies share them. Dictionaries and
+// arrays have reference semantics: copying a PropertyValue shares them, so that a section can keep
+// writing into a subtree that the state owns; deepCopy() makes an independent tree. A default-made
+// value is absent: asking it for anything yields nothing. Texts are UTF-8.
 class PropertyValue
 {
 public:
@@ -119,8 +119,8 @@ class PropertyDictionary
 public:
     [[nodiscard]] std::size_t size() const { return _entries.size(); }
     [[nodiscard]] bool empty() const { return _entries.empty(); }
-    auto begin() const { return _entries.begin(); }
-    auto end() const { return _entries.end(); }
+    [[nodiscard]] auto begin() const { return _entries.begin(); }
+    [[nodiscard]] auto end() const { return _entries.end(); }
 
     [[nodiscard]] bool contains(std::string_view key) const
     {
@@ -144,8 +144,8 @@ class PropertyArray
 public:
     [[nodiscard]] std::size_t size() const { return _elements.size(); }
     [[nodiscard]] bool empty() const { return _elements.empty(); }
-    auto begin() const { return _elements.begin(); }
-    auto end() const { return _elements.end(); }
+    [[nodiscard]] auto begin() const { return _elements.begin(); }
+    [[nodiscard]] auto end() const { return _elements.end(); }
 
     // Absent where the index is not below size().
     [[nodiscard]] const PropertyValue& operator[](std::size_t index) const;
