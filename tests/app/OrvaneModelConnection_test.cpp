@@ -189,7 +189,7 @@ TEST_P(FailureTest, TearsThePortsDownAndTriesAgainFiveSecondsLater)
 }
 
 INSTANTIATE_TEST_SUITE_P(Connection, FailureTest, ::testing::ValuesIn(kFailures),
-                         [](const auto& info) { return std::string(info.param.name); });
+                         [](const auto& test) { return std::string(test.param.name); });
 
 TEST_F(ConnectionTest, ConnectsAsksForTheTechnologyAndSendsTheStartCommand)
 {

@@ -1,0 +1,92 @@
+#include "app/AppOptions.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace orvane
+{
+
+namespace
+{
+
+using namespace std::chrono_literals;
+using ::testing::HasSubstr;
+
+const std::vector<std::string> kScenarios = {"lte", "umts"};
+
+AppOptions parsed(std::vector<std::string> arguments)
+{
+    return parseAppOptions(arguments, kScenarios);
+}
+
+} // namespace
+
+TEST(AppOptionsTest, WithoutArgumentsEverythingHasItsDefault)
+{
+    const AppOptions options = parsed({});
+    EXPECT_FALSE(options.error);
+    EXPECT_FALSE(options.demo);
+    EXPECT_EQ(options.frontEnd, FrontEnd::Text);
+    EXPECT_EQ(options.ports, "");
+    EXPECT_FALSE(options.root);
+    EXPECT_EQ(options.refreshInterval, 2s);
+    ASSERT_TRUE(options.log);
+    EXPECT_TRUE(options.log->accepts(LogPriority::Warning));
+    EXPECT_FALSE(options.log->accepts(LogPriority::Notice));
+}
+
+TEST(AppOptionsTest, TakesEachOption)
+{
+    const AppOptions options = parsed({"--ui=json", "--ports", "/p", "--root", "/r", "--refresh",
+                                       "0.25", "--log", "none", "--log-level", "info"});
+    EXPECT_FALSE(options.error);
+    EXPECT_EQ(options.frontEnd, FrontEnd::Json);
+    EXPECT_EQ(options.ports, "/p");
+    EXPECT_EQ(options.root, "/r");
+    EXPECT_EQ(options.refreshInterval, 250ms);
+}
+
+TEST(AppOptionsTest, TheDemoIsLteUnlessNamed)
+{
+    EXPECT_EQ(parsed({"--demo"}).demo, "lte");
+    EXPECT_EQ(parsed({"--demo=umts"}).demo, "umts");
+}
+
+TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
+{
+    const struct {
+        std::vector<std::string> arguments;
+        const char* part;
+    } kMistakes[] = {
+        {{"--demo=mars"},             "--demo takes lte, umts"     },
+        {{"--demo", "--ports", "/p"}, "--ports cannot be used with"},
+        {{"--ui", "hologram"},        "--ui takes"                 },
+        {{"--ports="},                "--ports needs"              },
+        {{"--root="},                 "--root needs"               },
+        {{"--refresh", "0"},          "refresh"                    },
+        {{"--refresh", "x"},          "refresh"                    },
+        {{"--refresh", "nan"},        "refresh"                    },
+        {{"--log", "paper"},          "--log takes"                },
+        {{"--log-level", "loud"},     "--log-level takes"          },
+        {{"open"},                    "orvane --help"              },
+        {{"--frobnicate"},            "--frobnicate"               },
+    };
+    for (const auto& mistake : kMistakes) {
+        const AppOptions options = parsed(mistake.arguments);
+        ASSERT_TRUE(options.error) << mistake.part;
+        EXPECT_THAT(*options.error, HasSubstr(mistake.part));
+        EXPECT_EQ(options.error->find('\n'), std::string::npos);
+    }
+}
+
+TEST(AppOptionsTest, HelpNamesEveryOptionAndScenario)
+{
+    const std::string help = appHelp(kScenarios);
+    for (const char* word : {"--demo", "--ui", "--ports", "--root", "--refresh", "--log",
+                             "--log-level", "--help", "--version", "lte, umts", "Exit status"})
+        EXPECT_THAT(help, HasSubstr(word));
+    EXPECT_TRUE(parsed({"--help"}).wantsHelp);
+    EXPECT_TRUE(parsed({"--version"}).wantsVersion);
+}
+
+} // namespace orvane
