@@ -1,0 +1,220 @@
+#include "telephonyd/phone/LTEScenario.h"
+
+#include "platform/TelephonyServer.h"
+#include "telephonyd/phone/ServerItems.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace orvane
+{
+
+namespace
+{
+
+using std::chrono::milliseconds;
+
+constexpr milliseconds kConnectedMeasurementEvery{240};
+constexpr milliseconds kServingMeasurementEvery{640};
+constexpr milliseconds kNeighboursEvery{1280};
+constexpr milliseconds kReselectionEvery{5120};
+constexpr milliseconds kCellsEvery{1000};
+
+constexpr Phases::Range kConnectedFor{15, 40};
+constexpr Phases::Range kIdleFor{20, 50};
+constexpr Phases::Range kDataFor{50, 110};
+constexpr Phases::Range kNoDataFor{8, 20};
+
+constexpr double kBestQuality = -6;
+constexpr double kWorstQuality = -17;
+
+double milliwatts(double decibelMilliwatts) { return std::pow(10, decibelMilliwatts / 10); }
+
+// The quality that a cell of that power has among the powers of all on its channel, its own
+// included: each sends pilots all the time and traffic for a quarter of it.
+double quality(double power, double allMilliwatts)
+{
+    constexpr double kCarriers = 12;
+    constexpr double kShareInUse = 0.3;
+    constexpr double kNoise = -127; // dBm a carrier
+    const double total = kCarriers * (kShareInUse * allMilliwatts + milliwatts(kNoise));
+    return std::clamp(10 * std::log10(milliwatts(power) / total), kWorstQuality, kBestQuality);
+}
+
+std::uint16_t frames(milliseconds now, int millisecondsPerFrame, int modulus)
+{
+    return static_cast<std::uint16_t>(now.count() / millisecondsPerFrame % modulus);
+}
+
+PropertyValue cellDictionary(const LTECell& cell, const char* type)
+{
+    const auto number = [](std::int64_t value) { return PropertyValue::integer(value); };
+    return PropertyValue::dictionaryOf({
+        {kTSCellMonitorCellRadioAccessTechnology, kTSCellMonitorRadioAccessTechnologyLTE},
+        {kTSCellMonitorCellType,                  type                                  },
+        {kTSCellMonitorMCC,                       number(1)                             },
+        {kTSCellMonitorMNC,                       number(1)                             },
+        {kTSCellMonitorTAC,                       number(cell.trackingAreaCode)         },
+        {kTSCellMonitorCellId,                    number(cell.cellIdentity)             },
+        {kTSCellMonitorPID,                       number(cell.physicalCellId)           },
+        {kTSCellMonitorBandInfo,                  number(cell.band)                     },
+        {kTSCellMonitorUARFCN,                    number(cell.earfcn)                   },
+    });
+}
+
+} // namespace
+
+LTEScenario::LTEScenario(std::uint64_t seed)
+    : _drive(kLTETownMasts, kLTETownRoad, seed),
+      _connected(kConnectedFor, kIdleFor, true, seed + 1),
+      _dataConnection(kDataFor, kNoDataFor, true, seed + 2)
+{
+}
+
+std::string LTEScenario::technology() const { return kTSLogChannelTechnology_Varnel_LTE; }
+
+std::vector<PhoneMessage> LTEScenario::step(milliseconds now)
+{
+    Messages messages;
+    if (_now < milliseconds(0)) {
+        _now = milliseconds(0);
+        first(messages);
+    }
+    while (_now + Drive::kStep <= now) {
+        _now += Drive::kStep;
+        next(messages);
+    }
+    return messages;
+}
+
+void LTEScenario::first(Messages& messages)
+{
+    addServingCell(messages);
+    messages.push_back(serverItem(kSimFilesItem, simFiles()));
+    addCells(messages);
+    addDataConnections(messages);
+    addServingMeasurement(messages, true);
+    addNeighbours(messages);
+    addConnectedMeasurement(messages);
+    addReselection(messages);
+}
+
+void LTEScenario::next(Messages& messages)
+{
+    _connected.advance(_now);
+    if (_dataConnection.advance(_now)) {
+        _dataConnections += _dataConnection.isOn() ? 1 : 0;
+        addDataConnections(messages);
+    }
+    const bool cellChanged = _drive.step(_connected.isOn());
+    if (cellChanged)
+        addServingCell(messages);
+    if (cellChanged || isDue(kCellsEvery))
+        addCells(messages);
+    if (_connected.isOn()) {
+        if (isDue(kConnectedMeasurementEvery))
+            addConnectedMeasurement(messages);
+        return;
+    }
+    if (cellChanged || isDue(kServingMeasurementEvery))
+        addServingMeasurement(messages, cellChanged);
+    if (cellChanged || isDue(kNeighboursEvery))
+        addNeighbours(messages);
+    if (isDue(kReselectionEvery))
+        addReselection(messages);
+}
+
+bool LTEScenario::isDue(milliseconds every) const { return _now % every == milliseconds(0); }
+
+LTELevels LTEScenario::levels(std::size_t cell) const
+{
+    const LTECell& own = kLTETown[cell];
+    double all = 0;
+    double averageAll = 0;
+    for (std::size_t i = 0; i < kLTETown.size(); ++i)
+        if (kLTETown[i].earfcn == own.earfcn) {
+            all += milliwatts(_drive.level(i));
+            averageAll += milliwatts(_drive.averageLevel(i));
+        }
+    const double power = _drive.level(cell);
+    const double powerQuality = quality(power, all);
+    return {own,
+            power,
+            _drive.averageLevel(cell),
+            powerQuality,
+            quality(_drive.averageLevel(cell), averageAll),
+            power - powerQuality + 10 * std::log10(own.resourceBlocks)};
+}
+
+std::vector<LTELevels> LTEScenario::levelsOf(const std::vector<std::size_t>& cells) const
+{
+    std::vector<LTELevels> found;
+    for (const std::size_t cell : cells)
+        found.push_back(levels(cell));
+    return found;
+}
+
+void LTEScenario::addServingCell(Messages& messages) const
+{
+    const LTECell& cell = kLTETown[_drive.serving()];
+    messages.push_back(lteServingCell(cell));
+    messages.push_back(lteMasterInformation(cell, frames(_now, 10, 1024)));
+}
+
+void LTEScenario::addServingMeasurement(Messages& messages, bool rulesUpdated) const
+{
+    messages.push_back(lteServingMeasurement(levels(_drive.serving()), rulesUpdated));
+}
+
+void LTEScenario::addConnectedMeasurement(Messages& messages) const
+{
+    const std::size_t serving = _drive.serving();
+    const auto others = levelsOf(_drive.neighboursOn(kLTETown[serving].earfcn));
+    messages.push_back(lteConnectedMeasurement(levels(serving), others, frames(_now, 1, 10240)));
+}
+
+// The neighbours on the serving channel, or where none is heard those on the channel of the
+// strongest: a report is of one channel and of at least one cell.
+void LTEScenario::addNeighbours(Messages& messages) const
+{
+    const std::vector<std::size_t> all = _drive.neighbours();
+    if (all.empty())
+        return;
+    auto cells = _drive.neighboursOn(kLTETown[_drive.serving()].earfcn);
+    if (cells.empty())
+        cells = _drive.neighboursOn(kLTETown[all.front()].earfcn);
+    messages.push_back(lteNeighbourMeasurement(levelsOf(cells), frames(_now, 10, 1024)));
+}
+
+// LTE and the other technologies by turns.
+void LTEScenario::addReselection(Messages& messages)
+{
+    const LTECell& serving = kLTETown[_drive.serving()];
+    const std::vector<std::size_t> neighbours = _drive.neighbours();
+    const unsigned turn = _reselections++;
+    const bool isLte = turn % 2 == 0 && !neighbours.empty();
+    messages.push_back(lteReselection(serving, isLte ? lteCandidate(kLTETown[neighbours.front()])
+                                                     : otherCandidate(turn / 2)));
+}
+
+void LTEScenario::addCells(Messages& messages) const
+{
+    auto cells = PropertyValue::newArray();
+    cells.asArray()->append(
+        cellDictionary(kLTETown[_drive.serving()], kTSCellMonitorCellTypeServing));
+    for (const std::size_t cell : _drive.neighbours())
+        cells.asArray()->append(cellDictionary(kLTETown[cell], kTSCellMonitorCellTypeNeighbor));
+    messages.push_back(serverItem(kCellsItem, cells));
+}
+
+// The one for calls stays; the one for the rest comes and goes, each time with a new address.
+void LTEScenario::addDataConnections(Messages& messages) const
+{
+    auto connections = PropertyValue::newArray();
+    connections.asArray()->append(dataConnection("ims", "5", 0));
+    if (_dataConnection.isOn())
+        connections.asArray()->append(dataConnection("internet", "9", _dataConnections));
+    messages.push_back(serverItem(kDataConnectionsItem, connections));
+}
+
+} // namespace orvane

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <chrono>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace orvane
+{
+
+// What a simulated phone reports, before it gets its header.
+struct PhoneMessage {
+    enum class Kind {
+        Modem,  // a diagnostic log item of the modem
+        Server, // an item that the telephony server makes itself; its code is the item's number
+        Bare,   // no log item: the payload is the whole message, sent whatever was asked for
+    };
+    Kind kind = Kind::Modem;
+    std::uint16_t code = 0;
+    Bytes payload;
+};
+
+// A simulated phone of one radio technology. What it does depends on its seed and on the times at
+// which it is asked alone.
+class Scenario
+{
+public:
+    virtual ~Scenario() = default;
+    // The technology constant.
+    [[nodiscard]] virtual std::string technology() const = 0;
+    // Lets the phone live on to `now`, counted from its start, and returns what fell due on the
+    // way. The first call, which returns one item of everything, is at 0; time never goes back.
+    virtual std::vector<PhoneMessage> step(std::chrono::milliseconds now) = 0;
+};
+
+// The scenarios that there are, by their names on the command line.
+std::vector<std::string> scenarioNames();
+// Null when there is none of that name.
+std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed);
+
+} // namespace orvane

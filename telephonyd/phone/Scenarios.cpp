@@ -1,0 +1,43 @@
+#include "telephonyd/phone/LTEScenario.h"
+#include "telephonyd/phone/Scenario.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+template <typename Kind>
+std::unique_ptr<Scenario> make(std::uint64_t seed)
+{
+    return std::make_unique<Kind>(seed);
+}
+
+struct Entry {
+    const char* name;
+    std::unique_ptr<Scenario> (*make)(std::uint64_t seed);
+};
+
+constexpr Entry kScenarios[] = {
+    {"lte", make<LTEScenario>},
+};
+
+} // namespace
+
+std::vector<std::string> scenarioNames()
+{
+    std::vector<std::string> names;
+    for (const Entry& entry : kScenarios)
+        names.emplace_back(entry.name);
+    return names;
+}
+
+std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed)
+{
+    for (const Entry& entry : kScenarios)
+        if (name == entry.name)
+            return entry.make(seed);
+    return nullptr;
+}
+
+} // namespace orvane
