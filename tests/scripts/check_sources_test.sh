@@ -63,7 +63,7 @@ expect_complaint app/Other.cpp '#include "platform/qt/Loop.h"' app/Other.cpp:1 "
 expect_complaint app/Other.h '#include <vector>' app/Other.h:1 "a header begins with #pragma once"
 expect_complaint app/Other.h "$once using namespace std;" app/Other.h:2 "a header opens no namespace"
 expect_complaint app/Other.cpp '// TO''DO: later' app/Other.cpp:1 "what is left to do"
-expect_complaint tests/app/Other_tests.cpp '' tests/app/Other_tests.cpp:1 "a test whose name does not end"
+expect_complaint tests/app/Other_tests.cpp $'\nTEST_F(Shell, Opens)' tests/app/Other_tests.cpp:2 "a test in a file whose name"
 
 case_named "every broken rule of a tree is named"
 make_tree
