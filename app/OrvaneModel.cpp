@@ -54,9 +54,13 @@ void OrvaneModel::refresh()
     _updated = false;
     _nodes = nullptr;
     _nodesByPath.reset();
+    _isViewUpdateQueued = true;
     _environment.queue.async([weak = weak_from_this()] {
         const auto model = weak.lock();
-        if (!model || !model->_observer)
+        if (!model)
+            return;
+        model->_isViewUpdateQueued = false;
+        if (!model->_observer)
             return;
         // The display is generated in here, from a template that may be bad.
         try {
@@ -73,14 +77,25 @@ PropertyValue OrvaneModel::getSaveContents()
                          : PropertyValue::newArray();
 }
 
+// The tree on the screen stays until a new generator has taken a message. Where a refresh has just
+// dropped it for a view update that is still to come, this is the last chance to make it again.
+void OrvaneModel::keepTreeForQueuedUpdate()
+{
+    if (!_isViewUpdateQueued)
+        return;
+    try {
+        topLevelNodes();
+    } catch (const std::exception& failure) {
+        logError("The display cannot be shown: %s", failure.what());
+    }
+}
+
 // A display belongs to one generator: a new one starts with a state of its own, or its sections
 // would have nothing to write into. Only the history goes over, to a generator of the same class.
 void OrvaneModel::adoptGenerator(std::unique_ptr<LogGenerator> generator)
 {
     if (generator) {
-        // The tree on the screen stays until the new generator has taken a message. Where a refresh
-        // has just dropped it, this is the last chance to make it again.
-        topLevelNodes();
+        keepTreeForQueuedUpdate();
         LogGenerator& adopted = *generator;
         const std::type_index generatorClass = typeid(adopted);
         const PropertyValue history = (*_state)[kHistoryKey];

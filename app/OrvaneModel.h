@@ -80,6 +80,7 @@ private:
     static void serverNotification(OrvaneModel* context);
 
     bool openSession();
+    void keepTreeForQueuedUpdate();
     void adoptGenerator(std::unique_ptr<LogGenerator> generator);
     void checkHealth();
     void scheduleRetry();
@@ -91,6 +92,7 @@ private:
     // The class of the generator that the state's history is of.
     std::optional<std::type_index> _historyClass;
     bool _updated = false;
+    bool _isViewUpdateQueued = false;
     NodePointer _nodes;
     std::optional<PathDictionary> _nodesByPath;
     std::unique_ptr<LocalMessagePort> _recvPort;

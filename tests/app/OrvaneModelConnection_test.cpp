@@ -161,7 +161,7 @@ const Failure kFailures[] = {
      },                                                                  {" ***** Could not send the START command (got error=-1)"}},
     {"ServerGoneBeforeTheStartCommand",
      [](auto& server, auto&) { server.afterTechnologyAnswer = [&server] { server.die(); }; },
-     {" ***** Could not send the START command (got error=-3)"}                                                                                         },
+     {" ***** Could not send the START command (got error=-4)"}                                                                                         },
 };
 
 } // namespace
