@@ -26,14 +26,13 @@ void InvalidationNotice::portIsInvalid()
 
 void InvalidationNotice::queueCall()
 {
-    if (!_state->callback || std::exchange(_state->queued, true))
+    if (!_state->callback)
         return;
     _queue.async([weak = std::weak_ptr(_state)] {
         const auto state = weak.lock();
         if (!state)
             return;
-        state->queued = false;
-        // Taken out first: it is called once, and it may destroy the port.
+        // Taken out first: it is called once, however often queued, and it may destroy the port.
         const Callback callback = std::exchange(state->callback, nullptr);
         if (callback)
             callback(state->port);

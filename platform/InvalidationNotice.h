@@ -27,7 +27,6 @@ private:
         MessagePort& port;
         Callback callback;
         bool invalid = false;
-        bool queued = false;
     };
 
     void queueCall();
