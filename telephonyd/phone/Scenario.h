@@ -4,9 +4,7 @@
 
 #include <chrono>
 #include <cstdint>
-#include <memory>
 #include <string>
-#include <string_view>
 #include <vector>
 
 namespace orvane
@@ -36,10 +34,5 @@ public:
     // way. The first call, which returns one item of everything, is at 0; time never goes back.
     virtual std::vector<PhoneMessage> step(std::chrono::milliseconds now) = 0;
 };
-
-// The scenarios that there are, by their names on the command line.
-std::vector<std::string> scenarioNames();
-// Null when there is none of that name.
-std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed);
 
 } // namespace orvane

@@ -1,5 +1,7 @@
+#include "telephonyd/phone/Scenarios.h"
+
 #include "telephonyd/phone/LTEScenario.h"
-#include "telephonyd/phone/Scenario.h"
+#include "telephonyd/phone/PhoneSource.h"
 
 namespace orvane
 {
@@ -38,6 +40,15 @@ std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed
         if (name == entry.name)
             return entry.make(seed);
     return nullptr;
+}
+
+LogSourceFactory phoneSourceFactory(std::string scenario, MainQueue& queue)
+{
+    constexpr std::uint64_t kSeed = 1;
+    return [name = std::move(scenario), &queue]() -> std::unique_ptr<LogSource> {
+        auto phone = makeScenario(name, kSeed);
+        return phone ? std::make_unique<PhoneSource>(queue, std::move(phone)) : nullptr;
+    };
 }
 
 } // namespace orvane

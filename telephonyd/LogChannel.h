@@ -1,0 +1,62 @@
+#pragma once
+
+#include "platform/FrameConnection.h"
+#include "telephonyd/phone/LogSource.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+
+namespace orvane
+{
+
+// One log channel of the server: the port that takes a client's commands, the connection on which
+// its log messages go out, and the source that they come from.
+//
+// The first connection to the port is the client's, others are closed. The channel ends when that
+// connection or the one to the client closes, or when the client leaves too much unread: then both
+// are closed and the port's name is free; whoever owns the channel destroys it soon after.
+class LogChannel
+{
+public:
+    // More than this unsent: the source is asked to wait, then the channel is given up.
+    static constexpr std::size_t kBehindBytes = 1024U * 1024;
+    static constexpr std::size_t kUnreadLimit = 64U * 1024 * 1024;
+
+    struct Events {
+        std::function<void()> firstMessage; // the first message has been queued
+        std::function<void()> ended;        // must not destroy the channel from within
+    };
+
+    // `name` is that of the port on which `listener` listens.
+    LogChannel(std::string name, std::unique_ptr<FrameListener> listener,
+               std::unique_ptr<FrameConnection> toClient, std::unique_ptr<LogSource> source,
+               Events events);
+    LogChannel(const LogChannel&) = delete;
+    LogChannel& operator=(const LogChannel&) = delete;
+
+    [[nodiscard]] const std::string& name() const { return _name; }
+
+private:
+    void accept(std::unique_ptr<FrameConnection> connection);
+    void take(const FrameReader::View& frame);
+    // What answers the command, if anything.
+    std::optional<Bytes> obey(const FrameReader::View& frame);
+    void start(const PropertyValue& command);
+    bool send(ByteView message);
+    void drained();
+    void end();
+
+    std::string _name;
+    std::unique_ptr<FrameListener> _listener;
+    std::unique_ptr<FrameConnection> _fromClient;
+    std::unique_ptr<FrameConnection> _toClient;
+    Events _events;
+    bool _hasStarted = false;
+    bool _hasSent = false;
+    bool _isBehind = false;
+    bool _hasEnded = false;
+    std::unique_ptr<LogSource> _source; // goes first, since it calls send()
+};
+
+} // namespace orvane

@@ -1,0 +1,173 @@
+#include "telephonyd/LogServer.h"
+
+#include "platform/FrameRequester.h"
+#include "platform/MessagePort.h"
+#include "platform/PropertyList.h"
+#include "platform/SystemLog.h"
+#include "platform/TelephonyServer.h"
+#include "telephonyd/LogChannel.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using namespace std::chrono_literals;
+
+constexpr auto kNotificationDelay = 100ms;
+
+// A client's port has a usable name, which is none of the server's own: messages would go round.
+bool isClientPort(const std::string& name)
+{
+    return isUsablePortName(name) && !name.starts_with(kTelephonyServerPort);
+}
+
+Bytes xmlBytes(const PropertyValue& value)
+{
+    const std::string text = writeXmlPropertyList(value).value_or("");
+    return Bytes(text.begin(), text.end());
+}
+
+} // namespace
+
+LogServer::LogServer(FrameTransport& transport, MainQueue& queue, LogSourceFactory makeSource)
+    : _transport(transport), _queue(queue), _makeSource(std::move(makeSource))
+{
+}
+
+LogServer::~LogServer() { stop(); }
+
+std::optional<std::string> LogServer::start()
+{
+    std::string error;
+    _listener = _transport.listen(kTelephonyServerPort, error);
+    if (!_listener)
+        return error;
+    _listener->setConnectionCallback([this](auto connection) { accept(std::move(connection)); });
+    return std::nullopt;
+}
+
+void LogServer::stop()
+{
+    _listener.reset();
+    _channels.clear();
+    _clients.clear();
+}
+
+void LogServer::accept(std::unique_ptr<FrameConnection> connection)
+{
+    const ClientId client = ++_lastClient;
+    FrameConnection& accepted = *(_clients[client] = std::move(connection));
+    accepted.setFrameCallback(
+        [this, client](const FrameReader::View& frame) { take(client, frame); });
+    // By value: the callback goes with its connection, and what it captured.
+    accepted.setClosedCallback([this, client] { _clients.erase(ClientId(client)); });
+}
+
+void LogServer::take(ClientId client, const FrameReader::View& frame)
+{
+    // Without a reply a client could not know its channel.
+    if (frame.isReply || !frame.wantsReply)
+        return;
+    std::optional<Bytes> reply;
+    if (frame.messageId == kCreateLogChannelMessage)
+        reply = replyToRequest(client, frame.data);
+    const auto found = _clients.find(client);
+    if (found != _clients.end() &&
+        !answerRequest(*found->second, frame.messageId, frame.serial, reply))
+        _clients.erase(found);
+}
+
+Bytes LogServer::replyToRequest(ClientId client, ByteView request)
+{
+    const PropertyListResult parsed = readPropertyList(request);
+    const std::string* clientPort = parsed.value[kCreateLogChannelKey].asString();
+    std::string port;
+    std::int32_t error = kBadRequest;
+    if (!parsed.value)
+        logError("A request for a log channel is no property list: %s", parsed.error.c_str());
+    else if (!clientPort || !isClientPort(*clientPort))
+        logError("A request for a log channel names no port to send to");
+    else
+        error = openChannel(client, *clientPort, port);
+    if (error != 0)
+        return xmlBytes(PropertyValue::dictionaryOf({
+            {kLogChannelErrorKey, PropertyValue::integer(error)}
+        }));
+    return xmlBytes(PropertyValue::dictionaryOf({
+        {kLogChannelErrorKey, PropertyValue::integer(0)},
+        {kLogChannelPortKey,  port                     },
+    }));
+}
+
+std::int32_t LogServer::openChannel(ClientId client, const std::string& clientPort,
+                                    std::string& port)
+{
+    if (_channels.size() >= kMostChannels) {
+        logError("No log channel for %s: there are %zu already", clientPort.c_str(),
+                 _channels.size());
+        return kNoChannel;
+    }
+    std::string error;
+    auto toClient = _transport.connect(clientPort, error);
+    if (!toClient) {
+        logError("No log channel for %s: %s", clientPort.c_str(), error.c_str());
+        return kClientUnreachable;
+    }
+    const ChannelNumber number = ++_lastChannel;
+    port = std::string(kTelephonyServerPort) + ".Channel." + std::to_string(number);
+    auto listener = _transport.listen(port, error);
+    auto source = listener ? _makeSource() : nullptr;
+    if (!source) {
+        logError("No log channel for %s: %s", clientPort.c_str(),
+                 listener ? "there is no source of messages" : error.c_str());
+        return kNoChannel;
+    }
+    _channels[number] = std::make_unique<LogChannel>(
+        port, std::move(listener), std::move(toClient), std::move(source),
+        LogChannel::Events{[this, client] { channelStarted(client); },
+                           [this, number] { channelEnded(number); }});
+    logLine(LogPriority::Info, "%s is open for %s", port.c_str(), clientPort.c_str());
+    return 0;
+}
+
+// Afterwards, since the channel, and maybe its source, is still at work.
+void LogServer::channelEnded(ChannelNumber number)
+{
+    whileAlive(0ms, [this, number] {
+        const auto found = _channels.find(number);
+        if (found == _channels.end())
+            return;
+        logLine(LogPriority::Info, "%s is closed", found->second->name().c_str());
+        _channels.erase(found);
+    });
+}
+
+// Once the first messages are on their way the client may as well show them.
+void LogServer::channelStarted(ClientId client)
+{
+    whileAlive(kNotificationDelay, [this, client] { notify(client); });
+}
+
+void LogServer::notify(ClientId client)
+{
+    const auto found = _clients.find(client);
+    if (found == _clients.end())
+        return;
+    found->second->send(kNotificationMessage, 0, false, false,
+                        xmlBytes(PropertyValue::dictionaryOf({
+                            {kNotificationNameKey, kChannelStreamingNotification}
+    })));
+}
+
+template <typename Task>
+void LogServer::whileAlive(std::chrono::nanoseconds delay, Task task)
+{
+    _queue.after(delay, [alive = std::weak_ptr(_alive), task] {
+        if (!alive.expired())
+            task();
+    });
+}
+
+} // namespace orvane

@@ -1,0 +1,72 @@
+#pragma once
+
+#include "platform/FrameConnection.h"
+#include "platform/MainQueue.h"
+#include "telephonyd/phone/LogSource.h"
+
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+class LogChannel;
+
+// A telephony server for machines without one: gives clients log channels whose messages come from
+// a simulated phone or a recording. Serves any number of clients on one queue.
+class LogServer
+{
+public:
+    // Errors of a request for a channel, beside 0.
+    static constexpr std::int32_t kBadRequest = 1;
+    static constexpr std::int32_t kClientUnreachable = 2;
+    static constexpr std::int32_t kNoChannel = 3; // too many, or none can be made
+
+    static constexpr std::size_t kMostChannels = 100;
+
+    // Neither is owned; both must outlive the server. A source that the factory does not make is
+    // no channel.
+    LogServer(FrameTransport& transport, MainQueue& queue, LogSourceFactory makeSource);
+    // stop().
+    ~LogServer();
+    LogServer(const LogServer&) = delete;
+    LogServer& operator=(const LogServer&) = delete;
+
+    // Listens as the telephony server. Returns what is wrong where that cannot be.
+    std::optional<std::string> start();
+    // Closes all channels and connections. Not to be called from within a source's call.
+    void stop();
+
+    [[nodiscard]] std::size_t channelCount() const { return _channels.size(); }
+    [[nodiscard]] std::size_t clientCount() const { return _clients.size(); }
+
+private:
+    using ClientId = std::uint64_t;
+    using ChannelNumber = std::uint64_t;
+
+    void accept(std::unique_ptr<FrameConnection> connection);
+    void take(ClientId client, const FrameReader::View& frame);
+    Bytes replyToRequest(ClientId client, ByteView request);
+    // 0 or an error.
+    std::int32_t openChannel(ClientId client, const std::string& clientPort, std::string& port);
+    void channelEnded(ChannelNumber number);
+    void channelStarted(ClientId client);
+    void notify(ClientId client);
+    template <typename Task>
+    void whileAlive(std::chrono::nanoseconds delay, Task task);
+
+    FrameTransport& _transport;
+    MainQueue& _queue;
+    LogSourceFactory _makeSource;
+    std::unique_ptr<FrameListener> _listener;
+    std::map<ClientId, std::unique_ptr<FrameConnection>> _clients;
+    std::map<ChannelNumber, std::unique_ptr<LogChannel>> _channels;
+    ClientId _lastClient = 0;
+    ChannelNumber _lastChannel = 0;
+    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+};
+
+} // namespace orvane

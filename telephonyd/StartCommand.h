@@ -1,0 +1,13 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+#include "telephonyd/phone/LogSource.h"
+
+namespace orvane
+{
+
+// What a start command asks for. Entries that are no 16-bit codes are left out, with one line a
+// list.
+LogSelection selectionOfStartCommand(const PropertyValue& command);
+
+} // namespace orvane
