@@ -42,6 +42,17 @@ protected:
         return port;
     }
 
+    // An answer to a request for a channel; absent parts are left out.
+    static PropertyValue answerOf(const PropertyValue& error, const PropertyValue& port)
+    {
+        PropertyValue answer = PropertyValue::newDictionary();
+        if (error)
+            answer.asDictionary()->set("Error", error);
+        if (port)
+            answer.asDictionary()->set("Port", port);
+        return answer;
+    }
+
     // What a request for a channel comes to where the server gives this answer by hand.
     LogChannelResult resultOf(const PropertyValue& answer)
     {
@@ -190,25 +201,16 @@ TEST_F(FrameTelephonyServerTest, AServerThatDiesDuringTheRequestIsMinus5)
 
 TEST_F(FrameTelephonyServerTest, AnAnswerThatCannotBeUsedIsMinus4)
 {
-    const PropertyValue unusable[] = {
-        "text",
-        PropertyValue::arrayOf({PropertyValue::integer(0)                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                          }
-        ),
-        PropertyValue::newDictionary(),
-        PropertyValue::dictionaryOf({              {"Port", "port"}                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                  }
-        ),
-        PropertyValue::dictionaryOf({ {"Error", "0"},                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                   {"Port", "port"}}
-        ),
-        PropertyValue::dictionaryOf({                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                {"Error", PropertyValue::real(0)},                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                   {"Port", "port"}}
-        ),
-        PropertyValue::dictionaryOf({                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                         {"Error", PropertyValue::boolean(false)},                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                   {"Port", "port"}}
-        ),
-        PropertyValue::dictionaryOf({                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                     {"Error", PropertyValue::integer(1LL << 32)}                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                               }
-        ),
-        PropertyValue::dictionaryOf(
-            {                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                                          {"Error", PropertyValue::integer(0)}, {"Port", PropertyValue::integer(1)}}
-        ),
-    };
+    std::vector<PropertyValue> unusable;
+    unusable.push_back("text");
+    unusable.push_back(PropertyValue::newArray());
+    unusable.push_back(answerOf({}, {}));
+    unusable.push_back(answerOf({}, "port"));
+    unusable.push_back(answerOf("0", "port"));
+    unusable.push_back(answerOf(PropertyValue::real(0), "port"));
+    unusable.push_back(answerOf(PropertyValue::boolean(false), "port"));
+    unusable.push_back(answerOf(PropertyValue::integer(1LL << 32), {}));
+    unusable.push_back(answerOf(PropertyValue::integer(0), PropertyValue::integer(1)));
     for (const PropertyValue& answer : unusable) {
         const LogChannelResult result = resultOf(answer);
         EXPECT_EQ(result.error, -4) << answer.description();
@@ -216,12 +218,7 @@ TEST_F(FrameTelephonyServerTest, AnAnswerThatCannotBeUsedIsMinus4)
     }
     EXPECT_EQ(resultOf(Bytes()).error, -4);
     EXPECT_EQ(resultOf(Bytes{'x'}).error, -4);
-    EXPECT_EQ(resultOf(PropertyValue::dictionaryOf({
-                           {"Error", PropertyValue::integer(0)},
-                           {"Port",  "port"                   }
-    }))
-                  .error,
-              0);
+    EXPECT_EQ(resultOf(answerOf(PropertyValue::integer(0), "port")).error, 0);
 }
 
 TEST_F(FrameTelephonyServerTest, ANameThatIsNoTextIsMinus4WithoutARequest)
@@ -333,13 +330,10 @@ TEST_F(FrameTelephonyServerTest, IllFormedNotificationsAreIgnoredWithOneLineEach
 {
     const auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
-    const PropertyValue illFormed[] = {
-        PropertyValue::newDictionary(),
-        PropertyValue::dictionaryOf({{"Name", PropertyValue::integer(1)}}
-        ),
-        PropertyValue::arrayOf({"Name"                             }
-        ),
-    };
+    PropertyValue nameIsNoText = PropertyValue::newDictionary();
+    nameIsNoText.asDictionary()->set("Name", PropertyValue::integer(1));
+    const std::vector<PropertyValue> illFormed = {PropertyValue::newDictionary(), nameIsNoText,
+                                                  PropertyValue::newArray()};
     server.sendToClients(kNotificationMessage, Bytes());
     server.sendToClients(kNotificationMessage, Bytes{'x'});
     for (const PropertyValue& each : illFormed) {
