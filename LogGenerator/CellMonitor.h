@@ -34,6 +34,13 @@ struct CellRow {
     Format format = decimal;
 };
 
+// For tables of rows, some with a format of their own.
+constexpr CellRow cellRow(const char* key, const char* row, const char* failure,
+                          Format format = decimal)
+{
+    return {key, row, failure, format};
+}
+
 // What a section takes from the cells: which of them, and their rows.
 struct CellLayout {
     bool (*isWanted)(const PropertyValue& cell);

@@ -1,0 +1,68 @@
+#include "LogGenerator/GSM/ActiveSet.h"
+
+#include "LogGenerator/GSM/GainControl.h"
+#include "LogGenerator/GSM/LogCodes.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr Field kReceiverGain = bytesField("", 13, 2, decimal, Coding::Signed);
+
+constexpr std::size_t kFirstCell = 16;
+constexpr std::size_t kCellStride = 15;
+constexpr std::size_t kFingerStride = 44;
+
+constexpr Field kScramblingCode = bitsField("Scrambling Code", 7, 0, 13, decimal);
+constexpr std::size_t kCellBytes = kScramblingCode.end();
+
+// The set that a cell belongs to: the highest three bits, above the scrambling code.
+constexpr std::int64_t kActive = 0;
+std::optional<std::uint32_t> setOf(PacketView cell) { return cell.bitsAt(8, 5, 3); }
+
+// The readings of a cell's finger record, of which the first that is not zero counts.
+constexpr std::size_t kReadings[] = {32, 36, 40};
+
+std::uint32_t energyRatio(PacketView finger)
+{
+    for (const std::size_t offset : kReadings)
+        if (const auto reading = finger.unsignedAt(offset, 4).value_or(0))
+            return static_cast<std::uint32_t>(reading);
+    return 0;
+}
+
+constexpr PacketLayout kPackets[] = {ownPacket(kUmtsActiveSetCode, 16)};
+
+constexpr SectionLayout kLayout = {"Active Set", "ActiveSet", UnknownCode::Report, kPackets};
+
+} // namespace
+
+ActiveSet::ActiveSet() : ListSection(kLayout) {}
+
+std::vector<PropertyValue> ActiveSet::elements(PacketView packet, const PacketLayout&)
+{
+    const std::size_t count = countAt<15>(packet);
+    const Records cells(packet, kFirstCell, kCellStride, count);
+    // Finger records follow all cell records, one for each cell of any set.
+    const Records fingers(packet, kFirstCell + kCellStride * count, kFingerStride, count);
+    const std::int64_t gain = gainControlDecibels(kReceiverGain.valueIn(packet).value_or(0));
+
+    std::vector<PropertyValue> active;
+    std::size_t index = 0;
+    forEachWholeRecord(cells, kCellBytes, [&](PacketView cell) {
+        const PacketView finger = fingers.at(index++);
+        if (setOf(cell) != kActive || !finger.holds(0, kFingerStride))
+            return;
+        const std::int64_t energy = lookUpECNO(energyRatio(finger));
+        active.push_back(PropertyValue::newDictionary());
+        PropertyDictionary* rows = active.back().asDictionary();
+        writeRows(rows, cell, std::span(&kScramblingCode, 1));
+        setRow(rows, "RSCP", *decibels(gain - 106 + energy));
+        setRow(rows, "Energy Per Chip", *decibels(energy));
+    });
+    return active;
+}
+
+} // namespace orvane

@@ -1,0 +1,16 @@
+#include "LogGenerator/GSM/CellChangeCounters.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr SectionLayout kLayout = {
+    "Cell Change Counters", "CellChangeCounters", UnknownCode::Ignore, {}};
+
+} // namespace
+
+CellChangeCounters::CellChangeCounters() : Section(kLayout) {}
+
+} // namespace orvane

@@ -1,0 +1,16 @@
+#include "LogGenerator/GSM/CodingScheme.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+// The text is that of the cell change counters, and meant.
+constexpr SectionLayout kLayout = {"Coding Scheme", "CellChangeCounters", UnknownCode::Ignore, {}};
+
+} // namespace
+
+CodingScheme::CodingScheme() : Section(kLayout) {}
+
+} // namespace orvane

@@ -1,0 +1,54 @@
+#include "LogGenerator/GSM/GSMServingCell.h"
+
+#include "LogGenerator/GSM/Cells.h"
+#include "LogGenerator/GSM/LogCodes.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr Field kCellFields[] = {
+    bytesField("Cell ID", 17, 2, decimal),
+    bytesField("ARFCN", 13, 2, decimal),
+    bytesField("BSIC", 15, 2, decimal),
+};
+
+// Cut to their low 16 and 8 bits. This is meant; the same bytes show uncut in "GSM RR Info".
+RowText low16Bits(std::int64_t raw) { return decimal(raw & 0xFFFF); }
+RowText low8Bits(std::int64_t raw) { return decimal(raw & 0xFF); }
+
+constexpr Field kMeasurementFields[] = {
+    // Not negated. This is meant.
+    bytesField("RSSI", 15, 1, decibelMilliwatts),
+    bytesField("C1 Value", 16, 4, low16Bits),
+    bytesField("C2 Value", 20, 4, low16Bits),
+};
+
+constexpr Field kDedicatedChannelFields[] = {
+    bytesField("MA Dedicated ARFCN", 13, 2, low8Bits),
+};
+
+constexpr CellRow kCellRows[] = {
+    {kTSCellMonitorCellId, "Cell ID", "GSMServingCell: Failed to retrieve Cell ID\n"},
+    {kTSCellMonitorARFCN,  "ARFCN",   "GSMServingCell: Failed to retrieve ARFCN\n"  },
+};
+
+constexpr CellLayout kServingCell = {isServingGsmCell, kCellRows};
+
+constexpr PacketLayout kPackets[] = {
+    rowsPacket(kGsmCellCode, 26, kCellFields),
+    rowsPacket(kGsmMeasurementCode, 29, kMeasurementFields),
+    rowsPacket(kGsmDedicatedChannelCode, 17, kDedicatedChannelFields),
+    cellsPacket(kServingCell),
+};
+
+constexpr SectionLayout kLayout = {"GSM Serving Cell", "GSMServingCell", UnknownCode::Report,
+                                   kPackets};
+
+} // namespace
+
+GSMServingCell::GSMServingCell() : Section(kLayout) {}
+
+} // namespace orvane

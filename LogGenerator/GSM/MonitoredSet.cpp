@@ -1,0 +1,18 @@
+#include "LogGenerator/GSM/MonitoredSet.h"
+
+#include "LogGenerator/GSM/AlwaysEmptySet.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr SectionLayout kLayout = {"Monitored Set", "MonitoredSet", UnknownCode::Report,
+                                   kAlwaysEmptySetPackets};
+
+} // namespace
+
+MonitoredSet::MonitoredSet() : ListSection(kLayout) {}
+
+} // namespace orvane

@@ -1,0 +1,16 @@
+#include "LogGenerator/GSM/NonRankedGSMSet.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr SectionLayout kLayout = {
+    "Non-Ranked GSM Set", "NonRankedGSMSet", UnknownCode::Ignore, {}};
+
+} // namespace
+
+NonRankedGSMSet::NonRankedGSMSet() : ListSection(kLayout) {}
+
+} // namespace orvane

@@ -1,0 +1,16 @@
+#include "LogGenerator/GSM/NonRankedUMTSSet.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr SectionLayout kLayout = {
+    "Non-Ranked UMTS Set", "NonRankedUMTSSet", UnknownCode::Ignore, {}};
+
+} // namespace
+
+NonRankedUMTSSet::NonRankedUMTSSet() : ListSection(kLayout) {}
+
+} // namespace orvane

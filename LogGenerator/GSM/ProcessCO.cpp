@@ -1,0 +1,32 @@
+#include "LogGenerator/GSM/ProcessCO.h"
+
+#include "LogGenerator/GSM/LogCodes.h"
+#include "LogGenerator/GSM/NasTables.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr Field kMmFields[] = {
+    bytesField("MM State", 13, 1, named<kMmStates>),
+};
+
+constexpr Field kRegistrationFields[] = {
+    bytesField("MM Service State", 13, 1, named<kRegistrationStates>),
+};
+
+constexpr PacketLayout kPackets[] = {
+    {kMmStateCode,      16, kMmFields          },
+    {kRegistrationCode, 16, kRegistrationFields},
+};
+
+// Logs as the circuit-switched section does. This is meant.
+constexpr SectionLayout kLayout = {"Process CO", "ProcessCS", UnknownCode::Report, kPackets};
+
+} // namespace
+
+ProcessCO::ProcessCO() : Section(kLayout) {}
+
+} // namespace orvane

@@ -1,0 +1,93 @@
+#include "LogGenerator/GSM/UMTSRRInfo.h"
+
+#include "LogGenerator/GSM/Cells.h"
+#include "LogGenerator/GSM/GainControl.h"
+#include "LogGenerator/GSM/LogCodes.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr const char* kChannelRow = "UARFCN";
+
+constexpr ValueName kRrcStates[] = {
+    {0, "Disconnected"},
+    {1, "Connecting"  },
+    {2, "CELL_FACH"   },
+    {3, "CELL_DCH"    },
+    {4, "CELL_PCH"    },
+    {5, "URA_PCH"     },
+};
+
+RowText enabled(std::int64_t flag) { return flag != 0 ? "Enabled" : "Disabled"; }
+
+constexpr Field kStateFields[] = {
+    bytesField("RRC State", 13, 1, named<kRrcStates>),
+};
+
+constexpr Field kIdentityFields[] = {
+    bytesField("Cell ID", 21, 4, decimal),
+    bytesField("Downlink Frequency", 17, 4, decimal),
+    bytesField("Uplink Frequency", 13, 4, decimal),
+    bytesField("URA ID", 25, 2, decimal),
+};
+
+constexpr Field kCipheringFields[] = {
+    bytesField("Ciphering", 13, 1, enabled),
+};
+
+constexpr Field kTransmitGain = bytesField("", 4, 2, decimal, Coding::Signed);
+
+// The mean in dBm over the records that have a reading. Of none it is not a number, and shown so on
+// purpose.
+double meanTransmitPower(PacketView packet)
+{
+    double sum = 0;
+    double count = 0;
+    const Records records(packet, 16, 14, countAt<14>(packet));
+    forEachWholeRecord(records, kTransmitGain.end(), [&](PacketView record) {
+        const std::int64_t gain = kTransmitGain.valueIn(record).value_or(0);
+        if (gain == 0)
+            return;
+        sum += static_cast<double>(gainControlDecibels(gain) - 70);
+        count += 1;
+    });
+    return sum / count;
+}
+
+constexpr CellRow kCellRows[] = {
+    {kTSCellMonitorCellId, "Cell ID",         "UMTSRRInfo: Failed to retrieve Cell ID\n"        },
+    {kTSCellMonitorUARFCN, kChannelRow,       "UMTSRRInfo: Failed to retrieve UARFCN\n"         },
+    {kTSCellMonitorSCN,    "Scrambling Code", "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
+};
+
+constexpr CellLayout kServingCell = {isServingUmtsCell, kCellRows};
+
+constexpr PacketLayout kPackets[] = {
+    rowsPacket(kUmtsRrcStateCode, 14, kStateFields),
+    ownPacket(kUmtsTransmitPowerCode, 16),
+    rowsPacket(kUmtsCellIdentityCode, 29, kIdentityFields),
+    rowsPacket(kUmtsCipheringCode, 19, kCipheringFields),
+    cellsPacket(kServingCell),
+};
+
+constexpr SectionLayout kLayout = {"UMTS RR Info", "UMTSRRInfo", UnknownCode::Report, kPackets};
+
+} // namespace
+
+UMTSRRInfo::UMTSRRInfo() : Section(kLayout) {}
+
+void UMTSRRInfo::decode(PacketView packet, const PacketLayout& layout)
+{
+    Section::decode(packet, layout);
+    const auto shown = rows();
+    if (layout.logCode == kUmtsTransmitPowerCode)
+        setRow(shown.get(), "Transmit Power", printed("%4.2lf dBm", meanTransmitPower(packet)));
+    // The modem shows both frequencies; the telephony server's next record brings its own back.
+    if (layout.logCode == kUmtsCellIdentityCode && shown)
+        shown->remove(kChannelRow);
+}
+
+} // namespace orvane

@@ -1,0 +1,53 @@
+#include "LogGenerator/GSM/UMTSSet.h"
+
+#include "LogGenerator/GSM/Cells.h"
+#include "LogGenerator/GSM/RankingPacket.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+RowText receivedPower(std::int64_t raw) { return decibels(raw - 21); }
+
+RowText halfDecibels(std::int64_t steps)
+{
+    return printed("%f dB", static_cast<double>(steps) * 0.5);
+}
+
+constexpr Field kCellFields[] = {
+    bytesField("Scrambling Code", 2, 2, decimal),
+    bytesField("RSCP", 4, 1, receivedPower, Coding::Signed),
+    bytesField("Energy Per Chip", 7, 1, halfDecibels, Coding::Signed),
+    // Shown as a signed number, so that 0xFFFF is -1. This is meant.
+    bytesField("Downlink Frequency", 0, 2, decimal, Coding::Signed),
+    bytesField("Ranking Value", 8, 2, decimal, Coding::Signed),
+    bytesField("Rank Cell RSCP", 5, 2, decibels, Coding::Signed),
+};
+
+constexpr RecordLayout kCells = {kUmtsRankingCount, kFirstRankingRecord, 10, kCellFields};
+
+constexpr CellRow kNeighbourRows[] = {
+    cellRow(kTSCellMonitorUARFCN, "UARFCN", "UMTSSet: Failed to retrieve UARFCN\n"),
+    cellRow(kTSCellMonitorSCN, "Scrambling Code", "UMTSSet: Failed to retrieve Scrambling Code\n"),
+    cellRow(kTSCellMonitorRSCP, "RSCP", "UMTSSet: Failed to retrieve RSCP\n",
+            levelText<decibelMilliwatts>),
+    cellRow(kTSCellMonitorECN0, "Energy Per Chip", "UMTSSet: Failed to retrieve Energy Per Chip\n",
+            levelText<decibels>),
+};
+
+constexpr CellLayout kNeighbours = {isNeighbouringUmtsCell, kNeighbourRows};
+
+constexpr PacketLayout kPackets[] = {
+    recordsPacket(kUmtsRankingCode, kRankingMinimumBytes, kCells),
+    cellsPacket(kNeighbours),
+};
+
+constexpr SectionLayout kLayout = {"UMTS Set", "UMTSSet", UnknownCode::Report, kPackets};
+
+} // namespace
+
+UMTSSet::UMTSSet() : ListSection(kLayout) {}
+
+} // namespace orvane
