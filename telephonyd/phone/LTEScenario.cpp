@@ -20,8 +20,8 @@ constexpr milliseconds kNeighboursEvery{1280};
 constexpr milliseconds kReselectionEvery{5120};
 constexpr milliseconds kCellsEvery{1000};
 
-constexpr Phases::Range kConnectedFor{15, 40};
-constexpr Phases::Range kIdleFor{20, 50};
+constexpr Phases::Range kConnectedFor{12, 30};
+constexpr Phases::Range kIdleFor{15, 35};
 constexpr Phases::Range kDataFor{50, 110};
 constexpr Phases::Range kNoDataFor{8, 20};
 
@@ -66,7 +66,7 @@ PropertyValue cellDictionary(const LTECell& cell, const char* type)
 
 LTEScenario::LTEScenario(std::uint64_t seed)
     : _drive(kLTETownMasts, kLTETownRoad, seed),
-      _connected(kConnectedFor, kIdleFor, true, seed + 1),
+      _connected(kConnectedFor, kIdleFor, false, seed + 1),
       _dataConnection(kDataFor, kNoDataFor, true, seed + 2)
 {
 }

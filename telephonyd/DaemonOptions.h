@@ -1,0 +1,40 @@
+#pragma once
+
+#include "platform/SystemLog.h"
+
+#include <memory>
+#include <optional>
+#include <span>
+#include <string>
+
+namespace orvane
+{
+
+// What the command line asks `telephonyd` for.
+struct DaemonOptions {
+    bool wantsHelp = false;
+    bool wantsVersion = false;
+    // Exactly one of the two is given.
+    std::optional<std::string> demo;   // the scenario of a simulated phone
+    std::optional<std::string> replay; // the recording to be sent again
+
+    // For a recording.
+    std::optional<std::string> technology; // the constant; nothing = by the recording's log codes
+    std::optional<double> speed = 1.0;     // nothing = as fast as clients take it
+    bool loops = false;
+
+    std::string ports; // empty where not given
+    std::unique_ptr<SystemLog> log;
+
+    // One line that says what is wrong and what to do; then nothing else counts.
+    std::optional<std::string> error;
+};
+
+// `arguments` are those after the program's name; `scenarios` the simulated phones that there are.
+DaemonOptions parseDaemonOptions(std::span<const std::string> arguments,
+                                 std::span<const std::string> scenarios);
+
+// The text of --help.
+std::string daemonHelp(std::span<const std::string> scenarios);
+
+} // namespace orvane

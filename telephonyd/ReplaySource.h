@@ -1,0 +1,72 @@
+#pragma once
+
+#include "LogGenerator/DlfReader.h"
+#include "platform/MainQueue.h"
+#include "telephonyd/phone/LogSource.h"
+
+#include <chrono>
+#include <functional>
+#include <memory>
+#include <optional>
+
+namespace orvane
+{
+
+struct ReplaySettings {
+    std::string technology; // the constant
+    // Seconds of the recording a second; nothing = as fast as the client takes it.
+    std::optional<double> speed = 1.0;
+    bool loops = false;
+};
+
+// Sends a recording (.dlf) again, from its start for each channel: of its items the ones that were
+// asked for, in file order, at the pace of their timestamps. An item of an earlier time than those
+// before follows at once. A jump of more than kLongestGap ahead counts as a clock that was set, and
+// takes no time either. Items without a timestamp are not sent.
+//
+// Waits while the client is behind, and then makes up the time. After the end it is silent; a loop
+// starts over kLoopPause of the recording later, or at once without a speed, as long as the
+// recording holds anything that was asked for.
+class ReplaySource final : public LogSource
+{
+public:
+    static constexpr std::chrono::seconds kLongestGap{3600};
+    static constexpr std::chrono::seconds kLoopPause{1};
+
+    // Time that goes on steadily, from any start.
+    using Now = std::function<std::chrono::nanoseconds()>;
+
+    // The queue is not owned. The file is shared by all channels.
+    ReplaySource(MainQueue& queue, Now now, std::shared_ptr<const Bytes> file,
+                 ReplaySettings settings);
+
+    [[nodiscard]] std::string technology() const override { return _settings.technology; }
+    void start(const LogSelection& selection, Send send) override;
+    void resume() override;
+
+private:
+    void playAfter(std::chrono::nanoseconds delay);
+    void play();
+    bool startOver();
+    void goOnTo(std::uint64_t timestamp);
+    bool sendItem();
+    [[nodiscard]] bool isWanted(const DlfItem& item) const;
+    [[nodiscard]] std::chrono::nanoseconds atSpeed(double seconds) const;
+
+    MainQueue& _queue;
+    Now _now;
+    std::shared_ptr<const Bytes> _file;
+    const ReplaySettings _settings;
+    LogSelection _selection;
+    Send _send;
+    DlfReader _reader;
+    std::optional<DlfItem> _item;          // the next to be sent
+    std::optional<std::uint64_t> _reached; // the latest timestamp of this round
+    std::chrono::nanoseconds _due{0};      // when that is
+    bool _hasSentInRound = false;
+    bool _waitsForClient = false;
+    Bytes _message; // kept for its memory
+    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+};
+
+} // namespace orvane

@@ -1,0 +1,109 @@
+#include "platform/FileSystem.h"
+#include "platform/Services.h"
+#include "platform/qt/PortsDirectory.h"
+#include "platform/qt/QtEventLoop.h"
+#include "platform/qt/QtFrameTransport.h"
+#include "platform/qt/QtMainQueue.h"
+#include "platform/qt/SignalWatcher.h"
+#include "telephonyd/DaemonOptions.h"
+#include "telephonyd/LogServer.h"
+#include "telephonyd/ReplaySource.h"
+#include "telephonyd/ReplayTechnology.h"
+#include "telephonyd/phone/Scenarios.h"
+
+#include <chrono>
+#include <cstdio>
+#include <exception>
+
+using namespace orvane;
+
+namespace
+{
+
+constexpr int kFailure = 1;
+constexpr int kUnusableArguments = 2;
+
+void complain(const std::string& text) { std::fprintf(stderr, "telephonyd: %s\n", text.c_str()); }
+
+// Null, with a complaint, when the recording cannot be served.
+LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
+{
+    auto content = readFile(*options.replay);
+    if (!content) {
+        complain("cannot read \"" + *options.replay +
+                 "\": check that the file is there and may be "
+                 "read");
+        return nullptr;
+    }
+    const auto technology = options.technology ? options.technology : technologyOfLog(*content);
+    if (!technology) {
+        complain("\"" + *options.replay +
+                 "\" holds no log codes that tell its technology: name "
+                 "it with --technology");
+        return nullptr;
+    }
+    const auto file = std::make_shared<const Bytes>(std::move(*content));
+    const ReplaySettings settings{*technology, options.speed, options.loops};
+    return [file, settings, &queue] {
+        const auto now = [] {
+            return std::chrono::nanoseconds(std::chrono::steady_clock::now().time_since_epoch());
+        };
+        return std::make_unique<ReplaySource>(queue, now, file, settings);
+    };
+}
+
+int serve(const DaemonOptions& options)
+{
+    std::string error;
+    const auto directory = PortsDirectory::open(options.ports, error);
+    if (!directory) {
+        complain(error);
+        return kFailure;
+    }
+    QtEventLoop loop;
+    QtMainQueue queue;
+    QtFrameTransport transport(directory->path());
+    LogSourceFactory factory =
+        options.demo ? phoneSourceFactory(*options.demo, queue) : replayFactory(options, queue);
+    if (!factory)
+        return kFailure;
+    LogServer server(transport, queue, std::move(factory));
+    if (const auto failure = server.start()) {
+        complain("cannot be the telephony server in " + directory->path() + ": " + *failure +
+                 "; end the other server or choose another directory with --ports");
+        return kFailure;
+    }
+    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    logLine(LogPriority::Notice, "Serving in %s", directory->path().c_str());
+    return loop.run();
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
+    const std::vector<std::string> scenarios = scenarioNames();
+    const DaemonOptions options = parseDaemonOptions(arguments, scenarios);
+    if (options.error) {
+        complain(*options.error);
+        return kUnusableArguments;
+    }
+    if (options.wantsHelp) {
+        std::fputs(daemonHelp(scenarios).c_str(), stdout);
+        return 0;
+    }
+    if (options.wantsVersion) {
+        std::puts("telephonyd " ORVANE_VERSION);
+        return 0;
+    }
+    Services::current().setLog(options.log.get());
+    int status = kFailure;
+    try {
+        status = serve(options);
+    } catch (const std::exception& failure) {
+        complain(failure.what());
+    }
+    Services::current().setLog(nullptr);
+    return status;
+}
