@@ -3,6 +3,7 @@
 #include "platform/PropertyValue.h"
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -12,21 +13,24 @@ namespace orvane
 // Property lists as bytes: XML (UTF-8, UTF-16 with byte-order mark, or as the XML declaration says)
 // and binary ("bplist00") are read, XML is written.
 
-// Arrays and dictionaries nested deeper than this are refused.
+// Arrays and dictionaries nested deeper than this are neither read nor written.
 constexpr std::size_t kPropertyListDepthLimit = 512;
 
 struct PropertyListResult {
     PropertyValue value; // absent when the bytes could not be read
-    std::string error;   // then says what is wrong and at which byte offset or line
+    std::string error;   // then says what is wrong and ends in "at line L, column C" or "at byte N"
 };
 
 // Reads a whole property list of either format. Never throws on bad input, never reads outside the
-// bytes, and takes memory in proportion to them.
+// bytes, and takes memory in proportion to them. All dictionaries and arrays of the value are
+// distinct. Of a key that occurs twice in a dictionary the later value stands at the earlier place.
+// May be called from any thread.
 PropertyListResult readPropertyList(ByteView bytes);
 
-// The XML form, UTF-8, without a DOCTYPE line. Nothing when the value is absent or holds what XML
-// cannot carry (an absent value, a text with a control character or invalid UTF-8, a date outside
-// the years 1 to 9999); dates lose the fraction of a second.
+// The XML form, UTF-8, without a DOCTYPE line. Nothing when the value is absent, is nested too
+// deeply or holds what XML cannot carry (an absent value, a text with a control character, U+FFFE,
+// U+FFFF or invalid UTF-8, a date outside the years 1 to 9999); dates lose the fraction of a
+// second.
 std::optional<std::string> writeXmlPropertyList(const PropertyValue& value);
 
 // Whether the bytes are well-formed UTF-8 (no surrogates, nothing beyond U+10FFFF).
