@@ -26,6 +26,16 @@ inline Rows rowsOf(const PropertyValue& value)
     return rows;
 }
 
+// The rows of each element of a list.
+inline std::vector<Rows> recordsOf(const PropertyValue& list)
+{
+    std::vector<Rows> all;
+    if (const PropertyArray* array = list.asArray())
+        for (const PropertyValue& element : *array)
+            all.push_back(rowsOf(element));
+    return all;
+}
+
 // A section with a display of its own, as if a template had given it one.
 template <typename SectionUnderTest>
 class SectionTest : public ::testing::Test
@@ -59,13 +69,29 @@ protected:
     }
     [[nodiscard]] Rows rows() const { return rowsOf(display); }
     // The rows of each element of a list section.
-    [[nodiscard]] std::vector<Rows> records() const
+    [[nodiscard]] std::vector<Rows> records() const { return recordsOf(display); }
+
+    // Every cut of the packet below `minimum` bytes leaves the display as it is, and says nothing.
+    void expectShorterIsIgnored(std::uint32_t code, const Bytes& packet, std::size_t minimum)
     {
-        std::vector<Rows> all;
-        if (const PropertyArray* array = display.asArray())
-            for (const PropertyValue& element : *array)
-                all.push_back(rowsOf(element));
-        return all;
+        const PropertyValue before = display.deepCopy();
+        services.log.lines.clear();
+        for (std::size_t size = 0; size < minimum; ++size) {
+            sendCut(code, packet, size);
+            EXPECT_EQ(display.description(), before.description()) << code << " cut to " << size;
+        }
+        EXPECT_EQ(services.log.errors(), std::vector<std::string>()) << code;
+    }
+    // Another code leaves the display as it is and is reported by its number.
+    void expectReported(std::uint32_t code)
+    {
+        const PropertyValue before = display.deepCopy();
+        services.log.lines.clear();
+        send(code, PacketBuilder(code, 64));
+        EXPECT_EQ(
+            services.log.errors(),
+            std::vector<std::string>({"Received an unknown log message: " + std::to_string(code)}));
+        EXPECT_EQ(display.description(), before.description());
     }
 
     TestServices services;
