@@ -1,5 +1,6 @@
 #include "platform/qt/QtEventLoop.h"
 
+#include <QAbstractEventDispatcher>
 #include <QCoreApplication>
 #include <QTimer>
 
@@ -74,6 +75,12 @@ bool QtEventLoop::runUntil(const std::function<bool()>& done, std::chrono::milli
     alarm.setTimerType(Qt::PreciseTimer);
     alarm.start(std::clamp(timeout, std::chrono::milliseconds{0},
                            std::chrono::milliseconds{std::chrono::hours(24)}));
+    // Not every kind of dispatcher returns after the tasks that made `done` true.
+    auto* dispatcher = QAbstractEventDispatcher::instance();
+    QObject::connect(dispatcher, &QAbstractEventDispatcher::aboutToBlock, &alarm, [&] {
+        if (done())
+            dispatcher->wakeUp();
+    });
     while (!done() && alarm.isActive())
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
     return done();
