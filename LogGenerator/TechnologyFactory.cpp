@@ -1,3 +1,6 @@
+#include "LogGenerator/C2K/C2KLogGenerator.h"
+#include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
 #include "platform/TelephonyServer.h"
@@ -14,7 +17,10 @@ struct Technology {
 };
 
 constexpr Technology kTechnologies[] = {
-    {kTSLogChannelTechnology_Varnel_LTE, LTELogGenerator::generator},
+    {kTSLogChannelTechnology_IFX,         GSMLogGenerator::generator    },
+    {kTSLogChannelTechnology_Varnel_GSM,  VRN_GSMLogGenerator::generator},
+    {kTSLogChannelTechnology_Varnel_CDMA, C2KLogGenerator::generator    },
+    {kTSLogChannelTechnology_Varnel_LTE,  LTELogGenerator::generator    },
 };
 
 } // namespace

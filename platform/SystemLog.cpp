@@ -18,7 +18,8 @@ std::string_view withoutNewline(std::string_view text)
     return text.ends_with('\n') ? text.substr(0, text.size() - 1) : text;
 }
 
-void logFormatted(LogPriority priority, const char* format, std::va_list arguments)
+[[gnu::format(printf, 2, 0)]] void logFormatted(LogPriority priority, const char* format,
+                                                std::va_list arguments)
 {
     SystemLog& log = Services::current().log();
     if (!log.accepts(priority))
