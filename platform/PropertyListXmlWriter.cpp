@@ -15,6 +15,9 @@ namespace
 
 constexpr std::size_t kBytesADataLine = 48; // 64 characters
 
+// No line is indented further, so that a list of many deep values does not become mostly tabs.
+constexpr std::size_t kIndentLimit = 32;
+
 // How a character stands in a text: null for as it is, empty for not at all.
 using Escapes = std::array<const char*, 256>;
 
@@ -74,7 +77,7 @@ private:
     bool writeLine(std::string_view line);
     bool openContainer(const char* element);
     void closeContainer(const char* element);
-    void indent() { _text.append(_depth, '\t'); }
+    void indent() { _text.append(std::min(_depth, kIndentLimit), '\t'); }
 
     std::string _text;
     std::size_t _depth = 0;

@@ -156,6 +156,13 @@ TEST(PropertyListXmlWriterTest, NestingIsWrittenUpToTheLimit)
     }
 }
 
+TEST(PropertyListXmlWriterTest, IndentationEndsAt32Tabs)
+{
+    const std::string text = *writeXmlPropertyList(nested(40, false));
+    EXPECT_NE(text.find("\n" + std::string(32, '\t') + "<array/>\n"), std::string::npos);
+    EXPECT_EQ(text.find(std::string(33, '\t')), std::string::npos);
+}
+
 TEST(PropertyListXmlWriterTest, ContainerThatHoldsItselfIsNotWritten)
 {
     const PropertyValue array = PropertyValue::newArray();
