@@ -5,6 +5,7 @@
 
 #include <optional>
 #include <span>
+#include <type_traits>
 #include <vector>
 
 namespace orvane
@@ -33,13 +34,19 @@ private:
 };
 
 // Calls `visit` with each record in order, as far as the packet goes: the walk stops at the first
-// that is not whole, that is, of which any of the `wholeBytes` bytes is missing.
-template <typename Visit>
-void forEachWholeRecord(const Records& records, std::size_t wholeBytes, Visit visit)
+// that is not whole, that is, of which any of the `wholeBytes` bytes is missing. Where that depends
+// on what a record holds, `wholeBytes` is a function of the record.
+template <typename WholeBytes, typename Visit>
+void forEachWholeRecord(const Records& records, WholeBytes wholeBytes, Visit visit)
 {
     for (std::size_t i = 0; i < records.count(); ++i) {
         const PacketView record = records.at(i);
-        if (!record.holds(0, wholeBytes))
+        std::size_t needed = 0;
+        if constexpr (std::is_invocable_v<WholeBytes, PacketView>)
+            needed = wholeBytes(record);
+        else
+            needed = wholeBytes;
+        if (!record.holds(0, needed))
             break;
         visit(record);
     }

@@ -1,7 +1,17 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/GSM/PDPContextList.h"
+#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
+#include "LogGenerator/LTE/DetectedCells.h"
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
+#include "LogGenerator/LTE/MeasuredNeighborCells.h"
+#include "LogGenerator/LTE/NeighborCellsList.h"
+#include "LogGenerator/LTE/NeighborMeasurementMisc.h"
+#include "LogGenerator/LTE/ReselectionCandidatesList.h"
+#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
+#include "LogGenerator/LTE/ServingCellMeasurement.h"
 
 namespace orvane
 {
@@ -15,6 +25,16 @@ public:
 
 private:
     std::unique_ptr<LTEServingCellInfo> objLTEServingCellInfo;
+    std::unique_ptr<ConnectedModeMeasurementMisc> objConnectedModeMeasurementMisc;
+    std::unique_ptr<MeasuredNeighborCells> objMeasuredNeighborCells;
+    std::unique_ptr<DetectedCells> objDetectedCells;
+    std::unique_ptr<ServingCellMeasurement> objServingCellMeasurement;
+    std::unique_ptr<NeighborMeasurementMisc> objNeighborMeasurementMisc;
+    std::unique_ptr<NeighborCellsList> objNeighborCellsList;
+    std::unique_ptr<ReselectionCandidatesMisc> objReselectionCandidatesMisc;
+    std::unique_ptr<ReselectionCandidatesList> objReselectionCandidatesList;
+    std::unique_ptr<SimInfo> objSimInfo;
+    std::unique_ptr<PDPContextList> objPDPContextList;
 };
 
 } // namespace orvane

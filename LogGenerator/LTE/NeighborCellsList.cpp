@@ -1,0 +1,85 @@
+#include "LogGenerator/LTE/NeighborCellsList.h"
+
+#include "LogGenerator/Formats.h"
+#include "LogGenerator/LTE/LTEFormats.h"
+#include "LogGenerator/LTE/LogCodes.h"
+#include "platform/Services.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr Field kIdentity = bitsField("Physical Cell ID", 0, 0, 9, decimal);
+constexpr Field kMeasuredRssi = bitsField("Measured RSSI", 1, 1, 8, rssiHalfDb);
+constexpr Field kMeasuredRsrp = bitsField("Measured RSRP", 2, 1, 9, rsrpHalfDb);
+constexpr Field kAverageRsrp = bitsField("Average RSRP", 4, 0, 9, rsrpHalfDb);
+constexpr Field kMeasuredRsrq = bitsField("Measured RSRQ", 5, 1, 7, rsrqQuarterDb);
+constexpr Field kAverageRsrq = bitsField("Average RSRQ", 6, 0, 7, rsrqQuarterDb);
+
+constexpr Field kCellFields[] = {
+    kIdentity,
+    kMeasuredRssi,
+    kMeasuredRsrp,
+    kAverageRsrp,
+    kMeasuredRsrq,
+    kAverageRsrq,
+    bitsField("Srxlev", 6, 7, 7, minus30),
+    bytesField("Frequency Offset", 8, 2, decimal),
+    bitsField("Ant 0 Frame Offset", 12, 0, 11, decimal),
+    bitsField("Ant 0 Sample Offset", 13, 3, 19, decimal),
+    // The second antenna repeats the first one's numbers. This is meant.
+    bitsField("Ant 1 Frame Offset", 12, 0, 11, decimal),
+    bitsField("Ant 1 Sample Offset", 13, 3, 19, decimal),
+};
+
+// The packet carries one less than there are, so that there is always a cell.
+std::size_t cellCount(PacketView packet) { return packet.bitsAt(19, 6, 5).value_or(0) + 1; }
+
+constexpr RecordLayout kCells = {cellCount, startAt<21>, 20, kCellFields};
+
+constexpr PacketLayout kPackets[] = {
+    recordsPacket(kLteNeighborMeasurementCode, 21, kCells),
+};
+
+constexpr const char* kName = "Neighbor Cells List";
+constexpr SectionLayout kLayout = {kName, kName, UnknownCode::Report, kPackets};
+
+struct LoggedLevel {
+    Field field;
+    double (*decibels)(std::int64_t raw);
+};
+constexpr LoggedLevel kLoggedLevels[] = {
+    {kMeasuredRssi, halfDecibelPower     },
+    {kMeasuredRsrp, halfDecibelPower     },
+    {kAverageRsrp,  halfDecibelPower     },
+    {kMeasuredRsrq, quarterDecibelQuality},
+    {kAverageRsrq,  quarterDecibelQuality},
+};
+
+void logCell(PacketView record)
+{
+    logWarning("Physical Cell ID: %d\n", static_cast<int>(kIdentity.valueIn(record).value_or(0)));
+    // Every level is called the RSSI. This is meant.
+    for (const LoggedLevel& level : kLoggedLevels)
+        logWarning("Measured RSSI: %lf\n", level.decibels(level.field.valueIn(record).value_or(0)));
+}
+
+} // namespace
+
+NeighborCellsList::NeighborCellsList() : ListSection(kLayout) {}
+
+std::vector<PropertyValue> NeighborCellsList::elements(PacketView packet,
+                                                       const PacketLayout& layout)
+{
+    if (Services::current().log().accepts(LogPriority::Warning)) {
+        const Records cells = kCells.in(packet);
+        logWarning("Number of neighboring cells being reported: %d\n",
+                   static_cast<int>(cells.count()));
+        forEachWholeRecord(cells, bytesRead(kCellFields), logCell);
+    }
+    return ListSection::elements(packet, layout);
+}
+
+} // namespace orvane

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "LogGenerator/Section.h"
+
+namespace orvane
+{
+
+// "Reselection Candidates List": the candidates, each with the fields of its technology.
+class ReselectionCandidatesList final : public ListSection
+{
+public:
+    ReselectionCandidatesList();
+
+private:
+    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+};
+
+} // namespace orvane
