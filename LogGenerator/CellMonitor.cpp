@@ -64,11 +64,12 @@ void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
                    std::span<const CellRow> cellRows)
 {
     for (const CellRow& cellRow : cellRows) {
-        const auto number = cellNumber(cell, cellRow.key);
-        if (!number)
+        if (const auto number = cellNumber(cell, cellRow.key)) {
+            if (auto text = cellRow.format(*number))
+                setRow(rows, cellRow.row, std::move(*text));
+        } else if (cellRow.failure) {
             logError("%s", cellRow.failure);
-        else if (auto text = cellRow.format(*number))
-            setRow(rows, cellRow.row, std::move(*text));
+        }
     }
 }
 

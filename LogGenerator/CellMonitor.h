@@ -30,7 +30,7 @@ std::optional<std::int32_t> cellNumber(const PropertyValue& cell, const char* ke
 struct CellRow {
     const char* key;
     const char* row;
-    const char* failure; // logged at error priority when there is no such number
+    const char* failure; // logged at error priority when there is no such number; may be null
     Format format = decimal;
 };
 

@@ -3,6 +3,7 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "platform/TelephonyServer.h"
 
 namespace orvane
@@ -17,10 +18,11 @@ struct Technology {
 };
 
 constexpr Technology kTechnologies[] = {
-    {kTSLogChannelTechnology_IFX,         GSMLogGenerator::generator    },
-    {kTSLogChannelTechnology_Varnel_GSM,  VRN_GSMLogGenerator::generator},
-    {kTSLogChannelTechnology_Varnel_CDMA, C2KLogGenerator::generator    },
-    {kTSLogChannelTechnology_Varnel_LTE,  LTELogGenerator::generator    },
+    {kTSLogChannelTechnology_IFX,           GSMLogGenerator::generator    },
+    {kTSLogChannelTechnology_Varnel_GSM,    VRN_GSMLogGenerator::generator},
+    {kTSLogChannelTechnology_Varnel_CDMA,   C2KLogGenerator::generator    },
+    {kTSLogChannelTechnology_Varnel_LTE,    LTELogGenerator::generator    },
+    {kTSLogChannelTechnology_Varnel_UTRAN2, UTRANLogGenerator::generator  },
 };
 
 } // namespace

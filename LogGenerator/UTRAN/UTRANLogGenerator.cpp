@@ -1,0 +1,47 @@
+#include "LogGenerator/UTRAN/UTRANLogGenerator.h"
+
+#include "LogGenerator/UTRAN/UTRANClassIndex.h"
+#include "platform/Services.h"
+
+#include <algorithm>
+#include <filesystem>
+
+namespace orvane
+{
+
+namespace
+{
+
+// The whole path counts, folders included. This is meant.
+bool isUtranPath(const std::string& path)
+{
+    constexpr std::string_view kWord = "UTRAN";
+    const auto equalsRegardlessOfCase = [](char inPath, char inWord) {
+        return inPath == inWord || inPath == inWord - 'A' + 'a';
+    };
+    return std::search(path.begin(), path.end(), kWord.begin(), kWord.end(),
+                       equalsRegardlessOfCase) != path.end();
+}
+
+} // namespace
+
+void UTRANLogGenerator::init()
+{
+    const std::vector<std::string> paths = Services::current().resources().pathsOfType("plist");
+    const auto path = std::find_if(paths.begin(), paths.end(), isUtranPath);
+    // Without a template the base is not initialised, and nothing is said. This is meant.
+    if (path == paths.end())
+        return;
+    initWithPListName(std::filesystem::path(*path).stem().string(),
+                      std::make_shared<UTRANClassIndex>());
+    logError("Created UTRANLogGenerator object");
+}
+
+std::unique_ptr<LogGenerator> UTRANLogGenerator::generator()
+{
+    auto generator = std::make_unique<UTRANLogGenerator>();
+    generator->init();
+    return generator;
+}
+
+} // namespace orvane
