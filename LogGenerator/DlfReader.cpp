@@ -1,0 +1,194 @@
+#include "LogGenerator/DlfReader.h"
+
+#include "LogGenerator/DlfTime.h"
+#include "LogGenerator/PacketView.h"
+
+#include <algorithm>
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr std::size_t kHeaderBytes = 12;
+constexpr std::uint8_t kModemType = 1;
+constexpr std::uint8_t kServerType = 0xFF;
+constexpr std::uint8_t kWrapper = 0x81;
+constexpr std::uint16_t kFirstModemCode = 0x1000;
+constexpr std::uint64_t kHour = 3600 * kDlfStepsPerSecond;
+constexpr std::uint64_t kMonth = 30 * 24 * kHour;
+
+bool isType(std::optional<std::uint64_t> byte) { return byte == kModemType || byte == kServerType; }
+
+// Nothing before March 1980, the time of a clock that was never set: small numbers are common in
+// payloads. Nothing after 2150: the bytes of an erased block all look alike.
+constexpr std::uint64_t kFirstTimely = std::uint64_t{1} << 48;
+constexpr std::uint64_t kFirstFuture = std::uint64_t{0x400} << 48;
+
+bool areWithin(std::uint64_t steps, std::uint64_t one, std::uint64_t other)
+{
+    const std::uint64_t a = one >> 16;
+    const std::uint64_t b = other >> 16;
+    return one < kFirstFuture && other < kFirstFuture && (a < b ? b - a : a - b) <= steps;
+}
+
+} // namespace
+
+// An item that fits at its place, with what stands between it and the item before.
+struct DlfReader::Start {
+    std::size_t position;
+    std::size_t length;
+    std::size_t separators;
+    std::uint64_t timestamp;
+    std::uint16_t code;
+    std::uint8_t type;
+
+    [[nodiscard]] std::size_t end() const { return position + length; }
+};
+
+std::optional<DlfReader::Start> DlfReader::fitting(std::size_t from, std::size_t separators,
+                                                   std::uint64_t type) const
+{
+    const PacketView bytes(_file);
+    const std::size_t position = from + separators;
+    if (!bytes.holds(position, kHeaderBytes))
+        return std::nullopt;
+    const auto length = static_cast<std::size_t>(*bytes.unsignedAt(position, 2));
+    const auto code = static_cast<std::uint16_t>(*bytes.unsignedAt(position + 2, 2));
+    if (length < kHeaderBytes || code == 0 || !bytes.holds(position, length))
+        return std::nullopt;
+    const std::uint64_t timestamp = *bytes.unsignedAt(position + 4, 8);
+    return Start{position, length, separators, timestamp, code, static_cast<std::uint8_t>(type)};
+}
+
+// The first that passes of the ways to read an item at one place: without a separator, behind a
+// type byte, behind a wrapper, behind what is left of a wrapper.
+template <typename Test>
+std::optional<DlfReader::Start> DlfReader::firstStart(std::size_t from, bool followsItem,
+                                                      const Test& test) const
+{
+    const PacketView bytes(_file);
+    const auto accepted = [&](std::size_t separators, std::uint64_t type) {
+        std::optional<Start> start = fitting(from, separators, type);
+        if (start && !test(*start))
+            start.reset();
+        return start;
+    };
+    if (auto start = accepted(0, kModemType))
+        return start;
+    const auto first = bytes.unsignedAt(from, 1);
+    if (isType(first))
+        if (auto start = accepted(1, *first))
+            if (followsItem || first != kServerType || start->code < kFirstModemCode)
+                return start;
+    if (first == kWrapper)
+        if (const auto third = bytes.unsignedAt(from + 2, 1); isType(third))
+            if (auto start = accepted(3, *third))
+                return start;
+    if (followsItem)
+        if (const auto second = bytes.unsignedAt(from + 1, 1); isType(second))
+            return accepted(2, *second);
+    return std::nullopt;
+}
+
+bool DlfReader::isTimely(const Start& start) const
+{
+    if (start.timestamp < kFirstTimely)
+        return false;
+    // Equal ones may be the same bytes twice, in a payload that repeats itself.
+    const auto comesNext = [&](const Start& follower) {
+        return start.timestamp != follower.timestamp &&
+               areWithin(kHour, start.timestamp, follower.timestamp);
+    };
+    return firstStart(start.end(), true, comesNext).has_value();
+}
+
+bool DlfReader::isVouchedFor(const Start& start) const
+{
+    return (_clock == 0 || areWithin(kMonth, _clock, start.timestamp)) && isTimely(start);
+}
+
+bool DlfReader::hasVouchedStart(std::size_t from, std::size_t end)
+{
+    while (!_vouchedStarts.empty() && _vouchedStarts.front() < _cursor)
+        _vouchedStarts.pop_front();
+    for (_searchedTo = std::max(_searchedTo, _cursor); _searchedTo < end; ++_searchedTo) {
+        const auto start = fitting(_searchedTo, 0, kModemType);
+        if (start && isVouchedFor(*start))
+            _vouchedStarts.push_back(_searchedTo);
+    }
+    const auto found = std::lower_bound(_vouchedStarts.begin(), _vouchedStarts.end(), from);
+    return found != _vouchedStarts.end() && *found < end;
+}
+
+bool DlfReader::isSound(const Start& start)
+{
+    return isVouchedFor(start) || !hasVouchedStart(start.position + 1, start.end());
+}
+
+bool DlfReader::isFollowed(const Start& start)
+{
+    if (start.end() == _file.size())
+        return true;
+    const auto follows = [&](const Start& follower) {
+        return areWithin(kHour, start.timestamp, follower.timestamp) || isSound(follower);
+    };
+    return firstStart(start.end(), true, follows).has_value();
+}
+
+std::optional<DlfReader::Start> DlfReader::startHere()
+{
+    const auto isVouched = [&](const Start& start) { return isVouchedFor(start); };
+    const auto goesOn = [&](const Start& start) {
+        return areWithin(kHour, _lastTimestamp, start.timestamp) && isFollowed(start);
+    };
+    const auto fits = [&](const Start& start) { return isSound(start) && isFollowed(start); };
+
+    auto start = firstStart(_cursor, _followsItem, isVouched);
+    if (!start && _followsItem)
+        start = firstStart(_cursor, true, goesOn);
+    if (!start)
+        start = firstStart(_cursor, _followsItem, fits);
+    if (start && isTimely(*start))
+        _clock = start->timestamp;
+    return start;
+}
+
+DlfItem DlfReader::place(const Start& start)
+{
+    _separators += start.separators;
+    _placed += start.length;
+    _cursor = start.end();
+    _followsItem = true;
+    _lastTimestamp = start.timestamp;
+    return {start.position, start.code, start.timestamp,
+            _file.subspan(start.position, start.length), start.type};
+}
+
+void DlfReader::passUnplacedByte()
+{
+    const bool goesOn = _unplaced > 0 && !_followsItem;
+    if (!goesOn)
+        ++_rangeCount;
+    if (_rangeCount <= kMaxUnplacedRanges) {
+        if (!goesOn)
+            _ranges.push_back({_cursor, 0});
+        ++_ranges.back().length;
+    }
+    ++_unplaced;
+    ++_cursor;
+    _followsItem = false;
+}
+
+std::optional<DlfItem> DlfReader::next()
+{
+    while (_cursor < _file.size()) {
+        if (const std::optional<Start> start = startHere())
+            return place(*start);
+        passUnplacedByte();
+    }
+    return std::nullopt;
+}
+
+} // namespace orvane

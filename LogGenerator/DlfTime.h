@@ -1,0 +1,23 @@
+#pragma once
+
+#include <cstdint>
+
+namespace orvane
+{
+
+// Timestamps of diagnostic log items: the upper 48 bits count steps of 1.25 ms since 1980-01-06
+// 00:00:00 UTC, the lower 16 bits are a fraction of one step (1/65536 each). Leap seconds are not
+// applied, neither here nor by those who read the result.
+
+// Whole steps in one second.
+constexpr std::uint64_t kDlfStepsPerSecond = 800;
+
+// Seconds since 1970-01-01 00:00:00 UTC.
+[[nodiscard]] double dlfSecondsSince1970(std::uint64_t timestamp);
+
+// The inverse, to the nearest fraction. A time that is a whole step as near as a double can say it
+// becomes that step with fraction 0. Times before 1980-01-06, and what is no number, become 0;
+// times beyond the last timestamp become that one.
+[[nodiscard]] std::uint64_t dlfTimestamp(double secondsSince1970);
+
+} // namespace orvane
