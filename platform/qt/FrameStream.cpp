@@ -272,8 +272,10 @@ bool FrameStream::waitUntil(const std::function<bool()>& done, std::chrono::mill
     while (!isDone && !isLate && _socket && !_ended && !_abandoned &&
            _heldBytes < kHeldBytesLimit) {
         if (!_writeBlocked)
-            flush();                             // what callbacks have sent
-        isLate = SteadyClock::now() >= deadline; // what is there already still counts
+            flush(); // what callbacks have sent meanwhile
+
+        // What is there already still counts, however late it is.
+        isLate = SteadyClock::now() >= deadline;
         const short events = waitForEvents(deadline);
         if ((events & POLLOUT) != 0)
             flush();
