@@ -1,0 +1,91 @@
+#include "telephonyd/DaemonOptions.h"
+
+#include "platform/TelephonyServer.h"
+
+#include <gmock/gmock.h>
+
+namespace orvane
+{
+namespace
+{
+
+using testing::HasSubstr;
+
+DaemonOptions parsed(std::vector<std::string> arguments)
+{
+    const std::vector<std::string> scenarios = {"lte", "other"};
+    return parseDaemonOptions(arguments, scenarios);
+}
+
+TEST(DaemonOptionsTest, ASimulatedPhoneIsLteUnlessNamed)
+{
+    EXPECT_EQ(parsed({"--demo"}).demo, "lte");
+    EXPECT_EQ(parsed({"--demo=other"}).demo, "other");
+    EXPECT_FALSE(parsed({"--demo"}).error);
+    EXPECT_FALSE(parsed({"--demo"}).replay);
+}
+
+TEST(DaemonOptionsTest, ARecordingIsSentAtItsOwnPaceOnceUnlessSaid)
+{
+    const DaemonOptions plain = parsed({"--replay", "a.dlf"});
+    EXPECT_FALSE(plain.error);
+    EXPECT_EQ(plain.replay, "a.dlf");
+    EXPECT_EQ(plain.speed, 1.0);
+    EXPECT_FALSE(plain.loops);
+    EXPECT_FALSE(plain.technology);
+    EXPECT_TRUE(plain.log);
+
+    const DaemonOptions full = parsed({"--replay=a.dlf", "--loop", "--speed", "2.5", "--technology",
+                                       "umts", "--ports", "/tmp/x", "--log", "none"});
+    EXPECT_FALSE(full.error);
+    EXPECT_EQ(full.speed, 2.5);
+    EXPECT_TRUE(full.loops);
+    EXPECT_EQ(full.technology, kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(full.ports, "/tmp/x");
+
+    EXPECT_FALSE(parsed({"--replay=a.dlf", "--speed=max"}).speed);
+    EXPECT_EQ(parsed({"--replay=a.dlf", "--speed=0.001"}).speed, 0.001);
+    EXPECT_EQ(parsed({"--replay=a.dlf", "--speed=1000"}).speed, 1000.0);
+}
+
+TEST(DaemonOptionsTest, MistakesAreNamedWithWhatToDo)
+{
+    const struct {
+        std::vector<std::string> arguments;
+        const char* error;
+    } cases[] = {
+        {{},                                 "give --demo=SCENARIO or --replay FILE"                    },
+        {{"--demo", "--replay=x"},           "exclude each other: give one"                             },
+        {{"--demo=nope"},                    "--demo takes lte, other"                                  },
+        {{"--demo", "--loop"},               "--loop is for a recording"                                },
+        {{"--demo", "--speed=1"},            "--speed is for a recording"                               },
+        {{"--demo", "--technology=lte"},     "--technology is for a recording"                          },
+        {{"--replay="},                      "--replay needs the name of a recording"                   },
+        {{"--replay=x", "--speed=0"},        "--speed takes a number from 0.001 to 1000"                },
+        {{"--replay=x", "--speed=1000.5"},   "or max, not \"1000.5\""                                   },
+        {{"--replay=x", "--speed="},         "or max, not \"\""                                         },
+        {{"--replay=x", "--speed=nan"},      "or max, not \"nan\""                                      },
+        {{"--replay=x", "--technology=gsm"}, "--technology takes lte, umts"                             },
+        {{"--demo", "--ports="},             "--ports needs the name of a directory"                    },
+        {{"--demo", "--log=file"},           "--log takes"                                              },
+        {{"--demo", "--log-level=loud"},     "--log-level takes"                                        },
+        {{"--demo", "x.dlf"},                "\"x.dlf\" is no option: give a recording as --replay FILE"},
+        {{"--demos"},                        "unknown option --demos"                                   },
+    };
+    for (const auto& each : cases)
+        EXPECT_THAT(parsed(each.arguments).error.value_or("no error"), HasSubstr(each.error));
+}
+
+TEST(DaemonOptionsTest, HelpAndVersionNeedNothingElse)
+{
+    EXPECT_TRUE(parsed({"--help", "x"}).wantsHelp);
+    EXPECT_TRUE(parsed({"--version"}).wantsVersion);
+    EXPECT_FALSE(parsed({"--version"}).error);
+    const std::vector<std::string> scenarios = {"lte", "other"};
+    for (const char* option : {"--demo", "--replay", "--technology", "--speed", "--loop", "--ports",
+                               "--log ", "--log-level", "lte, other"})
+        EXPECT_THAT(daemonHelp(scenarios), HasSubstr(option));
+}
+
+} // namespace
+} // namespace orvane

@@ -1,0 +1,75 @@
+#include "telephonyd/ReplayTechnology.h"
+
+#include "platform/FileSystem.h"
+#include "platform/TelephonyServer.h"
+#include "support/Recording.h"
+
+#include <gmock/gmock.h>
+
+namespace orvane
+{
+namespace
+{
+
+using testing::IsEmpty;
+
+Bytes fileOf(std::initializer_list<std::uint16_t> codes)
+{
+    Bytes file;
+    for (const std::uint16_t code : codes) {
+        Bytes item(20);
+        item[0] = 20;
+        item[2] = static_cast<std::uint8_t>(code & 0xFF);
+        item[3] = static_cast<std::uint8_t>(code >> 8);
+        item[9] = 1; // of the timestamp
+        file.insert(file.end(), item.begin(), item.end());
+    }
+    return file;
+}
+
+TEST(ReplayTechnologyTest, TheCodesOfARecordingTellItsTechnology)
+{
+    EXPECT_EQ(technologyOfLog(fileOf({0x1FFD, 0xB0C2})), kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(technologyOfLog(fileOf({0x1111, 0x2222, 0xB17F, 0x3333})),
+              kTSLogChannelTechnology_Varnel_LTE);
+}
+
+TEST(ReplayTechnologyTest, ARealDriveIsRecognised)
+{
+    const auto file = readFile(ORVANE_TEST_DATA "/lte-drive.dlf");
+    ASSERT_TRUE(file);
+    EXPECT_EQ(technologyOfLog(*file), kTSLogChannelTechnology_Varnel_LTE);
+}
+
+TEST(ReplayTechnologyTest, CodesThatNoGeneratorKnowsTellNothing)
+{
+    EXPECT_FALSE(technologyOfLog({}));
+    EXPECT_FALSE(technologyOfLog(fileOf({0x1FFD})));
+    EXPECT_FALSE(technologyOfLog(fileOf({0x1FFD, 0x1111, 0x2222})));
+    EXPECT_FALSE(technologyOfLog(Bytes(100, 0xAB)));
+}
+
+TEST(ReplayTechnologyTest, AskingLeavesNoLines)
+{
+    TestServices services;
+    EXPECT_TRUE(technologyOfLog(fileOf({0xB0C2})));
+    EXPECT_THAT(services.log.lines, IsEmpty());
+    EXPECT_THAT(services.console.lines, IsEmpty());
+    logError("afterwards lines are taken again");
+    EXPECT_EQ(services.log.lines.size(), 1U);
+}
+
+TEST(ReplayTechnologyTest, TechnologiesHaveNames)
+{
+    EXPECT_EQ(technologyNamed("lte"), kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(technologyNamed("umts"), kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(technologyNamed("utran"), kTSLogChannelTechnology_Varnel_UTRAN2);
+    EXPECT_EQ(technologyNamed("cdma"), kTSLogChannelTechnology_Varnel_CDMA);
+    EXPECT_EQ(technologyNamed("cellmonitor"), kTSLogChannelTechnology_IFX);
+    EXPECT_FALSE(technologyNamed("gsm"));
+    EXPECT_FALSE(technologyNamed(""));
+    EXPECT_EQ(technologyNames(), "lte, umts, utran, cdma, cellmonitor");
+}
+
+} // namespace
+} // namespace orvane
