@@ -15,7 +15,7 @@
 #include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
 #include "telephonyd/LogServer.h"
-#include "telephonyd/phone/PhoneSource.h"
+#include "telephonyd/phone/Scenarios.h"
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 
@@ -23,7 +23,6 @@
 #include <cstdlib>
 #include <exception>
 #include <filesystem>
-#include <random>
 #include <stdexcept>
 #include <unistd.h>
 
@@ -55,11 +54,7 @@ public:
 private:
     struct Parts {
         Parts(const std::string& directory, MainQueue& queue, const std::string& scenario)
-            : transport(directory),
-              server(transport, queue, [&queue, scenario]() -> std::unique_ptr<LogSource> {
-                  return std::make_unique<PhoneSource>(
-                      queue, makeScenario(scenario, std::random_device()()));
-              })
+            : transport(directory), server(transport, queue, phoneSourceFactory(scenario, queue))
         {
         }
         QtFrameTransport transport;
