@@ -1,0 +1,34 @@
+#include "LogGenerator/GSM/CodingScheme.h"
+
+#include "LogGenerator/support/SectionTest.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+using CodingSchemeTest = SectionTest<CodingScheme>;
+
+} // namespace
+
+TEST_F(CodingSchemeTest, ListsItsNameAndNoCodes)
+{
+    EXPECT_EQ(section.getSectionName(), "Coding Scheme");
+    EXPECT_THAT(section.getLogCodeArray(), IsEmpty());
+    EXPECT_EQ(section.subtreeType(), PropertyValue::Type::Dictionary);
+}
+
+TEST_F(CodingSchemeTest, LogsTheTextOfTheCellChangeCountersAndNothingElse)
+{
+    const PropertyValue before = display.deepCopy();
+    send(0x4005, PacketBuilder(0x4005, 64));
+    EXPECT_EQ(display, before);
+    EXPECT_THAT(services.log.lines,
+                ElementsAre(RecordingLog::Line{LogPriority::Warning, "CellChangeCounters"}));
+}
+
+} // namespace orvane

@@ -1,0 +1,64 @@
+#include "LogGenerator/GSM/DetectedSet.h"
+
+#include "LogGenerator/support/SectionTest.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+constexpr std::uint32_t kCode = 0x417A;
+
+using DetectedSetTest = SectionTest<DetectedSet>;
+
+} // namespace
+
+TEST_F(DetectedSetTest, ListsItsNameAndCode)
+{
+    EXPECT_EQ(section.getSectionName(), "Detected Set");
+    EXPECT_THAT(section.getLogCodeArray(), ElementsAre(kCode));
+}
+
+TEST_F(DetectedSetTest, StaysEmptyWhateverTheSetsOfThePacketsCells)
+{
+    for (std::uint32_t set = 0; set < 8; ++set) {
+        display.asArray()->append("earlier");
+        send(kCode, PacketBuilder(kCode, 16 + 15 + 44).put8(15, 1).put16(16 + 7, 5 | set << 13));
+        EXPECT_TRUE(display.asArray()->empty()) << set;
+    }
+    EXPECT_THAT(services.log.errors(), IsEmpty());
+    EXPECT_EQ(services.log.warnings(), std::vector<std::string>(8, "DetectedSet"));
+}
+
+TEST_F(DetectedSetTest, ACountOfZeroEmptiesTheList)
+{
+    display.asArray()->append("earlier");
+    send(kCode, PacketBuilder(kCode, 16));
+    EXPECT_TRUE(display.asArray()->empty());
+}
+
+TEST_F(DetectedSetTest, ACountBeyondThePacketIsHarmless)
+{
+    display.asArray()->append("earlier");
+    send(kCode, PacketBuilder(kCode, 16).put8(15, 255));
+    EXPECT_TRUE(display.asArray()->empty());
+}
+
+TEST_F(DetectedSetTest, ShortPacketLeavesTheEarlierList)
+{
+    display.asArray()->append("earlier");
+    expectShorterIsIgnored(kCode, PacketBuilder(kCode, 16), 16);
+    EXPECT_EQ(display.asArray()->size(), 1U);
+}
+
+TEST_F(DetectedSetTest, OtherCodesAreReported)
+{
+    display.asArray()->append("earlier");
+    expectReported(0x4005);
+}
+
+} // namespace orvane

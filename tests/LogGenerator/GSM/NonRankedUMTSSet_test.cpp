@@ -1,0 +1,34 @@
+#include "LogGenerator/GSM/NonRankedUMTSSet.h"
+
+#include "LogGenerator/support/SectionTest.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+using NonRankedUMTSSetTest = SectionTest<NonRankedUMTSSet>;
+
+} // namespace
+
+TEST_F(NonRankedUMTSSetTest, ListsItsNameAndNoCodes)
+{
+    EXPECT_EQ(section.getSectionName(), "Non-Ranked UMTS Set");
+    EXPECT_THAT(section.getLogCodeArray(), IsEmpty());
+    EXPECT_EQ(section.subtreeType(), PropertyValue::Type::Array);
+}
+
+TEST_F(NonRankedUMTSSetTest, OnlyLogsItsName)
+{
+    const PropertyValue before = display.deepCopy();
+    send(0x4005, PacketBuilder(0x4005, 64));
+    EXPECT_EQ(display, before);
+    EXPECT_THAT(services.log.lines,
+                ElementsAre(RecordingLog::Line{LogPriority::Warning, "NonRankedUMTSSet"}));
+}
+
+} // namespace orvane

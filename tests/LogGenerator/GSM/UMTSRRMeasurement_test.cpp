@@ -1,0 +1,34 @@
+#include "LogGenerator/GSM/UMTSRRMeasurement.h"
+
+#include "LogGenerator/support/SectionTest.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+using UMTSRRMeasurementTest = SectionTest<UMTSRRMeasurement>;
+
+} // namespace
+
+TEST_F(UMTSRRMeasurementTest, ListsItsNameAndNoCodes)
+{
+    EXPECT_EQ(section.getSectionName(), "UMTS RR Measurement");
+    EXPECT_THAT(section.getLogCodeArray(), IsEmpty());
+    EXPECT_EQ(section.subtreeType(), PropertyValue::Type::Dictionary);
+}
+
+TEST_F(UMTSRRMeasurementTest, OnlyLogsItsName)
+{
+    const PropertyValue before = display.deepCopy();
+    send(0x4005, PacketBuilder(0x4005, 64));
+    EXPECT_EQ(display, before);
+    EXPECT_THAT(services.log.lines,
+                ElementsAre(RecordingLog::Line{LogPriority::Warning, "UMTSRRMeasurement"}));
+}
+
+} // namespace orvane
