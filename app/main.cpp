@@ -19,6 +19,7 @@
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 
+#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <exception>
@@ -172,6 +173,8 @@ int main(int argc, char** argv)
         return 0;
     }
 
+    // A reader that leaves is seen as an error of the write.
+    std::signal(SIGPIPE, SIG_IGN);
     StandardErrorConsole console;
     DirectoryResources resources(resourceDirectory(ORVANE_SOURCE_RESOURCES));
     Services& services = Services::current();

@@ -56,9 +56,9 @@ protected:
         return std::make_shared<OrvaneModel>(environment, &observer);
     }
     // Starts the model as the shell does.
-    void start(const std::shared_ptr<OrvaneModel>& model)
+    void start(const std::shared_ptr<OrvaneModel>& started)
     {
-        queue.async([model] { model->restartMonitor(); });
+        queue.async([started] { started->restartMonitor(); });
         queue.runPending();
     }
     void startConnected()

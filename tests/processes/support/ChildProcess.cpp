@@ -2,7 +2,6 @@
 
 #include <array>
 #include <cerrno>
-#include <climits>
 #include <csignal>
 #include <cstdlib>
 #include <fcntl.h>
@@ -154,15 +153,19 @@ bool ChildProcess::waitForError(const std::string& text, std::chrono::millisecon
 
 bool ChildProcess::waitForFullOutput(std::chrono::milliseconds timeout) const
 {
+    constexpr int kSteadyChecks = 50;
     const auto deadline = Clock::now() + timeout;
-    const int capacity = ::fcntl(_output, F_GETPIPE_SZ);
     int waiting = 0;
-    while (::ioctl(_output, FIONREAD, &waiting) == 0 && waiting <= capacity - PIPE_BUF) {
-        if (Clock::now() >= deadline)
+    int before = 0;
+    for (int steady = 0; steady < kSteadyChecks && Clock::now() < deadline; ++steady) {
+        if (::ioctl(_output, FIONREAD, &waiting) != 0)
             return false;
-        ::poll(nullptr, 0, 1);
+        if (waiting != before || waiting == 0)
+            steady = 0;
+        before = waiting;
+        ::poll(nullptr, 0, 10);
     }
-    return waiting > capacity - PIPE_BUF;
+    return Clock::now() < deadline;
 }
 
 void ChildProcess::writeLine(const std::string& line)

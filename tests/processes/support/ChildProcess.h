@@ -35,7 +35,8 @@ public:
     bool waitForError(const std::string& text,
                       std::chrono::milliseconds timeout = std::chrono::seconds(30));
 
-    // Waits, without reading, until the pipe at standard output takes no more.
+    // Waits, without reading, until the pipe at standard output of a program that writes without
+    // pause takes no more.
     [[nodiscard]] bool
     waitForFullOutput(std::chrono::milliseconds timeout = std::chrono::seconds(30)) const;
 
