@@ -1,7 +1,10 @@
-// Reading diagnostic logs of 10 MB: plain, as exported, and damaged here and there.
+// Diagnostic logs: reading 10 MB, plain, as exported, and damaged here and there; exporting the
+// history of a busy channel.
 
 #include "LogGenerator/DlfReader.h"
 #include "LogGenerator/DlfTime.h"
+#include "LogGenerator/StateKeys.h"
+#include "LogGenerator/VRNLogGenerator.h"
 
 #include <benchmark/benchmark.h>
 
@@ -59,6 +62,23 @@ void readFile(benchmark::State& state, Kind kind)
     state.SetItemsProcessed(items);
 }
 
+// Five snapshots of 2 MB each.
+void exportHistory(benchmark::State& state)
+{
+    constexpr std::size_t kSnapshotBytes = 2'000'000;
+    const PropertyValue snapshot = PropertyValue::dictionaryOf({
+        {kDisplayStateKey, PropertyValue::data(Bytes(kSnapshotBytes, 1))}
+    });
+    PropertyDictionary model;
+    model.set(kHistoryKey,
+              PropertyValue::arrayOf({snapshot, snapshot, snapshot, snapshot, snapshot}));
+    std::size_t bytes = 0;
+    for (auto _ : state)
+        bytes += VRNLogGenerator::generateDlfFromState(model)->size();
+    state.SetBytesProcessed(static_cast<std::int64_t>(bytes));
+}
+
+BENCHMARK(exportHistory)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(readFile, plain, Kind::Plain)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(readFile, exported, Kind::Exported)->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(readFile, damaged, Kind::Damaged)->Unit(benchmark::kMillisecond);
