@@ -10,7 +10,8 @@ namespace orvane
 {
 
 // The technology constant of the generator that knows most of the recording's items by their log
-// codes; of equals the one with fewer codes of its own. Nothing when none knows any.
+// codes; of equals the one with fewer codes of its own. Nothing when none knows any. Generators
+// that need a template are asked only where the process's resources have it.
 std::optional<std::string> technologyOfLog(ByteView file);
 
 // The technology constant for its name on the command line: "lte", "umts", "utran", "cdma" or

@@ -4,6 +4,7 @@
 #include "platform/qt/QtEventLoop.h"
 #include "platform/qt/QtFrameTransport.h"
 #include "platform/qt/QtMainQueue.h"
+#include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
@@ -97,13 +98,18 @@ int main(int argc, char** argv)
         std::puts("telephonyd " ORVANE_VERSION);
         return 0;
     }
-    Services::current().setLog(options.log.get());
+    // Some generators, who are asked for their log codes, come with their templates only.
+    DirectoryResources resources(resourceDirectory(ORVANE_SOURCE_RESOURCES));
+    Services& services = Services::current();
+    services.setLog(options.log.get());
+    services.setResources(&resources);
     int status = kFailure;
     try {
         status = serve(options);
     } catch (const std::exception& failure) {
         complain(failure.what());
     }
-    Services::current().setLog(nullptr);
+    services.setLog(nullptr);
+    services.setResources(nullptr);
     return status;
 }

@@ -1,6 +1,6 @@
 #include "telephonyd/phone/LTEPackets.h"
 
-#include "telephonyd/phone/PacketWriter.h"
+#include "telephonyd/phone/ModemItem.h"
 
 #include <algorithm>
 #include <cmath>
@@ -17,11 +17,6 @@ constexpr std::uint16_t kMobileNetworkCode = 1;
 constexpr int kTransmitPower = 23; // dBm
 constexpr std::uint32_t kPowerLimitAbsent = 64;
 constexpr std::uint32_t kSearchLimitAbsent = 32;
-
-PhoneMessage modemItem(std::uint16_t code, PacketWriter& writer)
-{
-    return {PhoneMessage::Kind::Modem, code, writer.take()};
-}
 
 // Two scales for power, two for quality: which one a field has depends on its packet.
 std::uint32_t quarterPower(double power) { return rawValue(power, -140, 0.25, 9); }

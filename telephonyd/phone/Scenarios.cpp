@@ -2,6 +2,7 @@
 
 #include "telephonyd/phone/LTEScenario.h"
 #include "telephonyd/phone/PhoneSource.h"
+#include "telephonyd/phone/UTRANScenario.h"
 
 namespace orvane
 {
@@ -21,7 +22,8 @@ struct Entry {
 };
 
 constexpr Entry kScenarios[] = {
-    {"lte", make<LTEScenario>},
+    {"lte",   make<LTEScenario>  },
+    {"utran", make<UTRANScenario>},
 };
 
 } // namespace

@@ -33,15 +33,36 @@ PropertyValue simFiles()
     });
 }
 
+namespace
+{
+
+// From the addresses that are kept for examples.
+std::string exampleAddress(unsigned number)
+{
+    return "192.0.2." + std::to_string(1 + number % 254);
+}
+
+} // namespace
+
 PropertyValue dataConnection(const char* accessPointName, const char* qosClass, unsigned number)
 {
-    // From the addresses that are kept for examples.
-    const std::string address = "192.0.2." + std::to_string(1 + number % 254);
     return PropertyValue::dictionaryOf({
-        {"APN",        accessPointName},
-        {"IP Address", address        },
-        {"State",      "Active"       },
-        {"QCI",        qosClass       },
+        {"APN",        accessPointName       },
+        {"IP Address", exampleAddress(number)},
+        {"State",      "Active"              },
+        {"QCI",        qosClass              },
+    });
+}
+
+PropertyValue packetDataContext(const char* accessPointName, const char* trafficClass,
+                                unsigned accessPointId, unsigned number)
+{
+    return PropertyValue::dictionaryOf({
+        {"APN",           accessPointName              },
+        {"IP Address",    exampleAddress(number)       },
+        {"State",         "Active"                     },
+        {"NSAPI",         std::to_string(accessPointId)},
+        {"Traffic Class", trafficClass                 },
     });
 }
 

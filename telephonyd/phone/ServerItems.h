@@ -20,4 +20,8 @@ PropertyValue simFiles();
 // A data connection as the server lists it. `number` tells its addresses apart.
 PropertyValue dataConnection(const char* accessPointName, const char* qosClass, unsigned number);
 
+// The same for networks before LTE. The access point id (5 to 15) tells a phone's contexts apart.
+PropertyValue packetDataContext(const char* accessPointName, const char* trafficClass,
+                                unsigned accessPointId, unsigned number);
+
 } // namespace orvane

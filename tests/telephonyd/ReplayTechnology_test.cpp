@@ -41,6 +41,32 @@ TEST(ReplayTechnologyTest, ARealDriveIsRecognised)
     EXPECT_EQ(technologyOfLog(*file), kTSLogChannelTechnology_Varnel_LTE);
 }
 
+TEST(ReplayTechnologyTest, EachTechnologyIsToldByACodeOfItsOwn)
+{
+    TestServices services;
+    services.useShippedResources(); // UTRAN's codes come with its template
+    const struct {
+        std::uint16_t code;
+        const char* technology;
+    } cases[] = {
+        {0xB179, kTSLogChannelTechnology_Varnel_LTE   },
+        {0xD0E0, kTSLogChannelTechnology_Varnel_UTRAN2},
+        {0x417A, kTSLogChannelTechnology_Varnel_GSM   },
+        {0x119C, kTSLogChannelTechnology_Varnel_CDMA  },
+    };
+    for (const auto& each : cases)
+        EXPECT_EQ(technologyOfLog(fileOf({0x1FFD, each.code, 0x3333})), each.technology)
+            << each.code;
+}
+
+TEST(ReplayTechnologyTest, TheTechnologyThatKnowsMostItemsWins)
+{
+    EXPECT_EQ(technologyOfLog(fileOf({0x417A, 0x4005, 0xB179, 0xB17F, 0xB17F})),
+              kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(technologyOfLog(fileOf({0x417A, 0x4005, 0xB179, 0x4005, 0xB17F})),
+              kTSLogChannelTechnology_Varnel_GSM);
+}
+
 TEST(ReplayTechnologyTest, CodesThatNoGeneratorKnowsTellNothing)
 {
     EXPECT_FALSE(technologyOfLog({}));
