@@ -164,7 +164,8 @@ std::string XmlRun::position(std::size_t at) const
 {
     constexpr std::string_view kUtf8Mark = "\xEF\xBB\xBF";
     const std::size_t first = _text.starts_with(kUtf8Mark) ? kUtf8Mark.size() : 0;
-    const bool isLatin1 = _declaredEncoding.size() >= 3 && (_declaredEncoding[0] | 0x20) == 'i';
+    // Of the encodings that Expat knows, Latin-1 alone has characters of one byte beyond ASCII.
+    const bool isLatin1 = !_declaredEncoding.empty() && (_declaredEncoding[0] | 0x20) == 'i';
     std::size_t line = 1;
     std::size_t column = 1;
     for (std::size_t i = first; i < std::min(at, _text.size()); ++i) {
