@@ -70,7 +70,7 @@ void Base::updateSectionRef(const PropertyValue& subtree)
 {
     init();
     if (subtree.type() != subtreeType())
-        logError("The template gives \"%s\" a %s, not the %s that it needs: it stays empty",
+        logError("The template's part for \"%s\" is of type %s instead of %s: it stays empty",
                  getSectionName().c_str(), subtree.typeName(),
                  subtreeType() == PropertyValue::Type::Array ? "array" : "dictionary");
     else if (subtreeType() == PropertyValue::Type::Array)

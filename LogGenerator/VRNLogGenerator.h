@@ -21,6 +21,8 @@ public:
     static std::optional<Bytes> generateDlfFromState(const PropertyDictionary& state);
 
 protected:
+    // Whether init() has run.
+    [[nodiscard]] bool isInitialised() const { return _binData.has_value(); }
     void appendToBinData(ByteView message);
     // Stores what was gathered as the state's "DisplayState" and starts anew.
     void moveBinDataToState(PropertyDictionary& state);

@@ -126,6 +126,8 @@ void VRNLogGenerator2::printDict(const PropertyValue& object)
 PropertyValue VRNLogGenerator2::generateLogUsingState(PropertyDictionary& state)
 {
     PropertyValue display = getDisplayFromState(state);
+    if (!isInitialised())
+        return {};
     moveBinDataToState(state);
     updateHistoryInState(state);
     return display;
