@@ -52,17 +52,18 @@ std::optional<Bytes> readFile(const std::string& path, std::size_t limit)
 
 bool writeFile(const std::string& path, ByteView content)
 {
-    std::error_code error;
-    const bool existed = std::filesystem::exists(std::filesystem::symlink_status(path, error));
     std::FILE* file = std::fopen(path.c_str(), "wb");
     if (!file)
         return false;
-    const bool written = std::fwrite(content.data(), 1, content.size(), file) == content.size();
+    const bool written =
+        content.empty() || std::fwrite(content.data(), 1, content.size(), file) == content.size();
     // Closing writes what is still buffered, so a full disk may show only here.
     const bool closed = std::fclose(file) == 0;
     if (written && closed)
         return true;
-    if (!existed)
+    // Half a file could be taken for a whole one. What stood there before is gone already.
+    std::error_code error;
+    if (std::filesystem::is_regular_file(path, error))
         std::filesystem::remove(path, error);
     return false;
 }

@@ -27,8 +27,8 @@ private:
 
 // The whole file, or nothing when it cannot be read or is longer than `limit` bytes.
 std::optional<Bytes> readFile(const std::string& path, std::size_t limit = SIZE_MAX);
-// Writes the file directly, replacing an earlier one. On failure nothing that this call began is
-// left behind: a file that did not exist before is removed.
+// Writes the file directly, replacing an earlier one. Where it could be begun but not finished, it
+// is removed: no half file is left behind.
 bool writeFile(const std::string& path, ByteView content);
 
 } // namespace orvane

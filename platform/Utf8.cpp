@@ -22,6 +22,12 @@ std::size_t announcedLength(unsigned char first)
     return first >= 0xF0 && first < 0xF5 ? 4 : 0;
 }
 
+// U+FFFE and U+FFFF, which no XML holds.
+bool isNoCharacter(std::string_view sequence)
+{
+    return sequence == "\xEF\xBF\xBE" || sequence == "\xEF\xBF\xBF";
+}
+
 bool isControl(unsigned char byte) { return (byte < 0x20 && byte != '\t') || byte == 0x7F; }
 
 } // namespace
@@ -41,6 +47,8 @@ std::string shownText(std::string_view text)
         }
         if (isControl(first))
             shown += ' ';
+        else if (isNoCharacter(sequence))
+            shown += kReplacement;
         else
             shown += sequence;
         at += length;

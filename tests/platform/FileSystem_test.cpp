@@ -140,12 +140,14 @@ TEST(FileSystemTest, FailedWriteLeavesNoHalfFile)
     EXPECT_EQ(readFile(path), numbered(2000));
 }
 
-TEST(FileSystemTest, FailedWriteDoesNotRemoveAFileThatWasThere)
+TEST(FileSystemTest, FailedWriteRemovesNothingButAFile)
 {
-    // Nothing can be written to it, and it must still be there.
     EXPECT_FALSE(writeFile("/dev/full", numbered(10)));
     EXPECT_TRUE(fs::exists("/dev/full"));
+}
 
+TEST(FileSystemTest, FailedWriteOverAnEarlierFileLeavesNoHalfFile)
+{
     const TemporaryDirectory directory;
     const std::string path = directory.path() + "/file";
     ASSERT_TRUE(writeFile(path, numbered(10)));
@@ -153,8 +155,7 @@ TEST(FileSystemTest, FailedWriteDoesNotRemoveAFileThatWasThere)
         const FileSizeLimit limit(1000);
         EXPECT_FALSE(writeFile(path, numbered(100000)));
     }
-    EXPECT_TRUE(fs::exists(path));
+    EXPECT_FALSE(fs::exists(path));
 }
 
-} // namespace
 } // namespace orvane
