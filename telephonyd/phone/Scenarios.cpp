@@ -46,7 +46,8 @@ std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed
 
 LogSourceFactory phoneSourceFactory(std::string scenario, MainQueue& queue)
 {
-    constexpr std::uint64_t kSeed = 1;
+    // A start near the edge of a cell, so that there is something to see soon.
+    constexpr std::uint64_t kSeed = 6;
     return [name = std::move(scenario), &queue]() -> std::unique_ptr<LogSource> {
         auto phone = makeScenario(name, kSeed);
         return phone ? std::make_unique<PhoneSource>(queue, std::move(phone)) : nullptr;
