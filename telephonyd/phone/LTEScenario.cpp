@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <numbers>
 
 namespace orvane
 {
@@ -30,15 +31,31 @@ constexpr double kWorstQuality = -17;
 
 double milliwatts(double decibelMilliwatts) { return std::pow(10, decibelMilliwatts / 10); }
 
+// How much of a channel is in use besides its pilots: a share that swells and ebbs with the
+// traffic.
+double shareInUse(std::uint16_t earfcn, milliseconds now)
+{
+    constexpr double kMean = 0.45;
+    constexpr double kSwing = 0.1;
+    constexpr double kSecondsPerCycle = 23;
+    const double seconds = std::chrono::duration<double>(now).count() + earfcn;
+    return kMean + kSwing * std::sin(2 * std::numbers::pi * seconds / kSecondsPerCycle);
+}
+
 // The quality that a cell of that power has among the powers of all on its channel, its own
-// included: each sends pilots all the time and traffic for a quarter of it.
-double quality(double power, double allMilliwatts)
+// included. Receivers tell bad qualities apart less and less: they come close to kWorstQuality but
+// not to it.
+double quality(double power, double allMilliwatts, double share)
 {
     constexpr double kCarriers = 12;
-    constexpr double kShareInUse = 0.3;
     constexpr double kNoise = -127; // dBm a carrier
-    const double total = kCarriers * (kShareInUse * allMilliwatts + milliwatts(kNoise));
-    return std::clamp(10 * std::log10(milliwatts(power) / total), kWorstQuality, kBestQuality);
+    constexpr double kBadQuality = -12;
+    const double total = kCarriers * (share * allMilliwatts + milliwatts(kNoise));
+    const double plain = 10 * std::log10(milliwatts(power) / total);
+    if (plain > kBadQuality)
+        return std::min(plain, kBestQuality);
+    constexpr double kRest = kBadQuality - kWorstQuality;
+    return kWorstQuality + kRest * std::exp((plain - kBadQuality) / kRest);
 }
 
 std::uint16_t frames(milliseconds now, int millisecondsPerFrame, int modulus)
@@ -137,12 +154,13 @@ LTELevels LTEScenario::levels(std::size_t cell) const
             averageAll += milliwatts(_drive.averageLevel(i));
         }
     const double power = _drive.level(cell);
-    const double powerQuality = quality(power, all);
+    const double share = shareInUse(own.earfcn, _now);
+    const double powerQuality = quality(power, all, share);
     return {own,
             power,
             _drive.averageLevel(cell),
             powerQuality,
-            quality(_drive.averageLevel(cell), averageAll),
+            quality(_drive.averageLevel(cell), averageAll, share),
             power - powerQuality + 10 * std::log10(own.resourceBlocks)};
 }
 

@@ -94,7 +94,7 @@ std::set<std::pair<Kind, unsigned>> everything()
 
 TEST(LTEScenarioTest, TheFirstStepHasOneOfEverything)
 {
-    for (const std::uint64_t seed : {1, 2, 3, 4, 5}) {
+    for (std::uint64_t seed = 1; seed <= 5; ++seed) {
         std::set<std::pair<Kind, unsigned>> found;
         for (const PhoneMessage& message : LTEScenario(seed).step(0ms))
             found.insert({message.kind, message.code});
@@ -196,6 +196,7 @@ TEST(LTEScenarioTest, ThePhoneChangesCellsAndSaysSoAtOnce)
 TEST(LTEScenarioTest, ServingLevelsArePlausibleAndAgree)
 {
     std::set<unsigned> powers;
+    std::set<double> qualities;
     std::optional<double> before;
     unsigned cellBefore = 0;
     for (const Timed& each : ofCode(0xB17F)) {
@@ -226,8 +227,10 @@ TEST(LTEScenarioTest, ServingLevelsArePlausibleAndAgree)
         before = average;
         cellBefore = cell;
         powers.insert(bitsAt(message, 21, 0, 9));
+        qualities.insert(quality);
     }
     EXPECT_GT(powers.size(), 40U); // values move
+    EXPECT_GT(qualities.size(), 12U);
 }
 
 TEST(LTEScenarioTest, AnIdlePhoneReportsItsCellEvery640MillisecondsAndItsNeighboursEvery1280)
