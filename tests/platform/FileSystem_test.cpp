@@ -158,4 +158,5 @@ TEST(FileSystemTest, FailedWriteOverAnEarlierFileLeavesNoHalfFile)
     EXPECT_FALSE(fs::exists(path));
 }
 
+} // namespace
 } // namespace orvane
