@@ -1,7 +1,7 @@
 #include "LogGenerator/C2K/C2KTest.h"
 
 #include "LogGenerator/C2K/C2KDecoders.h"
-#include "platform/PropertyList.h"
+#include "platform/FileSystem.h"
 #include "platform/TelephonyServer.h"
 
 namespace orvane

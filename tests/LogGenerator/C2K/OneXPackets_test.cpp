@@ -168,11 +168,12 @@ TEST_F(OneXPacketsTest, ActiveSetWithoutPilotsHoldsOnlyItsSortingMark)
 TEST_F(OneXPacketsTest, ActiveSetShowsEachPilotAndMarksTheReference)
 {
     // v = 2 E / (9 * 64 * 64) - 1 / 64: E = 1000 gives 0.03863, E = 100 gives the floor.
-    send(status(8, 2)
-             .put16(pilot(0) + 12, 20)
-             .put16(pilot(0) + 24, 1000)
-             .put16(pilot(1) + 12, 32)
-             .put16(pilot(1) + 24, 100));
+    // A pad of 1, for without one a record's energy is the next record's pilot.
+    send(status(8, 2, 1)
+             .put16(pilot(0, 1) + 12, 20)
+             .put16(pilot(0, 1) + 28, 1000)
+             .put16(pilot(1, 1) + 12, 32)
+             .put16(pilot(1, 1) + 28, 100));
     EXPECT_THAT(sortedRows("k1xActiveSetInfo"),
                 ElementsAre("0;20=(ref pilot) -14.13 dB", "1;32=-50.00 dB"));
 }
@@ -186,6 +187,13 @@ TEST_F(OneXPacketsTest, PilotRecordsAreSpacedByTheirPadRoundedUpToFour)
              .put16(pilot(1, 1) + 12, 2)
              .put16(pilot(1, 1) + 28, 2000));
     EXPECT_THAT(sortedRows("k1xActiveSetInfo"), ElementsAre("0;1=-14.13 dB", "1;2=-10.32 dB"));
+    // A pad of 2 makes 24 bytes, which need no rounding.
+    send(status(8, 2, 2)
+             .put16(pilot(0, 2) + 12, 3)
+             .put16(pilot(0, 2) + 32, 2000)
+             .put16(pilot(1, 2) + 12, 4)
+             .put16(pilot(1, 2) + 32, 1000));
+    EXPECT_THAT(sortedRows("k1xActiveSetInfo"), ElementsAre("0;3=-10.32 dB", "1;4=-14.13 dB"));
 }
 
 TEST_F(OneXPacketsTest, ZeroDivisorsComeOutAsArithmeticGivesThem)
