@@ -21,7 +21,71 @@ constexpr std::uint32_t kPacketStatus = 0x51FD;
 constexpr std::uint32_t kSystemInformation = 0x51F4;
 constexpr std::uint32_t kMeasurement = 0x5137;
 
-using GPRSInformationTest = SectionTest<GPRSInformation>;
+using Names = std::map<std::uint32_t, const char*>;
+
+const Names kPositions = {
+    {0,   "Located on BCCH"         },
+    {1,   "Located on Extended BCCH"},
+    {255, "Not Available"           },
+};
+
+const Names kControlOrders = {
+    {0,   "NC0"          },
+    {1,   "NC1"          },
+    {2,   "NC2"          },
+    {255, "Not Available"},
+};
+
+const Names kFlowControlSupports = {
+    {0,   "Not Supported"},
+    {1,   "Supported"    },
+    {255, "Available"    },
+};
+
+const Names kThresholds = {
+    {0,   "Barred (PKT access not allowed in the Cell)"},
+    {1,   "Barred"                                     },
+    {2,   "Barred"                                     },
+    {3,   "1 Only"                                     },
+    {4,   "1 to 2"                                     },
+    {5,   "1 to 3"                                     },
+    {6,   "1 to 4"                                     },
+    {7,   "Allowed"                                    },
+    {255, "Not Available"                              },
+};
+
+const Names kTimes = {
+    {0, "500 ms" },
+    {1, "1000 ms"},
+    {2, "1500 ms"},
+    {3, "0 ms"   },
+    {4, "80 ms"  },
+    {5, "120 ms" },
+    {6, "160 ms" },
+    {7, "200 ms" },
+};
+
+const Names kModes = {
+    {0, "Class 1"},
+    {1, "Class 2"},
+    {2, "Class 3"},
+};
+
+class GPRSInformationTest : public SectionTest<GPRSInformation>
+{
+protected:
+    // Sends the packet with every value of its byte.
+    void expectNames(std::uint32_t code, std::size_t offset, const char* rowName,
+                     const Names& names, const char* fallback)
+    {
+        for (std::uint32_t value = 0; value < 256; ++value) {
+            send(code, PacketBuilder(code, 35).put8(offset, value));
+            const auto name = names.find(value);
+            EXPECT_EQ(row(rowName), name == names.end() ? fallback : name->second)
+                << rowName << " " << value;
+        }
+    }
+};
 
 } // namespace
 
@@ -33,116 +97,109 @@ TEST_F(GPRSInformationTest, ListsItsNameAndCodesInOrder)
                             kSystemInformation, kMeasurement));
 }
 
-TEST_F(GPRSInformationTest, EachPacketFillsItsRowsInOrder)
+TEST_F(GPRSInformationTest, SystemInformationShowsItsPosition)
 {
-    const struct {
-        std::uint32_t code;
-        Bytes packet;
-        Rows rows;
-    } kCases[] = {
-        {kSystemInformation,
-         PacketBuilder(kSystemInformation,            15).put8(14,                               1),
-         {{"SI13 Position", "Located on Extended BCCH"}}                                                               },
-        {kAccess,
-         PacketBuilder(kAccess,                       18).put8(13,                               1).put8(14, 6).put8(15, 2),
-         {{"Network Control Order", "NC2"},
-          {"PFC Supported", "Supported"},
-          {"Priority Access Threshold", "1 to 4"}}},
-        {kCellOptions,
-         PacketBuilder(kCellOptions, 24).put8(15,                               2).put8(16,                                                                         30).put8(17,                                                                        0),
-         {{"T3192", "1500 ms"}, {"Access Burst Type", "8-bit format"}, {"DRX Timer Max", "30"}}},
-        {kBroadcastChannel,
-         PacketBuilder(kBroadcastChannel,                            34).put8(13, 255),
-         {{"PBCCH Present", "255"}}    },
-        {kPacketStatus,
-         PacketBuilder(kPacketStatus,35)
-             .put8(13,                                                             11)
-             .put8(14,                                                                       12)
-             .put8(15,                                                                 13)
-             .put8(16, 14)
-             .put8(33, 1),
-         {{"Ext Measurement Order", "14"},
-          {"Packet PSI Status", "11"},
-          {"Packet SI Status", "Supported"},
-          {"Count LR", "12"},
-          {"Count HR", "13"}}},
-        {kMeasurement,
-         PacketBuilder(kMeasurement, 29).put8(26,                      1),
-         {{"Cell Reselect Hysteresis", "Applied"}} },
-        {kPlmn,                      PacketBuilder(kPlmn,                      32).put8(13,                                                    1),                                                                         {{"Network Operating Mode", "Class 2"}}                                                                       },
-    };
-    for (const auto& [code, packet, expected] : kCases) {
-        display.asDictionary()->clear();
-        services.log.lines.clear();
-        send(code, packet);
-        EXPECT_EQ(rows(), expected) << code;
-        EXPECT_THAT(services.log.lines,
-                    ElementsAre(RecordingLog::Line{LogPriority::Warning, "GPRSInformation"}));
-    }
+    send(kSystemInformation, PacketBuilder(kSystemInformation, 15).put8(14, 1));
+    EXPECT_EQ(rows(), (Rows{
+                          {"SI13 Position", "Located on Extended BCCH"}
+    }));
+    EXPECT_THAT(services.log.lines,
+                ElementsAre(RecordingLog::Line{LogPriority::Warning, "GPRSInformation"}));
 }
 
-TEST_F(GPRSInformationTest, NamesEveryValueAndNoOther)
+TEST_F(GPRSInformationTest, AccessPacketFillsItsRowsInOrder)
 {
-    using Names = std::map<std::uint32_t, const char*>;
-    const struct {
-        std::uint32_t code;
-        std::size_t size;
-        std::size_t offset;
-        const char* row;
-        Names names;
-        const char* fallback;
-    } kCases[] = {
-        {kSystemInformation,
-         15,                     14,
-         "SI13 Position",                                        {{0, "Located on BCCH"}, {1, "Located on Extended BCCH"}, {255, "Not Available"}},
-         "Unknown"                                                                                                                                                 },
-        {kAccess,
-         18,                     15,
-         "Network Control Order",                                {{0, "NC0"}, {1, "NC1"}, {2, "NC2"}, {255, "Not Available"}},
-         "Unknown"                                                                                                                                                 },
-        {kAccess,
-         18,                     13,
-         "PFC Supported",                                        {{0, "Not Supported"}, {1, "Supported"}, {255, "Available"}},
-         "Unknown"                                                                                                                                                 },
-        {kAccess,
-         18,                     14,
-         "Priority Access Threshold",                            {{0, "Barred (PKT access not allowed in the Cell)"},
-          {1, "Barred"},
-          {2, "Barred"},
-          {3, "1 Only"},
-          {4, "1 to 2"},
-          {5, "1 to 3"},
-          {6, "1 to 4"},
-          {7, "Allowed"},
-          {255, "Not Available"}},
-         "Unknown"                                                                                                                                                 },
-        {kCellOptions,
-         24,                     15,
-         "T3192",                                                {{0, "500 ms"},
-          {1, "1000 ms"},
-          {2, "1500 ms"},
-          {3, "0 ms"},
-          {4, "80 ms"},
-          {5, "120 ms"},
-          {6, "160 ms"},
-          {7, "200 ms"}},
-         "?? ms"                                                                                                                                                   },
-        {kCellOptions,       24, 17, "Access Burst Type",        {{0, "8-bit format"}},                                                             "11-bit format"},
-        {kPacketStatus,      35, 33, "Packet SI Status",         {{0, "Not Supported"}},                                                            "Supported"    },
-        {kMeasurement,       29, 26, "Cell Reselect Hysteresis", {{0, "Not Applied"}},                                                              "Applied"      },
-        {kPlmn,
-         32,                     13,
-         "Network Operating Mode",                               {{0, "Class 1"}, {1, "Class 2"}, {2, "Class 3"}},
-         "Unknown"                                                                                                                                                 },
-    };
-    for (const auto& field : kCases) {
-        for (std::uint32_t value = 0; value < 256; ++value) {
-            send(field.code, PacketBuilder(field.code, field.size).put8(field.offset, value));
-            const auto name = field.names.find(value);
-            EXPECT_EQ(row(field.row), name == field.names.end() ? field.fallback : name->second)
-                << value;
-        }
-    }
+    send(kAccess, PacketBuilder(kAccess, 18).put8(13, 1).put8(14, 6).put8(15, 2));
+    EXPECT_EQ(rows(), (Rows{
+                          {"Network Control Order",     "NC2"      },
+                          {"PFC Supported",             "Supported"},
+                          {"Priority Access Threshold", "1 to 4"   },
+    }));
+}
+
+TEST_F(GPRSInformationTest, CellOptionsFillTheirRowsInOrder)
+{
+    send(kCellOptions, PacketBuilder(kCellOptions, 24).put8(15, 2).put8(16, 30).put8(17, 0));
+    EXPECT_EQ(rows(), (Rows{
+                          {"T3192",             "1500 ms"     },
+                          {"Access Burst Type", "8-bit format"},
+                          {"DRX Timer Max",     "30"          },
+    }));
+}
+
+TEST_F(GPRSInformationTest, BroadcastChannelShowsAsItsNumber)
+{
+    send(kBroadcastChannel, PacketBuilder(kBroadcastChannel, 34).put8(13, 255));
+    EXPECT_EQ(rows(), (Rows{
+                          {"PBCCH Present", "255"}
+    }));
+}
+
+TEST_F(GPRSInformationTest, PacketStatusFillsItsRowsInOrder)
+{
+    PacketBuilder packet(kPacketStatus, 35);
+    packet.put8(13, 11).put8(14, 12).put8(15, 13).put8(16, 14).put8(33, 1);
+    send(kPacketStatus, packet);
+    EXPECT_EQ(rows(), (Rows{
+                          {"Ext Measurement Order", "14"       },
+                          {"Packet PSI Status",     "11"       },
+                          {"Packet SI Status",      "Supported"},
+                          {"Count LR",              "12"       },
+                          {"Count HR",              "13"       },
+    }));
+}
+
+TEST_F(GPRSInformationTest, MeasurementsShowTheHysteresis)
+{
+    send(kMeasurement, PacketBuilder(kMeasurement, 29).put8(26, 1));
+    EXPECT_EQ(rows(), (Rows{
+                          {"Cell Reselect Hysteresis", "Applied"}
+    }));
+}
+
+TEST_F(GPRSInformationTest, TheServingNetworkShowsItsOperatingMode)
+{
+    send(kPlmn, PacketBuilder(kPlmn, 32).put8(13, 1));
+    EXPECT_EQ(rows(), (Rows{
+                          {"Network Operating Mode", "Class 2"}
+    }));
+}
+
+TEST_F(GPRSInformationTest, NamesEveryPosition)
+{
+    expectNames(kSystemInformation, 14, "SI13 Position", kPositions, "Unknown");
+}
+
+TEST_F(GPRSInformationTest, NamesEveryAccessValue)
+{
+    expectNames(kAccess, 15, "Network Control Order", kControlOrders, "Unknown");
+    expectNames(kAccess, 13, "PFC Supported", kFlowControlSupports, "Unknown");
+    expectNames(kAccess, 14, "Priority Access Threshold", kThresholds, "Unknown");
+}
+
+TEST_F(GPRSInformationTest, NamesEveryTimeAndMode)
+{
+    expectNames(kCellOptions, 15, "T3192", kTimes, "?? ms");
+    expectNames(kPlmn, 13, "Network Operating Mode", kModes, "Unknown");
+}
+
+TEST_F(GPRSInformationTest, FlagsAreSetForEveryValueButZero)
+{
+    expectNames(kCellOptions, 17, "Access Burst Type",
+                {
+                    {0, "8-bit format"}
+    },
+                "11-bit format");
+    expectNames(kPacketStatus, 33, "Packet SI Status",
+                {
+                    {0, "Not Supported"}
+    },
+                "Supported");
+    expectNames(kMeasurement, 26, "Cell Reselect Hysteresis",
+                {
+                    {0, "Not Applied"}
+    },
+                "Applied");
 }
 
 TEST_F(GPRSInformationTest, OneUnavailableValueReadsAvailable)
