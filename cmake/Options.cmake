@@ -24,7 +24,9 @@ if(ORVANE_FUZZ)
   if(NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
     message(FATAL_ERROR "ORVANE_FUZZ needs clang: cmake --preset fuzz, or -DCMAKE_CXX_COMPILER=clang++")
   endif()
-  target_compile_options(orvane_options INTERFACE -fsanitize=fuzzer-no-link)
+  target_compile_options(
+    orvane_options
+    INTERFACE $<$<NOT:$<BOOL:$<TARGET_PROPERTY:ORVANE_NOT_FUZZED>>>:-fsanitize=fuzzer-no-link>)
   target_link_options(orvane_options INTERFACE -fsanitize=fuzzer-no-link)
 endif()
 
