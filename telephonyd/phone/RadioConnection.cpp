@@ -61,6 +61,12 @@ bool RadioConnection::advance(milliseconds now)
     return true;
 }
 
+void RadioConnection::connect(milliseconds now)
+{
+    if (state() == RadioState::Idle)
+        _end = now;
+}
+
 void RadioConnection::release(milliseconds now)
 {
     while (state() != RadioState::Idle)

@@ -30,6 +30,8 @@ public:
     [[nodiscard]] unsigned transfers() const { return _transfers; }
     // Goes on to `now`, which never goes back, by one state at most. Returns whether it did.
     bool advance(std::chrono::milliseconds now);
+    // An idle connection is wanted now: the next advance() makes it.
+    void connect(std::chrono::milliseconds now);
     // Becomes idle (the phone has left the network or been sent away) and stays so for a while.
     void release(std::chrono::milliseconds now);
 

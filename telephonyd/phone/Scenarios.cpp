@@ -2,6 +2,7 @@
 
 #include "telephonyd/phone/LTEScenario.h"
 #include "telephonyd/phone/PhoneSource.h"
+#include "telephonyd/phone/UMTSScenario.h"
 #include "telephonyd/phone/UTRANScenario.h"
 
 namespace orvane
@@ -23,6 +24,7 @@ struct Entry {
 
 constexpr Entry kScenarios[] = {
     {"lte",   make<LTEScenario>  },
+    {"umts",  make<UMTSScenario> },
     {"utran", make<UTRANScenario>},
 };
 

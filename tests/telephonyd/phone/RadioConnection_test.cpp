@@ -57,5 +57,16 @@ TEST(RadioConnectionTest, AReleasedConnectionStaysIdleForAWhileAndComesBack)
     EXPECT_EQ(connection.state(), RadioState::Connecting);
 }
 
+TEST(RadioConnectionTest, AnIdleConnectionIsMadeWhenItIsWanted)
+{
+    RadioConnection connection(1);
+    EXPECT_FALSE(connection.advance(1s));
+    connection.connect(1s);
+    EXPECT_TRUE(connection.advance(1s));
+    EXPECT_EQ(connection.state(), RadioState::Connecting);
+    connection.connect(1s);
+    EXPECT_FALSE(connection.advance(1s)) << "it is under way already";
+}
+
 } // namespace
 } // namespace orvane

@@ -1,0 +1,238 @@
+// What the phone of UMTSScenario hears.
+
+#include "platform/TelephonyServer.h"
+#include "telephonyd/phone/ServerItems.h"
+#include "telephonyd/phone/UMTSScenario.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr double kActiveWithin = 6; // of the serving cell
+constexpr double kMonitoredWithin = 14;
+constexpr std::size_t kMostActive = 3;
+
+double milliwatts(double decibelMilliwatts) { return std::pow(10, decibelMilliwatts / 10); }
+
+PropertyValue number(double value) { return PropertyValue::integer(std::lround(value)); }
+
+PropertyValue cellDictionary(const UMTSTownCell& cell, const char* type)
+{
+    return PropertyValue::dictionaryOf({
+        {kTSCellMonitorCellRadioAccessTechnology, cell.isUmts
+                                                      ? kTSCellMonitorRadioAccessTechnologyUMTS
+                                                      : kTSCellMonitorRadioAccessTechnologyGSM},
+        {kTSCellMonitorCellType,                  type                                                                                         },
+        {kTSCellMonitorMCC,                       number(1)                                                                                    },
+        {kTSCellMonitorMNC,                       number(1)                                                                                    },
+        {kTSCellMonitorLAC,                       number(cell.locationArea)                                                                    },
+        {kTSCellMonitorCellId,                    number(cell.cellIdentity)                                                                    },
+    });
+}
+
+} // namespace
+
+std::size_t UMTSScenario::bestOf(bool isUmts) const
+{
+    if (serving().isUmts == isUmts)
+        return _drive.serving();
+    std::size_t best = kUMTSTown.size();
+    for (std::size_t i = 0; i < kUMTSTown.size(); ++i)
+        if (kUMTSTown[i].isUmts == isUmts &&
+            (best == kUMTSTown.size() || _drive.averageLevel(i) > _drive.averageLevel(best)))
+            best = i;
+    return best;
+}
+
+std::vector<std::size_t> UMTSScenario::othersOf(bool isUmts) const
+{
+    std::vector<std::size_t> found = _drive.neighbours();
+    std::erase_if(found, [&](std::size_t cell) { return kUMTSTown[cell].isUmts != isUmts; });
+    return found;
+}
+
+// All cells on the channel with their traffic, and the receiver's noise.
+double UMTSScenario::totalPower(std::uint16_t channel) const
+{
+    constexpr double kAllOverPilot = 2.5;
+    constexpr double kNoise = -101;
+    double sum = milliwatts(kNoise);
+    for (std::size_t i = 0; i < kUMTSTown.size(); ++i)
+        if (kUMTSTown[i].isUmts && kUMTSTown[i].channel == channel)
+            sum += kAllOverPilot * milliwatts(_drive.level(i));
+    return 10 * std::log10(sum);
+}
+
+double UMTSScenario::quality(std::size_t cell) const
+{
+    constexpr double kWorst = -24;
+    return std::max(_drive.level(cell) - totalPower(kUMTSTown[cell].channel), kWorst);
+}
+
+UMTSLevel UMTSScenario::umtsLevel(std::size_t cell) const
+{
+    using enum UMTSLevel::Set;
+    constexpr double kHysteresis = 4;
+    const double power = _drive.averageLevel(cell);
+    const double below = _drive.averageLevel(bestOf(true)) - power;
+    const bool isServing = cell == _drive.serving();
+    return {kUMTSTown[cell], _drive.level(cell), quality(cell),
+            isServing ? power + kHysteresis : power,
+            below <= kMonitoredWithin ? Monitored : Detected};
+}
+
+// In a call the strongest cells on the channel serve the phone together.
+void UMTSScenario::addActiveSet(Messages& messages) const
+{
+    const std::size_t best = bestOf(true);
+    const std::uint16_t channel = kUMTSTown[best].channel;
+    std::vector<UMTSLevel> cells = {umtsLevel(best)};
+    cells.front().set = UMTSLevel::Set::Active;
+    std::size_t active = 1;
+    for (const std::size_t cell : othersOf(true)) {
+        if (cell == best || kUMTSTown[cell].channel != channel)
+            continue;
+        UMTSLevel level = umtsLevel(cell);
+        const bool isClose = _drive.averageLevel(cell) > _drive.averageLevel(best) - kActiveWithin;
+        if (_umts.state() == RadioState::CellDch && isClose && active < kMostActive) {
+            level.set = UMTSLevel::Set::Active;
+            ++active;
+        }
+        cells.push_back(level);
+    }
+    messages.push_back(umtsActiveSet(totalPower(channel), cells));
+}
+
+void UMTSScenario::addUMTSRanking(Messages& messages) const
+{
+    std::vector<UMTSLevel> cells = {umtsLevel(bestOf(true))};
+    for (const std::size_t cell : othersOf(true))
+        if (cell != bestOf(true))
+            cells.push_back(umtsLevel(cell));
+    std::stable_sort(cells.begin(), cells.end(), [](const UMTSLevel& left, const UMTSLevel& right) {
+        return left.rank > right.rank;
+    });
+    messages.push_back(umtsRanking(cells));
+}
+
+// The weaker a cell comes in, the stronger the phone has to send.
+void UMTSScenario::addTransmitPower(Messages& messages)
+{
+    constexpr double kLoss = -96; // dBm, of both powers together
+    constexpr double kWeakest = -50;
+    constexpr double kStrongest = 24;
+    std::vector<double> powers(4);
+    for (double& power : powers)
+        power = std::clamp(kLoss - _drive.level(bestOf(true)) + _noise.between(-1.5, 1.5), kWeakest,
+                           kStrongest);
+    messages.push_back(umtsTransmitPower(powers));
+}
+
+void UMTSScenario::addBlockErrors(Messages& messages)
+{
+    constexpr std::uint32_t kSpeechBlocks = 48; // in the time between two reports
+    constexpr std::uint32_t kSignallingBlocks = 24;
+    const double share = 0.01 * std::exp(std::max(-quality(bestOf(true)) - 8, 0.0) / 3);
+    for (TransportBlocks& each : _blocks) {
+        const bool isSignalling = &each == &_blocks.back();
+        if (!isSignalling && _use == Use::Data)
+            continue;
+        const std::uint32_t blocks = isSignalling ? kSignallingBlocks : kSpeechBlocks;
+        each.received += blocks;
+        for (std::uint32_t i = 0; i < blocks; ++i)
+            each.damaged += _noise.between(0, 1) < share ? 1 : 0;
+    }
+    messages.push_back(umtsBlockErrors(_blocks));
+}
+
+// Where the cell comes in well, a second carrier helps.
+void UMTSScenario::addFastDownlink(Messages& messages)
+{
+    constexpr std::uint16_t kSubFrames = 240;
+    constexpr std::uint8_t kProcesses = 6;
+    constexpr double kWellQuality = -8;
+    const double ratio = quality(bestOf(true));
+    // Bits of a block by how well it comes in, and blocks of a process in the time.
+    const double blockBits = 14400 * std::pow(10, std::max((ratio + 4) / 12, -1.2));
+    const auto processes = [&] {
+        std::vector<DownlinkProcess> found;
+        for (std::uint8_t i = 0; i < kProcesses; ++i) {
+            const auto transmissions =
+                static_cast<std::uint16_t>(kSubFrames / kProcesses - _noise.below(12));
+            const auto errors =
+                static_cast<std::uint16_t>(transmissions * _noise.between(0.03, 0.15));
+            const double bits = blockBits * _noise.between(0.9, 1) * (transmissions - errors);
+            found.push_back({i, static_cast<std::uint32_t>(bits), transmissions, errors});
+        }
+        return found;
+    };
+    const auto primary = processes();
+    const bool isFirst = _now.count() == 0;
+    const auto secondary =
+        isFirst || ratio > kWellQuality ? processes() : std::vector<DownlinkProcess>();
+    messages.push_back(umtsFastDownlink(kSubFrames, primary, secondary));
+}
+
+std::vector<GSMLevel> UMTSScenario::gsmNeighbours() const
+{
+    constexpr std::size_t kMostMeasured = 6;
+    std::vector<GSMLevel> found;
+    for (const std::size_t cell : othersOf(false))
+        if (found.size() < kMostMeasured)
+            found.push_back({kUMTSTown[cell], _drive.level(cell)});
+    return found;
+}
+
+void UMTSScenario::addGSMMeasurement(Messages& messages) const
+{
+    const std::size_t best = bestOf(false);
+    messages.push_back(gsmMeasurement({kUMTSTown[best], _drive.level(best)}, gsmNeighbours()));
+}
+
+void UMTSScenario::addGSMColours(Messages& messages) const
+{
+    messages.push_back(gsmColours(gsmNeighbours()));
+}
+
+void UMTSScenario::addGSMRanking(Messages& messages) const
+{
+    const std::size_t best = bestOf(false);
+    std::vector<GSMLevel> cells = {
+        {kUMTSTown[best], _drive.level(best)}
+    };
+    for (const GSMLevel& each : gsmNeighbours())
+        cells.push_back(each);
+    messages.push_back(gsmRanking(cells));
+}
+
+// The server tells half of what a GSM cell's level is.
+void UMTSScenario::addCells(Messages& messages) const
+{
+    auto cells = PropertyValue::newArray();
+    const auto append = [&](std::size_t index, const char* type) {
+        const UMTSTownCell& cell = kUMTSTown[index];
+        PropertyValue entry = cellDictionary(cell, type);
+        PropertyDictionary& keys = *entry.asDictionary();
+        if (cell.isUmts) {
+            keys.set(kTSCellMonitorUARFCN, number(cell.channel));
+            keys.set(kTSCellMonitorSCN, number(cell.code));
+            keys.set(kTSCellMonitorRSCP, number(_drive.level(index)));
+            keys.set(kTSCellMonitorECN0, number(quality(index)));
+        } else {
+            keys.set(kTSCellMonitorARFCN, number(cell.channel));
+            keys.set(kTSCellMonitorRSSI, number(_drive.level(index) / 2));
+        }
+        cells.asArray()->append(entry);
+    };
+    append(_drive.serving(), kTSCellMonitorCellTypeServing);
+    for (const std::size_t cell : _drive.neighbours())
+        append(cell, kTSCellMonitorCellTypeNeighbor);
+    messages.push_back(serverItem(kCellsItem, cells));
+}
+
+} // namespace orvane

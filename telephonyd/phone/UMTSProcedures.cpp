@@ -1,0 +1,228 @@
+// What the phone of UMTSScenario does: how it registers, changes cells and makes connections.
+
+#include "telephonyd/phone/MobilityPackets.h"
+#include "telephonyd/phone/UMTSScenario.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using std::chrono::milliseconds;
+
+constexpr milliseconds kFirstRegistration{800};
+constexpr milliseconds kLocationUpdateTakes{2000};
+constexpr milliseconds kRoutingUpdateTakes{1200};
+
+} // namespace
+
+// Both areas, one after the other, when the phone is in another location area; the routing area
+// alone when only that is another; nothing during a connection.
+void UMTSScenario::registerWherePhoneIs()
+{
+    const UMTSTownCell& cell = serving();
+    const bool isElsewhere = cell.locationArea != _locationArea;
+    if (_now < _registeredAt || _now < kFirstRegistration || _use != Use::None ||
+        (!isElsewhere && cell.routingArea == _routingArea))
+        return;
+    const bool isFirst = _locationArea == 0;
+    _locationArea = cell.locationArea;
+    _routingArea = cell.routingArea;
+    milliseconds at = _now;
+    _agenda.add(at, registration(RegistrationState::Registering));
+    if (cell.isUmts)
+        _umts.connect(at);
+    if (isElsewhere)
+        at = updateLocation(at);
+    updateRoutingArea(at, isFirst);
+    _registeredAt = at + kRoutingUpdateTakes;
+    _agenda.add(_registeredAt, registration(RegistrationState::Idle));
+    _agenda.add(_registeredAt, systemInformation(cell, ServiceType::All));
+    _agenda.add(_registeredAt, equivalentNetworks(cell.locationArea));
+}
+
+milliseconds UMTSScenario::updateLocation(milliseconds at)
+{
+    using enum CircuitState;
+    const auto add = [&](int after, CircuitState state, CircuitSubState subState, bool isUpdated) {
+        _agenda.add(at + milliseconds(after), circuitMobility(state, subState, isUpdated));
+    };
+    _agenda.add(at, systemInformation(serving(), ServiceType::Limited));
+    add(0, Idle, CircuitSubState::UpdateNeeded, false);
+    add(200, WaitForRadioToUpdate, CircuitSubState::None, false);
+    add(800, LocationUpdateInitiated, CircuitSubState::None, false);
+    add(1600, WaitForNetworkCommand, CircuitSubState::None, true);
+    add(2000, Idle, CircuitSubState::NormalService, true);
+    if (!serving().isUmts)
+        for (const auto& [after, state] : {
+                 std::pair{200,  GSMRadioState::ConnectionPending},
+                 std::pair{800,  GSMRadioState::DataTransfer     },
+                 std::pair{1800, GSMRadioState::ConnectionRelease},
+                 std::pair{2000, GSMRadioState::Idle             }
+        })
+            _agenda.add(at + milliseconds(after), gsmRadioState(state, true));
+    return at + kLocationUpdateTakes;
+}
+
+void UMTSScenario::updateRoutingArea(milliseconds at, bool isAttach)
+{
+    _agenda.add(at, packetMobility(PacketState::Registered, PacketSubState::UpdateNeeded, false));
+    _agenda.add(at + milliseconds(200), packetMobility(isAttach ? PacketState::AttachInitiated
+                                                                : PacketState::AreaUpdateInitiated,
+                                                       PacketSubState::None, false));
+    _agenda.add(at + kRoutingUpdateTakes,
+                packetMobility(PacketState::Registered, PacketSubState::NormalService, true));
+}
+
+void UMTSScenario::beginCall()
+{
+    using enum CircuitState;
+    _use = Use::Call;
+    for (const auto& [after, state] : {
+             std::pair{0,    WaitForRadioToConnect    },
+             std::pair{500,  WaitForOutgoingConnection},
+             std::pair{1200, ConnectionActive         }
+    })
+        _agenda.add(_now + milliseconds(after),
+                    circuitMobility(state, CircuitSubState::None, true));
+}
+
+void UMTSScenario::endCall()
+{
+    using enum CircuitState;
+    _use = Use::None;
+    _agenda.add(_now, circuitMobility(WaitForNetworkCommand, CircuitSubState::None, true));
+    _agenda.add(_now + milliseconds(400),
+                circuitMobility(Idle, CircuitSubState::NormalService, true));
+}
+
+void UMTSScenario::changeCell(bool wasUmts, Messages& messages)
+{
+    const bool isUmts = serving().isUmts;
+    if (isUmts != wasUmts) {
+        // What was under way in the other network is not finished in it.
+        _agenda.clear();
+        _use = Use::None;
+        _registeredAt = _now;
+        if (isUmts)
+            enterUMTS(messages);
+        else
+            enterGSM(messages);
+    }
+    if (isUmts) {
+        messages.push_back(umtsServingCell(serving()));
+        return;
+    }
+    if (!wasUmts && _use == Use::None) {
+        messages.push_back(gsmRadioState(GSMRadioState::Reselection, false));
+        _agenda.add(_now + milliseconds(400), gsmRadioState(GSMRadioState::Idle, false));
+    }
+    addGSMCell(messages);
+}
+
+void UMTSScenario::enterUMTS(Messages& messages)
+{
+    messages.push_back(gsmRadioState(GSMRadioState::GoingToUMTS, false));
+    messages.push_back(gsmRadioState(GSMRadioState::Inactive, false));
+    _umts.release(_now);
+    _umtsBefore = RadioState::Idle;
+    messages.push_back(umtsRadioState(RadioState::Idle));
+}
+
+void UMTSScenario::enterGSM(Messages& messages)
+{
+    _umts.release(_now);
+    _umtsBefore = RadioState::Idle;
+    messages.push_back(umtsRadioState(RadioState::Idle));
+    messages.push_back(umtsCiphering(false));
+    messages.push_back(gsmRadioState(GSMRadioState::ComingFromUMTS, false));
+    messages.push_back(gsmRadioState(GSMRadioState::Idle, false));
+}
+
+// The cell's own data at once, what it tells about packet service as its system information comes.
+void UMTSScenario::addGSMCell(Messages& messages)
+{
+    messages.push_back(gsmServingCell(serving()));
+    if (_use == Use::Call) {
+        messages.push_back(gsmMobileAllocation(serving()));
+        messages.push_back(gsmDedicatedChannel(serving()));
+    }
+    milliseconds at = _now;
+    for (PhoneMessage& each : gprsInformation(serving()))
+        _agenda.add(at += milliseconds(200), std::move(each));
+}
+
+// A connection on channels of its own is a call or a data transfer by turns, unless it was made to
+// register: then data go over it.
+void UMTSScenario::changeUMTSConnection(Messages& messages)
+{
+    const RadioState state = _umts.state();
+    messages.push_back(umtsRadioState(state));
+    if (_use == Use::Call)
+        endCall();
+    _use = Use::None;
+    const bool isRegistering = _now < _registeredAt;
+    switch (state) {
+    case RadioState::Connecting:
+        if (!isRegistering)
+            _agenda.add(_now, packetMobility(PacketState::ServiceRequestInitiated,
+                                             PacketSubState::None, true));
+        break;
+    case RadioState::CellDch:
+        if (_umts.transfers() % 2 == 0 && !isRegistering)
+            beginCall();
+        else
+            _use = Use::Data;
+        break;
+    default:
+        break;
+    }
+    if (_umtsBefore == RadioState::Connecting) {
+        _agenda.add(_now + milliseconds(400), umtsCiphering(true));
+        if (!isRegistering)
+            _agenda.add(
+                _now + milliseconds(400),
+                packetMobility(PacketState::Registered, PacketSubState::NormalService, true));
+    }
+    if (state == RadioState::Idle)
+        messages.push_back(umtsCiphering(false));
+    _umtsBefore = state;
+}
+
+// Calls and data transfers take turns; during a call packet service rests.
+void UMTSScenario::changeGSMConnection()
+{
+    const auto addRadio = [this](int after, GSMRadioState state, bool isData) {
+        _agenda.add(_now + milliseconds(after), gsmRadioState(state, isData));
+    };
+    const auto addPacket = [this](PacketSubState subState) {
+        _agenda.add(_now, packetMobility(PacketState::Registered, subState, true));
+    };
+    if (_gsm.isOn()) {
+        if (_now < _registeredAt || _now < kFirstRegistration)
+            return; // busy enough
+        const bool isCall = ++_gsmConnections % 2 == 1;
+        addRadio(0, GSMRadioState::ConnectionPending, !isCall);
+        addRadio(500, GSMRadioState::DataTransfer, !isCall);
+        if (!isCall) {
+            _use = Use::Data;
+            return;
+        }
+        beginCall();
+        addPacket(PacketSubState::Suspended);
+        _agenda.add(_now + milliseconds(500), gsmMobileAllocation(serving()));
+        _agenda.add(_now + milliseconds(500), gsmDedicatedChannel(serving()));
+    } else if (_use != Use::None) {
+        const bool isCall = _use == Use::Call;
+        addRadio(0, GSMRadioState::ConnectionRelease, !isCall);
+        addRadio(400, GSMRadioState::Idle, false);
+        if (isCall) {
+            endCall();
+            addPacket(PacketSubState::NormalService);
+        }
+        _use = Use::None;
+    }
+}
+
+} // namespace orvane
