@@ -12,12 +12,6 @@ constexpr std::uint32_t kVersion = 1;
 
 std::uint32_t count(std::size_t records) { return static_cast<std::uint32_t>(records); }
 
-// Whole decibels that wander by one from value to value, as measurements of one time do.
-std::uint32_t wanderingDecibels(double decibels, int turn)
-{
-    return rawValue(decibels + (turn % 3 - 1) * 0.8, 0, 1, 8);
-}
-
 } // namespace
 
 PhoneMessage utranRadioState(RadioState state)
@@ -78,7 +72,6 @@ PhoneMessage utranGSMNeighbours(std::span<const UTRANGSMNeighbour> cells)
 PhoneMessage utranChannelQuality(std::span<const TransportChannel> transport,
                                  std::span<const CodedChannel> coded)
 {
-    constexpr int kMeasurements = 6;
     // The coded channels stand where 17 blocks of the transport channels' size would end.
     const std::size_t gap = 16 * (17 + 2 * transport.size());
     PacketWriter writer;
@@ -92,8 +85,8 @@ PhoneMessage utranChannelQuality(std::span<const TransportChannel> transport,
     writer.skip(gap);
     for (const CodedChannel& channel : coded) {
         writer.put8(channel.number).put8(channel.timeSlot);
-        for (int i = 0; i < kMeasurements; ++i)
-            writer.put8(wanderingDecibels(channel.signalToInterference, i));
+        for (const double ratio : channel.signalsToInterference)
+            writer.put8(rawValue(ratio, 0, 1, 8));
     }
     return modemItem(kUTRANChannelQualityCode, writer);
 }

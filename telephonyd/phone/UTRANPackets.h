@@ -4,6 +4,7 @@
 #include "telephonyd/phone/Scenario.h"
 #include "telephonyd/phone/UTRANTown.h"
 
+#include <array>
 #include <span>
 
 namespace orvane
@@ -43,8 +44,8 @@ struct TransportChannel {
 // Transport channels that are sent coded together in a time slot.
 struct CodedChannel {
     std::uint8_t number;
-    std::uint8_t timeSlot;       // 0 to 6
-    double signalToInterference; // dB
+    std::uint8_t timeSlot;                       // 0 to 6
+    std::array<double, 6> signalsToInterference; // of measurements in a row, dB
 };
 
 PhoneMessage utranRadioState(RadioState state);

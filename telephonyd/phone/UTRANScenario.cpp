@@ -27,7 +27,7 @@ constexpr Phases::Range kNoDataFor{6, 14};
 
 // How far below the serving cell another may be on the same channel and still be monitored, and
 // still be worth detecting jointly.
-constexpr double kMonitoredWithin = 20;
+constexpr double kMonitoredWithin = 28;
 constexpr double kJointWithin = 12;
 
 bool isOnOwnChannels(RadioState state) { return state == RadioState::CellDch; }
@@ -187,9 +187,15 @@ void UTRANScenario::addChannelQuality(Messages& messages)
     const auto add = [&](std::uint8_t number, double more) {
         transport.push_back({number, percentDamaged(ratio) + _noise.between(0, more)});
     };
+    const auto addCoded = [&](std::uint8_t number, std::uint8_t slot, double more) {
+        CodedChannel channel{number, slot, {}};
+        for (double& each : channel.signalsToInterference)
+            each = ratio + more + _noise.between(-1.5, 1.5);
+        coded.push_back(channel);
+    };
     switch (_radio.state()) {
     case RadioState::CellDch:
-        coded.push_back({1, 5, ratio});
+        addCoded(1, 5, 0);
         add(1, 2);
         if (_radio.transfers() % 2 == 1) {
             add(2, 2);
@@ -197,16 +203,16 @@ void UTRANScenario::addChannelQuality(Messages& messages)
             add(31, 1);
         } else {
             add(31, 1);
-            coded.push_back({2, 6, ratio - 1.5});
+            addCoded(2, 6, -1);
         }
         break;
     case RadioState::CellFach:
-        coded.push_back({1, 4, ratio});
+        addCoded(1, 4, 0);
         add(1, 2);
         add(2, 2);
         break;
     default:
-        coded.push_back({1, kBroadcastSlot, ratio + 2});
+        addCoded(1, kBroadcastSlot, 2);
         add(1, 2);
     }
     messages.push_back(utranChannelQuality(transport, coded));
