@@ -52,6 +52,15 @@ PropertyValue LogGenerator::getSaveContentsFromState(PropertyDictionary&)
     throw UnrecognisedOperation("LogGenerator getSaveContentsFromState");
 }
 
+PropertyValue LogGenerator::historyOf(const PropertyDictionary& state)
+{
+    PropertyValue snapshots = PropertyValue::newArray();
+    if (const PropertyArray* history = state[kHistoryKey].asArray())
+        for (const PropertyValue& snapshot : *history)
+            snapshots.asArray()->append(snapshot);
+    return snapshots;
+}
+
 void LogGenerator::updateHistoryInState(PropertyDictionary& state)
 {
     if (!state[kHistoryKey].asArray())

@@ -34,6 +34,8 @@ public:
     // A new generator for the technology that the server named, or null for any other value.
     static std::unique_ptr<LogGenerator> generatorFromTechnology(const PropertyValue& technology);
 
+    // A new array of the history's snapshots, oldest first.
+    static PropertyValue historyOf(const PropertyDictionary& state);
     // Appends a snapshot of the state to its "History", which keeps the newest five.
     static void updateHistoryInState(PropertyDictionary& state);
 };

@@ -87,10 +87,7 @@ std::optional<Bytes> VRNLogGenerator::generateDlfFromState(const PropertyDiction
 
 PropertyValue VRNLogGenerator::getSaveContentsFromState(PropertyDictionary& state)
 {
-    PropertyValue contents = PropertyValue::newArray();
-    if (const PropertyArray* history = state[kHistoryKey].asArray())
-        for (const PropertyValue& snapshot : *history)
-            contents.asArray()->append(snapshot);
+    PropertyValue contents = historyOf(state);
     if (std::optional<Bytes> dlf = generateDlfFromState(state)) {
         char description[64];
         std::snprintf(description, sizeof description, "DLF binary (%d bytes)",

@@ -50,6 +50,17 @@ void takeFrontEnd(AppOptions& options, CommandLine& line)
         line.fail("--ui takes text or json, not \"" + *name + "\"");
 }
 
+void takeWords(CommandLine& line, std::span<const std::string> scenarios)
+{
+    if (line.words().empty())
+        return;
+    const std::string& word = line.words().front();
+    if (std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end())
+        line.fail("\"" + word + "\" is no command: for the simulated phone write --demo=" + word);
+    else
+        line.fail("\"" + word + "\" is no command: see orvane --help");
+}
+
 void takeDemo(AppOptions& options, CommandLine& line, std::span<const std::string> scenarios)
 {
     if (!line.has("demo"))
@@ -75,8 +86,7 @@ AppOptions parseAppOptions(std::span<const std::string> arguments,
         options.wantsVersion = line.has("version");
         if (options.wantsHelp || options.wantsVersion)
             return options;
-        if (!line.words().empty())
-            line.fail("\"" + line.words().front() + "\" is no command: see orvane --help");
+        takeWords(line, scenarios);
         takeFrontEnd(options, line);
         takeDemo(options, line, scenarios);
         options.ports = line.value("ports").value_or("");

@@ -24,8 +24,11 @@ void OrvaneApp::applicationDidFinishLaunching()
     getSaveButtonPref();
     _model = std::make_shared<OrvaneModel>(_environment, this);
     updateMessage = kConnecting;
-    for (Pane* pane : _panes.panes())
+    for (Pane* pane : _panes.panes()) {
+        // Without the dots, unlike ever after. This is meant.
         pane->setStatus("Connecting", true);
+        navigationControllerWillShow(*pane);
+    }
     _environment.queue.async([weak = std::weak_ptr(_model)] {
         if (const auto model = weak.lock())
             model->restartMonitor();
@@ -47,6 +50,8 @@ std::optional<SnapshotResult> OrvaneApp::saveSnapshot(const std::string& descrip
     return writeSnapshotFile(_files, _model->getSaveContents(),
                              Services::current().clock().secondsSince1970(), description);
 }
+
+void OrvaneApp::navigationControllerWillShow(Pane& pane) { updateStatusForViewController(pane); }
 
 void OrvaneApp::updateStatusForViewController(Pane& pane)
 {

@@ -34,6 +34,8 @@ public:
     // Saves a snapshot of this moment with the description. Nothing where saving is not offered.
     std::optional<SnapshotResult> saveSnapshot(const std::string& description);
 
+    // A pane is about to be shown.
+    void navigationControllerWillShow(Pane& pane);
     void updateStatusForViewController(Pane& pane);
     void updateViewControllerFromModel() override;
     void monitorStartEnded() override;

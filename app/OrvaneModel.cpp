@@ -74,7 +74,7 @@ void OrvaneModel::refresh()
 PropertyValue OrvaneModel::getSaveContents()
 {
     return _logGenerator ? _logGenerator->getSaveContentsFromState(*_state)
-                         : PropertyValue::newArray();
+                         : LogGenerator::historyOf(*_state);
 }
 
 // The tree on the screen stays until a new generator has taken a message. Where a refresh has just
@@ -94,8 +94,8 @@ void OrvaneModel::keepTreeForQueuedUpdate()
 // would have nothing to write into. Only the history goes over, to a generator of the same class.
 void OrvaneModel::adoptGenerator(std::unique_ptr<LogGenerator> generator)
 {
+    keepTreeForQueuedUpdate();
     if (generator) {
-        keepTreeForQueuedUpdate();
         LogGenerator& adopted = *generator;
         const std::type_index generatorClass = typeid(adopted);
         const PropertyValue history = (*_state)[kHistoryKey];

@@ -61,7 +61,9 @@ public:
     // The timer's action: checks the connection and, if data came since the last time, drops the
     // tree and has the view updated.
     void refresh();
-    // The generator's save contents, an empty array without a generator.
+    // The same for whoever calls back with an argument, which is ignored.
+    void refresh(const void*) { refresh(); }
+    // The generator's save contents; without a generator what the history still holds.
     PropertyValue getSaveContents();
 
     bool createPorts();

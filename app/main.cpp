@@ -14,12 +14,12 @@
 #include "platform/qt/QtMainQueue.h"
 #include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
+#include "platform/qt/StandardDescriptors.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/phone/Scenarios.h"
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 
-#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <exception>
@@ -81,8 +81,12 @@ std::string demoRoot()
                                  "HOME or XDG_STATE_HOME, or give --root DIR");
     root /= "orvane/demo";
     const FileSystem files(root.string());
-    std::filesystem::create_directories(files.located(kInstallMarker));
-    std::filesystem::create_directories(files.located(kLogFolder));
+    std::error_code error;
+    for (const char* folder : {kInstallMarker, kLogFolder})
+        if (!std::filesystem::create_directories(files.located(folder), error) && error)
+            throw std::runtime_error("the simulated phone's files cannot be kept in " +
+                                     root.string() + " (" + error.message() +
+                                     "): set XDG_STATE_HOME, or give --root DIR");
     return root.string();
 }
 
@@ -99,7 +103,7 @@ int exitStatus(const OutputDescriptor& output)
     if (output.state() != OutputDescriptor::State::Failed)
         return 0;
     complain(std::string("standard output cannot be written: ") + output.failure() +
-             "; make room or send it somewhere else");
+             "; send it somewhere else");
     return kFailure;
 }
 
@@ -157,6 +161,7 @@ int run(const AppOptions& options)
 
 int main(int argc, char** argv)
 {
+    prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
     const std::vector<std::string> scenarios = scenarioNames();
     const AppOptions options = parseAppOptions(arguments, scenarios);
@@ -173,10 +178,8 @@ int main(int argc, char** argv)
         return 0;
     }
 
-    // A reader that leaves is seen as an error of the write.
-    std::signal(SIGPIPE, SIG_IGN);
     StandardErrorConsole console;
-    DirectoryResources resources(resourceDirectory(ORVANE_SOURCE_RESOURCES));
+    DirectoryResources resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES));
     Services& services = Services::current();
     services.setLog(options.log.get());
     services.setConsole(&console);

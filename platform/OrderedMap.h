@@ -40,7 +40,11 @@ public:
     // The value under the key, made with V's default at the end if it was not there.
     V& operator[](std::string_view key)
     {
+        // A group's rows are mostly written again in the order in which they stand.
+        if (_next < _entries.size() && _entries[_next].first == key)
+            return _entries[_next++].second;
         const std::size_t at = position(key);
+        _next = at + 1;
         if (at != _entries.size())
             return _entries[at].second;
         _entries.emplace_back(std::string(key), V());
@@ -65,6 +69,8 @@ public:
         _entries.clear();
         _index.clear();
     }
+
+    void reserve(std::size_t size) { _entries.reserve(size); }
 
 private:
     static constexpr std::size_t kIndexedSize = 32;
@@ -99,6 +105,7 @@ private:
     }
 
     std::vector<Entry> _entries;
+    std::size_t _next = 0; // behind the entry that was written last
     std::unordered_map<std::string, std::size_t, TextHash, std::equal_to<>> _index;
 };
 

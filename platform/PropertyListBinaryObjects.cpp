@@ -85,6 +85,9 @@ bool PropertyListBinaryObjects::readTrailer()
     const std::size_t tableBytes = trailer - static_cast<std::size_t>(table);
     if (objectCount != tableBytes / _offsetBytes || tableBytes % _offsetBytes != 0)
         return fail("number of objects does not fit the offset table", trailer + 8);
+    // Each object takes a byte of its own, so more than this must overlap; told before any is kept.
+    if (objectCount > table - kMagicBytes)
+        return fail("more objects than bytes for them", trailer + 8);
     if (root >= objectCount)
         return fail("root object out of range", trailer + 16);
     _objectCount = static_cast<std::size_t>(objectCount);

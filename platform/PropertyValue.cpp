@@ -1,6 +1,7 @@
 #include "platform/PropertyValue.h"
 
 #include "platform/Clock.h"
+#include "platform/Utf8.h"
 
 #include <cmath>
 #include <cstdio>
@@ -193,7 +194,7 @@ std::string PropertyValue::description() const
         std::string text = "{";
         const char* separator = "";
         for (const auto& [key, value] : *asDictionary()) {
-            text += separator + key + " = " + value.description();
+            text += separator + shownText(key) + " = " + value.lineOfText();
             separator = "; ";
         }
         return text + "}";
@@ -202,7 +203,7 @@ std::string PropertyValue::description() const
         std::string text = "(";
         const char* separator = "";
         for (const PropertyValue& element : *asArray()) {
-            text += separator + element.description();
+            text += separator + element.lineOfText();
             separator = ", ";
         }
         return text + ")";
@@ -225,6 +226,12 @@ std::string PropertyValue::description() const
     return "(null)";
 }
 
+std::string PropertyValue::lineOfText() const
+{
+    const std::string* text = asString();
+    return text ? shownText(*text) : description();
+}
+
 const PropertyValue& PropertyDictionary::operator[](std::string_view key) const
 {
     const PropertyValue* value = _entries.find(key);
@@ -237,6 +244,15 @@ void PropertyDictionary::set(std::string_view key, PropertyValue value)
         throw std::invalid_argument("an absent value cannot be stored under \"" + std::string(key) +
                                     "\"");
     _entries[key] = std::move(value);
+}
+
+void PropertyDictionary::setText(std::string_view key, std::string text)
+{
+    PropertyValue& value = _entries[key];
+    if (std::string* present = value.asString())
+        *present = std::move(text);
+    else
+        value = PropertyValue(std::move(text));
 }
 
 const PropertyValue& PropertyArray::operator[](std::size_t index) const

@@ -103,6 +103,9 @@ private:
 
     explicit PropertyValue(Storage value) : _value(std::move(value)) {}
 
+    // The description as part of a container's, on one line whatever a text holds.
+    [[nodiscard]] std::string lineOfText() const;
+
     template <typename T>
     [[nodiscard]] std::optional<T> scalar() const
     {
@@ -132,8 +135,12 @@ public:
     // Stores the value at the key's place, a new key at the end. Storing an absent value is a
     // programming error and throws std::invalid_argument.
     void set(std::string_view key, PropertyValue value);
+    // The same for a text, which goes where the key's text is if it has one.
+    void setText(std::string_view key, std::string text);
     void remove(std::string_view key) { _entries.remove(key); }
     void clear() { _entries.clear(); }
+    // Makes room for that many entries in one go.
+    void reserve(std::size_t size) { _entries.reserve(size); }
 
 private:
     OrderedMap<PropertyValue> _entries;
@@ -155,7 +162,11 @@ public:
     void append(PropertyValue value);
     // Removes `count` elements from the front, or all if there are fewer.
     void removeFirst(std::size_t count);
-    void replaceElements(std::vector<PropertyValue> elements) { _elements = std::move(elements); }
+    // Returns what was there.
+    std::vector<PropertyValue> replaceElements(std::vector<PropertyValue> elements)
+    {
+        return std::exchange(_elements, std::move(elements));
+    }
     void clear() { _elements.clear(); }
 
 private:

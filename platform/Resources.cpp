@@ -12,7 +12,8 @@ namespace orvane
 
 std::optional<Bytes> DirectoryResources::load(std::string_view name, std::string_view type) const
 {
-    return readFile(_directory + "/" + std::string(name) + "." + std::string(type));
+    constexpr std::size_t kLimit = std::size_t{16} * 1024 * 1024;
+    return readFile(_directory + "/" + std::string(name) + "." + std::string(type), kLimit);
 }
 
 std::vector<std::string> DirectoryResources::pathsOfType(std::string_view type) const

@@ -2,6 +2,7 @@
 
 #include "platform/Services.h"
 
+#include <algorithm>
 #include <cstdarg>
 #include <cstdio>
 #include <string>
@@ -70,6 +71,8 @@ void StandardErrorLog::write(LogPriority priority, std::string_view text)
     std::string line = logPriorityName(priority);
     line += ": ";
     line += withoutNewline(text);
+    // One line each, also where a text from elsewhere is part of it.
+    std::replace(line.begin(), line.end(), '\n', ' ');
     line += '\n';
     std::fwrite(line.data(), 1, line.size(), stderr);
 }

@@ -30,30 +30,41 @@ bool isNoCharacter(std::string_view sequence)
 
 bool isControl(unsigned char byte) { return (byte < 0x20 && byte != '\t') || byte == 0x7F; }
 
-} // namespace
-
-std::string shownText(std::string_view text)
+// Calls `append` for each whole character and puts U+FFFD in place of each other byte.
+template <typename Append>
+std::string transformed(std::string_view text, Append append)
 {
-    std::string shown;
-    shown.reserve(text.size());
+    std::string result;
+    result.reserve(text.size());
     for (std::size_t at = 0; at < text.size();) {
-        const auto first = static_cast<unsigned char>(text[at]);
-        const std::size_t length = announcedLength(first);
+        const std::size_t length = announcedLength(static_cast<unsigned char>(text[at]));
         const std::string_view sequence = text.substr(at, length);
         if (length == 0 || sequence.size() < length || !isValidUtf8(sequence)) {
-            shown += kReplacement;
+            result += kReplacement;
             ++at;
             continue;
         }
-        if (isControl(first))
-            shown += ' ';
-        else if (isNoCharacter(sequence))
-            shown += kReplacement;
-        else
-            shown += sequence;
+        append(result, sequence);
         at += length;
     }
-    return shown;
+    return result;
+}
+
+} // namespace
+
+std::string validText(std::string_view text)
+{
+    return transformed(text, [](std::string& to, std::string_view sequence) { to += sequence; });
+}
+
+std::string shownText(std::string_view text)
+{
+    return transformed(text, [](std::string& to, std::string_view sequence) {
+        if (isControl(static_cast<unsigned char>(sequence.front())))
+            to += ' ';
+        else
+            to += isNoCharacter(sequence) ? kReplacement : sequence;
+    });
 }
 
 } // namespace orvane

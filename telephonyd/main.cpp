@@ -6,6 +6,7 @@
 #include "platform/qt/QtMainQueue.h"
 #include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
+#include "platform/qt/StandardDescriptors.h"
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/ReplaySource.h"
@@ -15,6 +16,7 @@
 #include <chrono>
 #include <cstdio>
 #include <exception>
+#include <filesystem>
 
 using namespace orvane;
 
@@ -29,11 +31,13 @@ void complain(const std::string& text) { std::fprintf(stderr, "telephonyd: %s\n"
 // Null, with a complaint, when the recording cannot be served.
 LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
 {
-    auto content = readFile(*options.replay);
+    std::error_code error;
+    auto content = std::filesystem::is_regular_file(*options.replay, error)
+                       ? readFile(*options.replay)
+                       : std::nullopt;
     if (!content) {
         complain("cannot read \"" + *options.replay +
-                 "\": check that the file is there and may be "
-                 "read");
+                 "\": check that it is a file and may be read");
         return nullptr;
     }
     const auto technology = options.technology ? options.technology : technologyOfLog(*content);
@@ -70,8 +74,7 @@ int serve(const DaemonOptions& options)
         return kFailure;
     LogServer server(transport, queue, std::move(factory));
     if (const auto failure = server.start()) {
-        complain("cannot be the telephony server in " + directory->path() + ": " + *failure +
-                 "; end the other server or choose another directory with --ports");
+        complain(*failure);
         return kFailure;
     }
     const SignalWatcher signals([&loop](int) { loop.quit(); });
@@ -83,6 +86,7 @@ int serve(const DaemonOptions& options)
 
 int main(int argc, char** argv)
 {
+    prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
     const std::vector<std::string> scenarios = scenarioNames();
     const DaemonOptions options = parseDaemonOptions(arguments, scenarios);
@@ -99,7 +103,7 @@ int main(int argc, char** argv)
         return 0;
     }
     // Some generators, who are asked for their log codes, come with their templates only.
-    DirectoryResources resources(resourceDirectory(ORVANE_SOURCE_RESOURCES));
+    DirectoryResources resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES));
     Services& services = Services::current();
     services.setLog(options.log.get());
     services.setResources(&resources);

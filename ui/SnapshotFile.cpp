@@ -2,6 +2,7 @@
 
 #include "platform/PropertyList.h"
 #include "platform/Services.h"
+#include "platform/Utf8.h"
 
 #include <cstdint>
 
@@ -11,9 +12,44 @@ namespace orvane
 namespace
 {
 
-bool write(const std::string& path, const PropertyValue& snapshot)
+// Far below what a property list may be nested, the snapshot's own levels included.
+constexpr std::size_t kDeepest = 500;
+
+bool isStorable(const PropertyValue& value) { return writeXmlPropertyList(value).has_value(); }
+
+// The value with what XML cannot hold put into words that it can: control characters and broken
+// UTF-8 of texts, dates of no year, trees without a bottom.
+PropertyValue storable(const PropertyValue& value, std::size_t depth = 0)
+{
+    if (depth >= kDeepest)
+        return "(" + std::string(value.typeName()) + ")";
+    if (const PropertyDictionary* dictionary = value.asDictionary()) {
+        PropertyValue copy = PropertyValue::newDictionary();
+        for (const auto& [key, entry] : *dictionary)
+            copy.asDictionary()->set(isStorable(key) ? key : shownText(key),
+                                     storable(entry, depth + 1));
+        return copy;
+    }
+    if (const PropertyArray* array = value.asArray()) {
+        PropertyValue copy = PropertyValue::newArray();
+        for (const PropertyValue& element : *array)
+            copy.asArray()->append(storable(element, depth + 1));
+        return copy;
+    }
+    return isStorable(value) ? value : PropertyValue(shownText(value.description()));
+}
+
+// Unchanged wherever that can be: a text that the network sent must not keep the rest from being
+// saved.
+std::optional<std::string> xmlOf(const PropertyValue& snapshot)
 {
     const std::optional<std::string> xml = writeXmlPropertyList(snapshot);
+    return xml ? xml : writeXmlPropertyList(storable(snapshot));
+}
+
+bool write(const std::string& path, const PropertyValue& snapshot)
+{
+    const std::optional<std::string> xml = xmlOf(snapshot);
     return xml &&
            writeFile(path, {reinterpret_cast<const std::uint8_t*>(xml->data()), xml->size()});
 }

@@ -60,11 +60,7 @@ PropertyValue GSMLogGenerator::getStartCommand() const
 
 PropertyValue GSMLogGenerator::getSaveContentsFromState(PropertyDictionary& state)
 {
-    PropertyValue contents = PropertyValue::newArray();
-    if (const PropertyArray* history = state[kHistoryKey].asArray())
-        for (const PropertyValue& snapshot : *history)
-            contents.asArray()->append(snapshot);
-    return contents;
+    return historyOf(state);
 }
 
 PropertyValue GSMLogGenerator::processObject(const PropertyValue& object)

@@ -60,15 +60,20 @@ int removeStale(const std::string& path, const sockaddr_un& address)
     const FileDescriptor probe = newStreamSocket();
     if (!probe)
         return errno;
-    if (connectTo(probe.get(), address) != ECONNREFUSED)
+    const int probed = connectTo(probe.get(), address);
+    if (probed == 0 || probed == EAGAIN || probed == EINPROGRESS)
         return EADDRINUSE;
+    if (probed != ECONNREFUSED && probed != ENOENT)
+        return probed;
     return ::unlink(path.c_str()) == 0 || errno == ENOENT ? 0 : errno;
 }
 
 std::string reason(const std::string& path, int error)
 {
     if (error == EADDRINUSE)
-        return "The port " + path + " is in use by a running program.";
+        return "The port " + path +
+               " is in use by a running program: end that, or choose another directory with "
+               "--ports DIR";
     if (error == EEXIST)
         return "The port " + path + " cannot be made: something else has that name.";
     return "The port " + path + " cannot be made: " + errorText(error);

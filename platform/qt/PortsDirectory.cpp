@@ -8,6 +8,7 @@
 #include <fcntl.h>
 #include <filesystem>
 #include <sys/stat.h>
+#include <sys/un.h>
 #include <system_error>
 
 namespace orvane
@@ -64,10 +65,17 @@ int makeWithParents(const std::string& path)
 
 std::string elsewhere() { return "choose another with --ports DIR."; }
 
+// The longest path that leaves room in a socket address for "/", the longest name that Orvane gives
+// a port ("OrvaneApp." and a UUID) and the final NUL.
+constexpr std::size_t kLongestPath = sizeof(sockaddr_un::sun_path) - 1 - 46 - 1;
+
 // What is wrong with the directory; empty if nothing is.
 std::string objection(const std::string& path)
 {
     const std::string name = "The ports directory " + path;
+    if (path.size() > kLongestPath)
+        return name + " has a longer path than the " + std::to_string(kLongestPath) +
+               " bytes that leave room for the names of ports; " + elsewhere();
     const uid_t user = ::geteuid();
     struct stat found {
     };
@@ -113,7 +121,9 @@ PrivatePortsDirectory::PrivatePortsDirectory()
 {
     for (const std::string& base : {runtimeDirectory(), std::string("/tmp")}) {
         std::string path = base + "/orvane-XXXXXX";
-        if (!base.empty() && ::mkdtemp(path.data())) {
+        if (base.empty() || path.size() > kLongestPath)
+            continue;
+        if (::mkdtemp(path.data())) {
             _path = std::move(path);
             return;
         }

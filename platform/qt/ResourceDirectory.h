@@ -5,8 +5,8 @@
 namespace orvane
 {
 
-// Where the application's resources are: the share directory beside the program's own, as
-// installed, else `sourceDirectory`, as run from the build.
-std::string resourceDirectory(const std::string& sourceDirectory);
+// Where the application's resources are: as installed, the directory `share` (relative to the one
+// that holds the program's own), else `sourceDirectory`, as run from the build.
+std::string resourceDirectory(const std::string& share, const std::string& sourceDirectory);
 
 } // namespace orvane

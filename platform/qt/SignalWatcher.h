@@ -20,7 +20,7 @@ public:
 
     // Throws std::system_error when the process has run out of descriptors, and
     // std::invalid_argument for a number that is no signal or cannot be caught.
-    explicit SignalWatcher(Callback callback, std::vector<int> signals = {SIGINT, SIGTERM});
+    explicit SignalWatcher(Callback callback, std::vector<int> signals = {SIGINT, SIGTERM, SIGHUP});
     ~SignalWatcher();
     SignalWatcher(const SignalWatcher&) = delete;
     SignalWatcher& operator=(const SignalWatcher&) = delete;

@@ -68,6 +68,7 @@ TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
         {{"--refresh", "nan"},        "refresh"                    },
         {{"--log", "paper"},          "--log takes"                },
         {{"--log-level", "loud"},     "--log-level takes"          },
+        {{"--demo", "lte"},           "write --demo=lte"           },
         {{"open"},                    "orvane --help"              },
         {{"--frobnicate"},            "--frobnicate"               },
     };

@@ -380,6 +380,30 @@ TEST_F(ConnectionTest, AServerThatDiesWithNewsUnshownStillShowsThem)
     EXPECT_EQ(shownCellId(), "1");
 }
 
+TEST_F(ConnectionTest, AnUnknownTechnologyOnReconnectionKeepsTheTreeAndTheHistory)
+{
+    startConnected();
+    ASSERT_TRUE(server.sendLogMessage(servingCellPacket(1)));
+    queue.advance(1s);
+    server.technology = "kTSSomethingElse";
+    server.closeChannels();
+    observer.onUpdate = [this] { model->topLevelNodes(); };
+    queue.advance(1s);
+    EXPECT_FALSE(model->isConnected());
+    EXPECT_EQ(shownCellId(), "1");
+    EXPECT_EQ(model->getSaveContents().asArray()->size(), 1U);
+}
+
+TEST_F(ConnectionTest, ARefreshWithAnArgumentIgnoresIt)
+{
+    startConnected();
+    ASSERT_TRUE(server.sendLogMessage(servingCellPacket(1)));
+    queue.runPending();
+    model->refresh(this);
+    queue.runPending();
+    EXPECT_EQ(observer.updates, 1);
+}
+
 TEST_F(ConnectionTest, TheHistoryGoesOverToAGeneratorOfTheSameClassOnly)
 {
     const auto snapshots = [this] { return model->getSaveContents().asArray()->size() - 1; };

@@ -91,4 +91,28 @@ TEST_F(SnapshotFileTest, ASecondSaveWithinTheSecondReplacesTheFirst)
     EXPECT_EQ(read(second)["Description"], PropertyValue("b"));
 }
 
+TEST_F(SnapshotFileTest, ATextThatXmlCannotHoldDoesNotKeepTheRestFromBeingSaved)
+{
+    makeFolder();
+    PropertyValue deep = "bottom";
+    for (int level = 0; level < 600; ++level)
+        deep = PropertyValue::arrayOf({deep});
+    const PropertyValue history = PropertyValue::arrayOf({
+        PropertyValue::dictionaryOf({{"APN", std::string("net\0x", 5)},
+                                     {"bad\x01key", "kept"},
+                                     {"When", PropertyValue::date({1e300})},
+                                     {"Good", PropertyValue::integer(7)}}
+        ),
+        deep
+    });
+    const SnapshotResult result = writeSnapshotFile(files, history, 0, "");
+    ASSERT_TRUE(result.isWritten);
+    const PropertyValue data = read(result.path)["Data"];
+    const PropertyValue& entry = (*data.asArray())[0];
+    EXPECT_EQ(entry["APN"], PropertyValue("net x"));
+    EXPECT_EQ(entry["bad key"], PropertyValue("kept"));
+    EXPECT_TRUE(entry["When"].asString());
+    EXPECT_EQ(entry["Good"], PropertyValue::integer(7));
+}
+
 } // namespace orvane

@@ -49,7 +49,7 @@ void appendJsonString(std::string& to, std::string_view text)
 {
     std::string replaced;
     if (!isValidUtf8(text)) {
-        replaced = shownText(text);
+        replaced = validText(text);
         text = replaced;
     }
     to += '"';

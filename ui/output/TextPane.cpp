@@ -36,7 +36,7 @@ std::string TextPane::statusOutput(const std::string& status, bool,
 
 std::string TextPane::savedOutput(const std::string& path) const
 {
-    return block("Saved to " + path + "\n");
+    return block("Saved to " + shownText(path) + "\n");
 }
 
 std::string TextPane::alertOutput(const std::string& title, const std::string& message) const
@@ -46,7 +46,7 @@ std::string TextPane::alertOutput(const std::string& title, const std::string& m
 
 std::string TextPane::errorOutput(const std::string& text) const
 {
-    return block("Error: " + text + "\n");
+    return block("Error: " + shownText(text) + "\n");
 }
 
 } // namespace orvane
