@@ -23,6 +23,8 @@ END
     put platform/qt/Loop.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <QObject>'
     put tests/support/Helper.cpp <<<'#include "support/Helper.h"'
     put tests/support/Helper.h <<<'#pragma once'
+    put fuzz/Target.h <<<'#pragma once'
+    put fuzz/values.cpp <<<'#include "Target.h"'
     put tests/app/Shell_test.cpp <<<$'#include "app/Shell.h"\n#include "support/Helper.h"'
 }
 
