@@ -3,7 +3,7 @@
 namespace orvane
 {
 
-void C2KPublisher::publish(const char* stateKey, const PropertyValue& value) const
+void C2KPublisher::publish(std::string_view stateKey, const PropertyValue& value) const
 {
     const PropertyArray* entries = _lookup[stateKey].asArray();
     if (!entries)

@@ -4,6 +4,7 @@
 #include "platform/PropertyValue.h"
 
 #include <span>
+#include <string_view>
 
 namespace orvane
 {
@@ -22,7 +23,7 @@ public:
 
     // Stores the value, a string or a dictionary, in every row of the state key, and stops at the
     // first entry that is not as it should be.
-    void publish(const char* stateKey, const PropertyValue& value) const;
+    void publish(std::string_view stateKey, const PropertyValue& value) const;
     // Publishes each field of the packet that is there; the fields' rows are state keys.
     void publish(PacketView packet, std::span<const Field> fields) const;
     // Publishes one text under the state keys of all fields.
