@@ -10,7 +10,7 @@ namespace orvane
 {
 
 // The registry through which a generator finds the sections for a log code and for a template key.
-// Each technology has a subclass whose constructor makes its sections.
+// Each technology has a subclass whose `init` makes its sections.
 class ClassIndex
 {
 public:

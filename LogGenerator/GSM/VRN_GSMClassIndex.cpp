@@ -5,22 +5,34 @@
 namespace orvane
 {
 
-VRN_GSMClassIndex::VRN_GSMClassIndex()
-    : objActiveSet(make<ActiveSet>()), objCodingScheme(make<CodingScheme>()),
-      objGPRSInformation(make<GPRSInformation>()), objGSMServingCell(make<GSMServingCell>()),
-      objMobileAllocation(make<MobileAllocation>()), objNeighboringCells(make<NeighboringCells>()),
-      objPDPContextList(make<PDPContextList>()), objProcessPS(make<ProcessPS>()),
-      objUMTSRRMeasurement(make<UMTSRRMeasurement>()),
-      objCellChangeCounter(make<CellChangeCounters>()), objDetectedSet(make<DetectedSet>()),
-      objGSMSet(make<GSMSet>()), objNonRankedGSMSet(make<NonRankedGSMSet>()),
-      objProcessCO(make<ProcessCO>()), objServingPLMN(make<ServingPLMN>()),
-      objUMTSSet(make<UMTSSet>()), objEquivalentPLMNList(make<EquivalentPLMNList>()),
-      objGSMRRInfo(make<GSMRRInfo>()), objMonitoredSet(make<MonitoredSet>()),
-      objNonRankedUMTSSet(make<NonRankedUMTSSet>()), objProcessCS(make<ProcessCS>()),
-      objUMTSRRInfo(make<UMTSRRInfo>()), objBLER(make<BLER>()),
-      objVirtualActiveSet(make<VirtualActiveSet>()), objSimInfo(make<SimInfo>()),
-      objHSDPAInformation(make<HSDPAInformation>())
+void VRN_GSMClassIndex::init()
 {
+    objActiveSet = make<ActiveSet>();
+    objCodingScheme = make<CodingScheme>();
+    objGPRSInformation = make<GPRSInformation>();
+    objGSMServingCell = make<GSMServingCell>();
+    objMobileAllocation = make<MobileAllocation>();
+    objNeighboringCells = make<NeighboringCells>();
+    objPDPContextList = make<PDPContextList>();
+    objProcessPS = make<ProcessPS>();
+    objUMTSRRMeasurement = make<UMTSRRMeasurement>();
+    objCellChangeCounter = make<CellChangeCounters>();
+    objDetectedSet = make<DetectedSet>();
+    objGSMSet = make<GSMSet>();
+    objNonRankedGSMSet = make<NonRankedGSMSet>();
+    objProcessCO = make<ProcessCO>();
+    objServingPLMN = make<ServingPLMN>();
+    objUMTSSet = make<UMTSSet>();
+    objEquivalentPLMNList = make<EquivalentPLMNList>();
+    objGSMRRInfo = make<GSMRRInfo>();
+    objMonitoredSet = make<MonitoredSet>();
+    objNonRankedUMTSSet = make<NonRankedUMTSSet>();
+    objProcessCS = make<ProcessCS>();
+    objUMTSRRInfo = make<UMTSRRInfo>();
+    objBLER = make<BLER>();
+    objVirtualActiveSet = make<VirtualActiveSet>();
+    objSimInfo = make<SimInfo>();
+    objHSDPAInformation = make<HSDPAInformation>();
 }
 
 VRN_GSMClassIndex::~VRN_GSMClassIndex()

@@ -35,8 +35,9 @@ namespace orvane
 class VRN_GSMClassIndex final : public ClassIndex
 {
 public:
-    VRN_GSMClassIndex();
     ~VRN_GSMClassIndex() override;
+    // Makes and registers the sections.
+    void init();
 
 private:
     std::unique_ptr<ActiveSet> objActiveSet;

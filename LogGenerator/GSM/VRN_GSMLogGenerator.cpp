@@ -3,6 +3,8 @@
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
 #include "platform/SystemLog.h"
 
+#include <utility>
+
 namespace orvane
 {
 
@@ -14,7 +16,9 @@ VRN_GSMLogGenerator::~VRN_GSMLogGenerator()
 void VRN_GSMLogGenerator::init()
 {
     logError("Creating VRN_GSMLogGenerator object");
-    initWithPListName("VRN_GSM", std::make_shared<VRN_GSMClassIndex>());
+    auto index = std::make_shared<VRN_GSMClassIndex>();
+    index->init();
+    initWithPListName("VRN_GSM", std::move(index));
 }
 
 std::unique_ptr<LogGenerator> VRN_GSMLogGenerator::generator()

@@ -5,18 +5,19 @@
 namespace orvane
 {
 
-LTEClassIndex::LTEClassIndex()
-    : objLTEServingCellInfo(make<LTEServingCellInfo>()),
-      objConnectedModeMeasurementMisc(make<ConnectedModeMeasurementMisc>()),
-      objMeasuredNeighborCells(make<MeasuredNeighborCells>()),
-      objDetectedCells(make<DetectedCells>()),
-      objServingCellMeasurement(make<ServingCellMeasurement>()),
-      objNeighborMeasurementMisc(make<NeighborMeasurementMisc>()),
-      objNeighborCellsList(make<NeighborCellsList>()),
-      objReselectionCandidatesMisc(make<ReselectionCandidatesMisc>()),
-      objReselectionCandidatesList(make<ReselectionCandidatesList>()), objSimInfo(make<SimInfo>()),
-      objPDPContextList(make<PDPContextList>())
+void LTEClassIndex::init()
 {
+    objLTEServingCellInfo = make<LTEServingCellInfo>();
+    objConnectedModeMeasurementMisc = make<ConnectedModeMeasurementMisc>();
+    objMeasuredNeighborCells = make<MeasuredNeighborCells>();
+    objDetectedCells = make<DetectedCells>();
+    objServingCellMeasurement = make<ServingCellMeasurement>();
+    objNeighborMeasurementMisc = make<NeighborMeasurementMisc>();
+    objNeighborCellsList = make<NeighborCellsList>();
+    objReselectionCandidatesMisc = make<ReselectionCandidatesMisc>();
+    objReselectionCandidatesList = make<ReselectionCandidatesList>();
+    objSimInfo = make<SimInfo>();
+    objPDPContextList = make<PDPContextList>();
 }
 
 LTEClassIndex::~LTEClassIndex()

@@ -20,8 +20,9 @@ namespace orvane
 class LTEClassIndex final : public ClassIndex
 {
 public:
-    LTEClassIndex();
     ~LTEClassIndex() override;
+    // Makes and registers the sections.
+    void init();
 
 private:
     std::unique_ptr<LTEServingCellInfo> objLTEServingCellInfo;

@@ -3,6 +3,8 @@
 #include "LogGenerator/LTE/LTEClassIndex.h"
 #include "platform/SystemLog.h"
 
+#include <utility>
+
 namespace orvane
 {
 
@@ -14,7 +16,9 @@ LTELogGenerator::~LTELogGenerator()
 void LTELogGenerator::init()
 {
     logError("Creating LTELogGenerator object");
-    initWithPListName("LTE", std::make_shared<LTEClassIndex>());
+    auto index = std::make_shared<LTEClassIndex>();
+    index->init();
+    initWithPListName("LTE", std::move(index));
 }
 
 std::unique_ptr<LogGenerator> LTELogGenerator::generator()

@@ -3,6 +3,9 @@
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LogCodes.h"
 
+#include <algorithm>
+#include <iterator>
+
 namespace orvane
 {
 
@@ -62,8 +65,9 @@ std::span<const Field> bodyFields(PacketView record)
     return technology ? technologyOf(*technology).fields : std::span<const Field>();
 }
 
-// The count has 16 bits at 19, but only the low byte is walked; and candidates stand 4 bytes apart,
-// so that one's body lies where the next one's header is. Both are meant.
+// The count has 16 bits at 19, of which only the low byte is walked. This is meant.
+// Candidates stand 4 bytes apart, so that one's body lies where the next one's header is. This is
+// meant.
 constexpr RecordLayout kCandidates = {countAt<19>, startAt<21>, 4, kHeaderFields};
 
 constexpr PacketLayout kPackets[] = {

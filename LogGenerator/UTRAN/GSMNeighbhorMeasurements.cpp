@@ -38,12 +38,11 @@ std::vector<PropertyValue> GSMNeighbhorMeasurements::decodedCells(PacketView pac
     return kCells.rowsIn(packet);
 }
 
-std::vector<PropertyValue> GSMNeighbhorMeasurements::elements(PacketView packet,
-                                                              const PacketLayout&)
+void GSMNeighbhorMeasurements::decode(PacketView packet, const PacketLayout&)
 {
+    clearElementsInArray(list().get());
     // The decoded cells are dropped, so that every packet leaves an empty list. This is meant.
     decodedCells(packet);
-    return {};
 }
 
 } // namespace orvane

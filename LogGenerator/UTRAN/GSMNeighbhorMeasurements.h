@@ -15,7 +15,7 @@ public:
     static std::vector<PropertyValue> decodedCells(PacketView packet);
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void decode(PacketView packet, const PacketLayout& layout) override;
 };
 
 } // namespace orvane

@@ -3,14 +3,16 @@
 namespace orvane
 {
 
-UTRANClassIndex::UTRANClassIndex()
-    : rrc_state(make<RRC_State>()), servingCellInfo(make<UTRANServingCellInfo>()),
-      tdMeasurements(make<UTRANNeighbhorMeasurements>()),
-      gsmMeasurements(make<GSMNeighbhorMeasurements>()),
-      trchMeasurements(make<TRCHBLERMeasurement>()),
-      cctrchMeasurements(make<CCTRCHSIRMeasurement>()), pdpList(make<PDPContextList>()),
-      simInfo(make<SimInfo>())
+void UTRANClassIndex::init()
 {
+    rrc_state = make<RRC_State>();
+    servingCellInfo = make<UTRANServingCellInfo>();
+    tdMeasurements = make<UTRANNeighbhorMeasurements>();
+    gsmMeasurements = make<GSMNeighbhorMeasurements>();
+    trchMeasurements = make<TRCHBLERMeasurement>();
+    cctrchMeasurements = make<CCTRCHSIRMeasurement>();
+    pdpList = make<PDPContextList>();
+    simInfo = make<SimInfo>();
 }
 
 UTRANClassIndex::~UTRANClassIndex()

@@ -17,8 +17,9 @@ namespace orvane
 class UTRANClassIndex final : public ClassIndex
 {
 public:
-    UTRANClassIndex();
     ~UTRANClassIndex() override;
+    // Makes and registers the sections.
+    void init();
 
 private:
     std::unique_ptr<RRC_State> rrc_state;

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <utility>
 
 namespace orvane
 {
@@ -32,8 +33,9 @@ void UTRANLogGenerator::init()
     // Without a template the base is not initialised, and nothing is said. This is meant.
     if (path == paths.end())
         return;
-    initWithPListName(std::filesystem::path(*path).stem().string(),
-                      std::make_shared<UTRANClassIndex>());
+    auto index = std::make_shared<UTRANClassIndex>();
+    index->init();
+    initWithPListName(std::filesystem::path(*path).stem().string(), std::move(index));
     logError("Created UTRANLogGenerator object");
 }
 

@@ -21,7 +21,9 @@ using ::testing::IsEmpty;
 template <typename Index>
 std::unique_ptr<ClassIndex> makeIndex()
 {
-    return std::make_unique<Index>();
+    auto index = std::make_unique<Index>();
+    index->init();
+    return index;
 }
 
 struct Shipped {

@@ -52,6 +52,8 @@ const ExpectedSection kSections[] = {
 class VRN_GSMClassIndexTest : public ::testing::Test
 {
 protected:
+    VRN_GSMClassIndexTest() { index.init(); }
+
     [[nodiscard]] std::vector<std::string> subscribers(std::uint32_t code) const
     {
         std::vector<std::string> names;
@@ -114,7 +116,8 @@ TEST(VRN_GSMClassIndexLifeTest, SaysWhenItGoesBeforeItsBaseDoes)
 {
     TestServices services;
     {
-        const VRN_GSMClassIndex index;
+        VRN_GSMClassIndex index;
+        index.init();
     }
     EXPECT_THAT(services.console.lines,
                 ElementsAre("Deallocing VRN_GSMClassIndex", "Deallocing ClassIndex"));

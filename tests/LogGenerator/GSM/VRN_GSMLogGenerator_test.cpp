@@ -73,7 +73,8 @@ TEST_F(VRN_GSMLogGeneratorTest, TheTemplateGivesEverySectionItsPartAndHoldsNothi
     services.log.lines.clear();
     send(PacketBuilder(0x4125, 14));
     EXPECT_THAT(services.log.errors(), IsEmpty());
-    const VRN_GSMClassIndex index;
+    VRN_GSMClassIndex index;
+    index.init();
     for (const auto& [name, owner] : index.sections())
         EXPECT_EQ(section(name.c_str()).type(), owner->subtreeType()) << name;
     EXPECT_EQ(state["Display"].asDictionary()->size(), index.sections().size());

@@ -35,7 +35,8 @@ protected:
 
 TEST_F(LTEClassIndexTest, MakesItsSectionsInOrder)
 {
-    const LTEClassIndex index;
+    LTEClassIndex index;
+    index.init();
     std::vector<std::string> names;
     for (const auto& [name, section] : index.sections()) {
         names.push_back(name);
@@ -50,7 +51,8 @@ TEST_F(LTEClassIndexTest, MakesItsSectionsInOrder)
 
 TEST_F(LTEClassIndexTest, SectionsShareCodesInTheOrderInWhichTheyAreMade)
 {
-    const LTEClassIndex index;
+    LTEClassIndex index;
+    index.init();
     EXPECT_THAT(subscribers(index, 0xB0C2), ElementsAre("Serving Cell Info"));
     EXPECT_THAT(subscribers(index, 0xB0C1), ElementsAre("Serving Cell Info"));
     EXPECT_THAT(subscribers(index, 0xFF0001), ElementsAre("Serving Cell Info"));
@@ -80,7 +82,8 @@ TEST_F(LTEClassIndexTest, TheStartCommandAsksForAllCodes)
 TEST_F(LTEClassIndexTest, ItsEndIsToldOnTheConsole)
 {
     {
-        const LTEClassIndex index;
+        LTEClassIndex index;
+        index.init();
     }
     EXPECT_THAT(services.console.lines,
                 ElementsAre("Deallocing LTEClassIndex", "Deallocing ClassIndex"));

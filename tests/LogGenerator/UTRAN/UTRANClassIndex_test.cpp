@@ -33,7 +33,8 @@ std::vector<std::string> subscribers(const ClassIndex& index, std::uint32_t code
 
 TEST_F(UTRANClassIndexTest, MakesItsSectionsInOrder)
 {
-    const UTRANClassIndex index;
+    UTRANClassIndex index;
+    index.init();
     std::vector<std::string> names;
     for (const auto& [name, section] : index.sections()) {
         names.push_back(name);
@@ -46,7 +47,8 @@ TEST_F(UTRANClassIndexTest, MakesItsSectionsInOrder)
 
 TEST_F(UTRANClassIndexTest, SectionsShareCodesInTheOrderInWhichTheyAreMade)
 {
-    const UTRANClassIndex index;
+    UTRANClassIndex index;
+    index.init();
     EXPECT_THAT(subscribers(index, 0xD0E0), ElementsAre("RRC Info"));
     EXPECT_THAT(subscribers(index, 0xD0E2), ElementsAre("Serving Cell Info"));
     EXPECT_THAT(subscribers(index, 0xFF0001), ElementsAre("Serving Cell Info"));
@@ -62,7 +64,8 @@ TEST_F(UTRANClassIndexTest, SectionsShareCodesInTheOrderInWhichTheyAreMade)
 TEST_F(UTRANClassIndexTest, OnlyTheBaseTellsOfItsEndOnTheConsole)
 {
     {
-        const UTRANClassIndex index;
+        UTRANClassIndex index;
+        index.init();
     }
     EXPECT_THAT(services.console.lines, ElementsAre("Deallocing ClassIndex"));
 }
