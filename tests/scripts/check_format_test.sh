@@ -21,6 +21,19 @@ expect_lacks "$output" "Good"
 expect_lacks "$output" "build/"
 expect_equal "$(cat app/Bad.cpp)" 'int  bad( ){return 1;}'
 
+case_named "a file that clang-format dies of is named, and the others are still looked at"
+stand_in "$scratch/dying" clang-format-14 <<'END'
+case "$*" in
+--version) echo "clang-format version 14.0.6" ;;
+*Good*) kill -SEGV $$ ;;
+*) clang-format "$@" ;;
+esac
+END
+output=$(PATH=$scratch/dying:$PATH "$tree/tools/check-format" . 2>/dev/null) && status=0 || status=$?
+expect_equal "$status" 1
+expect_contains "$output" "app/Good.cpp: clang-format-14 crashes on it"
+expect_contains "$output" "app/Bad.cpp:1: differs"
+
 case_named "--fix changes them"
 "$tree/tools/check-format" --fix .
 expect_equal "$(cat app/Bad.cpp)" 'int bad() { return 1; }'
