@@ -290,9 +290,16 @@ TEST(PropertyListBinaryReaderTest, OverlappingObjectsAreRefused)
 
     // The same object twice in the table.
     BinaryListBuilder same;
-    same.boolean(true);
+    same.raw(hexBytes("52 51 62"));
     same.offsets.push_back(kFirst);
     expectFault(same, "overlapping objects" + at(kFirst));
+
+    // More objects than bytes, which no reading of offsets is needed for: the count at the
+    // trailer's ninth byte is told.
+    BinaryListBuilder crowded;
+    crowded.boolean(true);
+    crowded.offsets.push_back(kFirst);
+    expectFault(crowded, "more objects than bytes for them" + at(kFirst + 1 + 2 + 8));
 
     // The later object first in the table, and nothing refers to the earlier.
     BinaryListBuilder reversed;

@@ -63,7 +63,10 @@ TEST_F(QtFrameTransportTest, ALivePortMakesListeningFailAndKeepsServing)
 {
     const auto first = listen("Port");
     ASSERT_TRUE(first);
-    EXPECT_EQ(refusal("Port"), "The port " + pathOf("Port") + " is in use by a running program.");
+    EXPECT_EQ(refusal("Port"),
+              "The port " + pathOf("Port") +
+                  " is in use by a running program: end that, or choose another directory with "
+                  "--ports DIR");
     EXPECT_TRUE(isServed(*first, "Port"));
 }
 
