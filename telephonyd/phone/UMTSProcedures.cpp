@@ -67,7 +67,9 @@ milliseconds UMTSScenario::updateLocation(milliseconds at)
 
 void UMTSScenario::updateRoutingArea(milliseconds at, bool isAttach)
 {
-    _agenda.add(at, packetMobility(PacketState::Registered, PacketSubState::UpdateNeeded, false));
+    if (!isAttach)
+        _agenda.add(at,
+                    packetMobility(PacketState::Registered, PacketSubState::UpdateNeeded, false));
     _agenda.add(at + milliseconds(200), packetMobility(isAttach ? PacketState::AttachInitiated
                                                                 : PacketState::AreaUpdateInitiated,
                                                        PacketSubState::None, false));

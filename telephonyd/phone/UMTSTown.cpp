@@ -24,9 +24,9 @@ constexpr std::array<Site, kUMTSTownCells> kSites = {
      {420, 400, -81, {false, 199, 37, 11072, 1005, 2}},
      {640, 200, -84, {false, 214, 45, 11080, 1005, 2}},
      {760, 40, -80, {true, 612, 9, 0x0513A01, 1006, 1}},
-     {980, -80, -79, {true, 612, 26, 0x0513A02, 1006, 1}},
-     {1130, 70, -79, {true, 612, 41, 0x0513B01, 1006, 1}},
-     {1290, 20, -79, {true, 612, 57, 0x0513B02, 1006, 1}},
+     {980, -140, -78, {true, 612, 26, 0x0513A02, 1006, 1}},
+     {1130, 150, -79, {true, 612, 41, 0x0513B01, 1006, 1}},
+     {1290, -70, -79, {true, 612, 57, 0x0513B02, 1006, 1}},
      {1330, 260, -78, {true, 637, 12, 0x0513C01, 1006, 2}},
      {1100, 420, -79, {true, 637, 30, 0x0513C02, 1006, 2}},
      {900, 310, -79, {true, 612, 62, 0x0513D01, 1006, 2}},
@@ -57,12 +57,12 @@ constexpr std::array<UMTSTownCell, kUMTSTownCells> kUMTSTown = townCells();
 constexpr std::array<DriveCell, kUMTSTownCells> kUMTSTownMasts = townMasts();
 constexpr std::array<RoadPoint, 6> kUMTSTownRoad = {
     {
-     {0, 0},
-     {600, 20},
      {1250, 0},
      {1250, 340},
      {560, 360},
      {0, 300},
+     {0, 0},
+     {600, 20},
      }
 };
 
