@@ -32,7 +32,7 @@ std::int64_t valueOf(const Field& field, const Bytes& bytes)
 
 } // namespace
 
-TEST(FieldTest, ReadsUnsignedUnlessToldOtherwise)
+TEST(PacketFieldTest, ReadsUnsignedUnlessToldOtherwise)
 {
     const Bytes bytes = {0xFE, 0xFF, 0xFF, 0xFF};
     EXPECT_EQ(valueOf(bytesField("", 0, 1, decimal), bytes), 254);
@@ -40,7 +40,7 @@ TEST(FieldTest, ReadsUnsignedUnlessToldOtherwise)
     EXPECT_EQ(valueOf(bytesField("", 0, 4, decimal), bytes), 4294967294);
 }
 
-TEST(FieldTest, ReadsSignedFieldsInTwosComplement)
+TEST(PacketFieldTest, ReadsSignedFieldsInTwosComplement)
 {
     const Bytes bytes = {0xFE, 0xFF, 0xFF, 0x7F};
     EXPECT_EQ(valueOf(bytesField("", 0, 1, decimal, Coding::Signed), bytes), -2);
@@ -51,7 +51,7 @@ TEST(FieldTest, ReadsSignedFieldsInTwosComplement)
     EXPECT_EQ(valueOf(bytesField("", 0, 4, decimal, Coding::Signed), lowest), -2147483648LL);
 }
 
-TEST(FieldTest, ReadsBigEndianFields)
+TEST(PacketFieldTest, ReadsBigEndianFields)
 {
     const Bytes bytes = {0x12, 0x34, 0x56, 0xF8};
     EXPECT_EQ(valueOf(bytesField("", 0, 2, decimal, Coding::BigEndian), bytes), 4660);
@@ -59,14 +59,14 @@ TEST(FieldTest, ReadsBigEndianFields)
     EXPECT_EQ(valueOf(bytesField("", 3, 1, decimal, Coding::BigEndian), bytes), 0xF8);
 }
 
-TEST(FieldTest, ReadsBitsAcrossBytes)
+TEST(PacketFieldTest, ReadsBitsAcrossBytes)
 {
     const Bytes bytes = {0x80, 0x01};
     EXPECT_EQ(valueOf(bitsField("", 0, 7, 2, decimal), bytes), 3);
     EXPECT_EQ(valueOf(bitsField("", 0, 6, 4, decimal), bytes), 6);
 }
 
-TEST(FieldTest, AFieldThatThePacketCutsOffIsNotThere)
+TEST(PacketFieldTest, AFieldThatThePacketCutsOffIsNotThere)
 {
     const Bytes bytes = {1, 2};
     EXPECT_EQ(bytesField("", 1, 2, decimal).valueIn(PacketView(bytes)), std::nullopt);
@@ -74,7 +74,7 @@ TEST(FieldTest, AFieldThatThePacketCutsOffIsNotThere)
     EXPECT_EQ(bytesField("", 65535, 4, decimal).valueIn(PacketView(bytes)), std::nullopt);
 }
 
-TEST(FieldTest, RowsAreWrittenInTheTablesOrder)
+TEST(PacketFieldTest, RowsAreWrittenInTheTablesOrder)
 {
     PropertyDictionary rows;
     writeRows(&rows, PacketView(Bytes{1, 2, 3, 4}), kFields);
@@ -82,7 +82,7 @@ TEST(FieldTest, RowsAreWrittenInTheTablesOrder)
               "{Second = 2; First = 1; Odd = 3; Word = 1027}");
 }
 
-TEST(FieldTest, ARowBeyondThePacketsEndIsLeftAndTheOthersAreWritten)
+TEST(PacketFieldTest, ARowBeyondThePacketsEndIsLeftAndTheOthersAreWritten)
 {
     PropertyDictionary rows;
     rows.set("Word", "earlier");
@@ -91,7 +91,7 @@ TEST(FieldTest, ARowBeyondThePacketsEndIsLeftAndTheOthersAreWritten)
     EXPECT_EQ(rows["Odd"], PropertyValue("3"));
 }
 
-TEST(FieldTest, AFormatThatGivesNothingLeavesItsRow)
+TEST(PacketFieldTest, AFormatThatGivesNothingLeavesItsRow)
 {
     PropertyDictionary rows;
     writeRows(&rows, PacketView(Bytes{1, 2, 4, 0}), kFields);
@@ -99,14 +99,14 @@ TEST(FieldTest, AFormatThatGivesNothingLeavesItsRow)
     EXPECT_EQ(rows["Word"], PropertyValue("4"));
 }
 
-TEST(FieldTest, WithoutRowsNothingIsWritten)
+TEST(PacketFieldTest, WithoutRowsNothingIsWritten)
 {
     writeRows(nullptr, PacketView(Bytes{1, 2, 3, 4}), kFields);
     setRow(nullptr, "Row", "text");
     setListRow(nullptr, "Row", {"text"});
 }
 
-TEST(FieldTest, ARowReplacesWhateverStoodThere)
+TEST(PacketFieldTest, ARowReplacesWhateverStoodThere)
 {
     PropertyDictionary rows;
     rows.set("First", PropertyValue::newArray());
@@ -117,7 +117,7 @@ TEST(FieldTest, ARowReplacesWhateverStoodThere)
     EXPECT_EQ(rows.begin()->first, "First"); // at its place
 }
 
-TEST(FieldTest, TextsTakenFromARowDoNotChangeWithIt)
+TEST(PacketFieldTest, TextsTakenFromARowDoNotChangeWithIt)
 {
     PropertyDictionary rows;
     setRow(&rows, "Row", "a text that is too long to be kept inside of a string");
@@ -126,7 +126,7 @@ TEST(FieldTest, TextsTakenFromARowDoNotChangeWithIt)
     EXPECT_EQ(taken, PropertyValue("a text that is too long to be kept inside of a string"));
 }
 
-TEST(FieldTest, AListRowIsANewArrayEachTime)
+TEST(PacketFieldTest, AListRowIsANewArrayEachTime)
 {
     PropertyDictionary rows;
     setListRow(&rows, "List", {"a", "b"});
