@@ -1,5 +1,7 @@
 #include "telephonyd/phone/Scenarios.h"
 
+#include "telephonyd/phone/CDMAScenario.h"
+#include "telephonyd/phone/CellMonitorScenario.h"
 #include "telephonyd/phone/LTEScenario.h"
 #include "telephonyd/phone/PhoneSource.h"
 #include "telephonyd/phone/UMTSScenario.h"
@@ -23,9 +25,11 @@ struct Entry {
 };
 
 constexpr Entry kScenarios[] = {
-    {"lte",   make<LTEScenario>  },
-    {"umts",  make<UMTSScenario> },
-    {"utran", make<UTRANScenario>},
+    {"lte",         make<LTEScenario>        },
+    {"umts",        make<UMTSScenario>       },
+    {"utran",       make<UTRANScenario>      },
+    {"cdma",        make<CDMAScenario>       },
+    {"cellmonitor", make<CellMonitorScenario>},
 };
 
 } // namespace
