@@ -98,7 +98,7 @@ bool isPilotOfTown(unsigned offset)
 
 TEST(CDMAScenarioTest, TheFirstStepHasOneOfEverything)
 {
-    for (const std::uint64_t seed : {1, 2, 3, 4, 5}) {
+    for (const unsigned seed : {1U, 2U, 3U, 4U, 5U}) {
         const Tour first = drive(seed, 0s);
         EXPECT_EQ(codesBetween(first, 0ms, 0ms), everything()) << "seed " << seed;
         EXPECT_EQ(first.size(), everything().size());

@@ -49,7 +49,7 @@ int numberOf(const PropertyValue& text) { return std::stoi(*text.asString()); }
 
 TEST(CellMonitorScenarioTest, ThereIsAListAtOnceAndAtLeastOneASecond)
 {
-    for (const std::uint64_t seed : {1, 2, 3})
+    for (const unsigned seed : {1U, 2U, 3U})
         EXPECT_EQ(drive(seed, 0s).size(), 1U);
     EXPECT_EQ(CellMonitorScenario(1).technology(), kTSLogChannelTechnology_IFX);
     for (std::size_t i = 1; i < tour().size(); ++i)

@@ -24,7 +24,7 @@ TEST(RadioConnectionTest, StatesFollowOneAnotherAsTheNetworkAllows)
         {CellPch,    {CellFach}                      },
         {UraPch,     {CellFach}                      },
     };
-    for (const std::uint64_t seed : {1, 2, 3}) {
+    for (const unsigned seed : {1U, 2U, 3U}) {
         RadioConnection connection(seed);
         EXPECT_EQ(connection.state(), Idle);
         std::set<RadioState> seen;

@@ -78,7 +78,7 @@ std::set<unsigned> valuesOf(std::uint16_t code, std::size_t offset)
 
 TEST(UMTSScenarioTest, TheFirstStepHasOneOfEverything)
 {
-    for (const std::uint64_t seed : {1, 2, 3, 4, 5, 6, 7, 8})
+    for (const unsigned seed : {1U, 2U, 3U, 4U, 5U, 6U, 7U, 8U})
         EXPECT_EQ(codesBetween(drive(seed, 0s), 0ms, 0ms), everything()) << "seed " << seed;
     EXPECT_EQ(UMTSScenario(1).technology(), kTSLogChannelTechnology_Varnel_GSM);
 }

@@ -56,7 +56,7 @@ const UTRANCell* cellOfIdentity(unsigned identity)
 
 TEST(UTRANScenarioTest, TheFirstStepHasOneOfEverything)
 {
-    for (const std::uint64_t seed : {1, 2, 3, 4, 5})
+    for (const unsigned seed : {1U, 2U, 3U, 4U, 5U})
         EXPECT_EQ(codesBetween(drive(seed, 0s), 0ms, 0ms), everything()) << "seed " << seed;
     EXPECT_EQ(UTRANScenario(1).technology(), kTSLogChannelTechnology_Varnel_UTRAN2);
 }
