@@ -49,10 +49,16 @@ std::size_t UMTSScenario::bestOf(bool isUmts) const
     return best;
 }
 
+// Those that a receiver can make out: by power in GSM, above the other cells' noise in UMTS.
 std::vector<std::size_t> UMTSScenario::othersOf(bool isUmts) const
 {
+    constexpr double kLeastPower = -110;
+    constexpr double kLeastQuality = -20;
     std::vector<std::size_t> found = _drive.neighbours();
-    std::erase_if(found, [&](std::size_t cell) { return kUMTSTown[cell].isUmts != isUmts; });
+    std::erase_if(found, [&](std::size_t cell) {
+        return kUMTSTown[cell].isUmts != isUmts ||
+               (isUmts ? quality(cell) < kLeastQuality : _drive.level(cell) < kLeastPower);
+    });
     return found;
 }
 
@@ -230,8 +236,9 @@ void UMTSScenario::addCells(Messages& messages) const
         cells.asArray()->append(entry);
     };
     append(_drive.serving(), kTSCellMonitorCellTypeServing);
-    for (const std::size_t cell : _drive.neighbours())
-        append(cell, kTSCellMonitorCellTypeNeighbor);
+    for (const bool isUmts : {serving().isUmts, !serving().isUmts})
+        for (const std::size_t cell : othersOf(isUmts))
+            append(cell, kTSCellMonitorCellTypeNeighbor);
     messages.push_back(serverItem(kCellsItem, cells));
 }
 

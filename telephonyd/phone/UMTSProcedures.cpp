@@ -167,7 +167,7 @@ void UMTSScenario::changeUMTSConnection(Messages& messages)
     const bool isRegistering = _now < _registeredAt;
     switch (state) {
     case RadioState::Connecting:
-        if (!isRegistering)
+        if (!isRegistering && _umts.transfers() % 2 == 0) // the next one is of data
             _agenda.add(_now, packetMobility(PacketState::ServiceRequestInitiated,
                                              PacketSubState::None, true));
         break;
