@@ -12,8 +12,7 @@ constexpr std::uint32_t kMeasurementCode = 0xD00A;
 
 RowText filteredPower(std::int64_t raw)
 {
-    constexpr unsigned kSteps = 8; // bits of fraction: a step is 1/256
-    return fixedPoint(raw, kSteps, 6);
+    return printed("%f", static_cast<double>(raw) * 0.00390625); // 256 steps
 }
 
 constexpr const char* kSets[] = {"ASET", "MSET", "DSET"}; // active, monitored, detected
