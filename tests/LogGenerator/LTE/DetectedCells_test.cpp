@@ -88,6 +88,14 @@ TEST_F(DetectedCellsTest, MeasuredCellsBeyondThePacketLeaveNone)
     EXPECT_THAT(records(), IsEmpty());
 }
 
+TEST_F(DetectedCellsTest, APacketOfTheMinimumLengthWithoutRecordsEmptiesTheList)
+{
+    section.updateSectionRef(display);
+    display.asArray()->append("shown before");
+    send(kCode, PacketBuilder(kCode, 29));
+    EXPECT_THAT(display.asArray()->elements(), IsEmpty());
+}
+
 TEST_F(DetectedCellsTest, ShorterPacketsKeepTheList)
 {
     send(kCode, packet(0, 1, 1));

@@ -83,6 +83,14 @@ TEST_F(MeasuredNeighborCellsTest, ACountBeyondThePacketShowsItsWholeCells)
     EXPECT_EQ(records()[2][0].second, "102");
 }
 
+TEST_F(MeasuredNeighborCellsTest, APacketOfTheMinimumLengthWithoutRecordsEmptiesTheList)
+{
+    section.updateSectionRef(display);
+    display.asArray()->append("shown before");
+    send(kCode, PacketBuilder(kCode, 29));
+    EXPECT_THAT(display.asArray()->elements(), IsEmpty());
+}
+
 TEST_F(MeasuredNeighborCellsTest, ShorterPacketsKeepTheList)
 {
     send(kCode, packet(1, 1));

@@ -108,6 +108,14 @@ TEST_F(CCTRCHSIRMeasurementTest, ACountBeyondThePacketShowsItsWholeChannels)
     }
 }
 
+TEST_F(CCTRCHSIRMeasurementTest, APacketOfTheMinimumLengthWithoutRecordsEmptiesTheList)
+{
+    section.updateSectionRef(display);
+    display.asArray()->append("shown before");
+    send(kCode, PacketBuilder(kCode, 17));
+    EXPECT_THAT(display.asArray()->elements(), IsEmpty());
+}
+
 TEST_F(CCTRCHSIRMeasurementTest, ShorterPacketsKeepTheList)
 {
     send(kCode, packet(0, 1, 1));

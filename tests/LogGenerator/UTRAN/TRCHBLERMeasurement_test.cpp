@@ -90,6 +90,14 @@ TEST_F(TRCHBLERMeasurementTest, ACountBeyondThePacketShowsItsWholeChannels)
     }
 }
 
+TEST_F(TRCHBLERMeasurementTest, APacketOfTheMinimumLengthWithoutRecordsEmptiesTheList)
+{
+    section.updateSectionRef(display);
+    display.asArray()->append("shown before");
+    send(kCode, PacketBuilder(kCode, 17));
+    EXPECT_THAT(display.asArray()->elements(), IsEmpty());
+}
+
 TEST_F(TRCHBLERMeasurementTest, ShorterPacketsKeepTheList)
 {
     send(kCode, packet(1, 1));
