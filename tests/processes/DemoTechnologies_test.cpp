@@ -119,7 +119,9 @@ INSTANTIATE_TEST_SUITE_P(
             {"Serving Cell Info", "RRC Info", "Neighbor Cell List", "TRCH BLER", "CCTRCH SIR",
              "SIR", "PDP Context Info", "SIM Info"},
             {"GSM Neighbor Cell List"},
-        }),
+        },
+        Demo{"cdma", {"1x", "1xEV-DO", "System Identity", "Data Rates"}, {}},
+        Demo{"cellmonitor", {"Network", "Serving Cell", "Neighbor Cells"}, {}}),
     [](const auto& test) { return std::string(test.param.name); });
 
 } // namespace orvane
