@@ -1,0 +1,120 @@
+#include "platform/FileSystem.h"
+#include "processes/support/ChildProcess.h"
+#include "support/TemporaryDirectory.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <csignal>
+#include <filesystem>
+#include <memory>
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::IsEmpty;
+using ::testing::StartsWith;
+
+// The server as a process, in a ports directory of its own.
+class TelephonydProgramTest : public ::testing::Test
+{
+protected:
+    std::unique_ptr<ChildProcess> telephonyd(const std::vector<std::string>& arguments)
+    {
+        std::vector<std::string> all = {TELEPHONYD_PROGRAM};
+        all.insert(all.end(), arguments.begin(), arguments.end());
+        return std::make_unique<ChildProcess>(all, std::vector{"ORVANE_PORTS=" + ports()});
+    }
+    // The same, once clients can connect.
+    std::unique_ptr<ChildProcess> servingTelephonyd(std::vector<std::string> arguments)
+    {
+        arguments.insert(arguments.end(), {"--log", "stderr", "--log-level", "notice"});
+        auto server = telephonyd(arguments);
+        EXPECT_TRUE(server->waitForError("notice: Serving in " + ports() + "\n"));
+        return server;
+    }
+    std::unique_ptr<ChildProcess> viewer()
+    {
+        return std::make_unique<ChildProcess>(
+            std::vector<std::string>{ORVANE_PROGRAM, "--ports", ports(), "--ui", "json",
+                                     "--refresh", "0.1", "--log", "none"});
+    }
+    // It ends with the status, nothing on standard output and one line on standard error.
+    void expectRefusal(const std::vector<std::string>& arguments, int status)
+    {
+        const auto server = telephonyd(arguments);
+        const std::string all = ::testing::PrintToString(arguments);
+        EXPECT_EQ(server->waitForEnd(), status) << all;
+        EXPECT_THAT(server->lines(), IsEmpty()) << all;
+        EXPECT_THAT(server->errors(), StartsWith("telephonyd: ")) << all;
+        EXPECT_EQ(std::count(server->errors().begin(), server->errors().end(), '\n'), 1) << all;
+    }
+    [[nodiscard]] std::string ports() const { return directory.path() + "/ports"; }
+    [[nodiscard]] std::string file(const std::string& name) const
+    {
+        return directory.path() + "/" + name;
+    }
+
+    TemporaryDirectory directory;
+    const std::string drive = std::string(ORVANE_TEST_DATA) + "/lte-drive.dlf";
+};
+
+constexpr const char* kRow = "\"name\":\"Physical Cell ID\"";
+
+} // namespace
+
+TEST_F(TelephonydProgramTest, AClientThatDiesWhileItIsSentToCostsTheServerNothing)
+{
+    const auto server = servingTelephonyd({"--replay", drive, "--speed", "max", "--loop"});
+    for (int round = 0; round < 2; ++round) {
+        const auto client = viewer();
+        ASSERT_TRUE(client->waitForText(kRow)) << "round " << round;
+        client->sendSignal(SIGKILL);
+    }
+    server->sendSignal(SIGTERM);
+    EXPECT_EQ(server->waitForEnd(), 0);
+}
+
+TEST_F(TelephonydProgramTest, SignalsEndItInOrderAndRemoveItsPort)
+{
+    for (const int signal : {SIGINT, SIGTERM}) {
+        const auto server = servingTelephonyd({"--demo=lte"});
+        EXPECT_TRUE(std::filesystem::exists(ports() + "/TelephonyServer"));
+        server->sendSignal(signal);
+        EXPECT_EQ(server->waitForEnd(), 0) << signal;
+        EXPECT_FALSE(std::filesystem::exists(ports() + "/TelephonyServer"));
+    }
+}
+
+TEST_F(TelephonydProgramTest, UnusableArgumentsEndItWithStatusTwo)
+{
+    expectRefusal({}, 2);
+    expectRefusal({"--nonsense"}, 2);
+    expectRefusal({"--demo=mars"}, 2);
+    expectRefusal({"--demo=lte", "stray"}, 2);
+    expectRefusal({"--demo=lte", "--speed", "2"}, 2);
+    expectRefusal({"--demo=lte", "--replay", drive}, 2);
+    expectRefusal({"--demo=lte", "--log", "paper"}, 2);
+    expectRefusal({"--replay", drive, "--speed", "fast"}, 2);
+    expectRefusal({"--replay", drive, "--technology", "smoke"}, 2);
+}
+
+TEST_F(TelephonydProgramTest, ARecordingThatCannotBeServedEndsItWithStatusOne)
+{
+    ASSERT_TRUE(writeFile(file("zeros.dlf"), Bytes(100)));
+    expectRefusal({"--replay", file("absent.dlf")}, 1);
+    expectRefusal({"--replay", directory.path()}, 1);
+    expectRefusal({"--replay", file("zeros.dlf")}, 1);
+}
+
+TEST_F(TelephonydProgramTest, ASecondServerOfTheSameDirectoryEndsWithStatusOne)
+{
+    const auto first = servingTelephonyd({"--demo=lte"});
+    expectRefusal({"--demo=lte", "--log", "none"}, 1);
+}
+
+} // namespace orvane
