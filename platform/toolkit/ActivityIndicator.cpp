@@ -1,0 +1,20 @@
+#include "platform/toolkit/ActivityIndicator.h"
+
+namespace orvane
+{
+
+void ActivityIndicator::setHidesWhenStopped(bool hides)
+{
+    _hidesWhenStopped = hides;
+    changed();
+}
+
+void ActivityIndicator::setAnimating(bool isAnimating)
+{
+    if (_isAnimating == isAnimating)
+        return;
+    _isAnimating = isAnimating;
+    changed();
+}
+
+} // namespace orvane

@@ -1,0 +1,34 @@
+#include "platform/toolkit/TableViewController.h"
+
+#include "platform/toolkit/Screen.h"
+
+namespace orvane
+{
+
+TableViewController::~TableViewController()
+{
+    // Whoever still has the table must not ask us any more.
+    if (_table) {
+        _table->setDataSource(nullptr);
+        _table->setDelegate(nullptr);
+    }
+}
+
+TableView& TableViewController::tableView()
+{
+    if (!_table) {
+        _table = std::make_shared<TableView>();
+        _table->setFrame(Screen::main().bounds());
+        _table->setDataSource(this);
+        _table->setDelegate(this);
+    }
+    return *_table;
+}
+
+std::shared_ptr<View> TableViewController::loadView()
+{
+    static_cast<void>(tableView());
+    return _table;
+}
+
+} // namespace orvane
