@@ -34,7 +34,8 @@ void VRNLogGenerator2::updateState(PropertyDictionary& state, ByteView data)
 
 void VRNLogGenerator2::updateWithData(ByteView data)
 {
-    // The length is tested before unwrapping, so an unwrapped message may be shorter.
+    // The length is tested before unwrapping, so an unwrapped message may be shorter. This is
+    // meant.
     if (data.size() < kLogHeaderBytes || !cIndex)
         return;
     const ByteView message = unwrappedMessage(data);

@@ -46,6 +46,7 @@ bool OrvaneModel::createPorts()
         return false;
     const std::string name = "OrvaneApp." + *uuid;
 
+    // Kept without a test: where it cannot be made, the rest goes on without it. This is meant.
     _recvPort = _environment.ports.createLocal(
         name, [this](LocalMessagePort&, std::int32_t messageId, ByteView data) {
             return messageReceived(messageId, data, this);

@@ -50,6 +50,7 @@ std::optional<std::string> xmlOf(const PropertyValue& snapshot)
 bool write(const std::string& path, const PropertyValue& snapshot)
 {
     const std::optional<std::string> xml = xmlOf(snapshot);
+    // Directly, not through a temporary file. This is meant.
     return xml &&
            writeFile(path, {reinterpret_cast<const std::uint8_t*>(xml->data()), xml->size()});
 }

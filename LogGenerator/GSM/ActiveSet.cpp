@@ -59,6 +59,7 @@ std::vector<PropertyValue> ActiveSet::elements(PacketView packet, const PacketLa
         active.push_back(PropertyValue::newDictionary());
         PropertyDictionary* rows = active.back().asDictionary();
         writeRows(rows, cell, std::span(&kScramblingCode, 1));
+        // A power in the unit of a ratio. This is meant.
         setRow(rows, "RSCP", *decibels(gain - 106 + energy));
         setRow(rows, "Energy Per Chip", *decibels(energy));
     });

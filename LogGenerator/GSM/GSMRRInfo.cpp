@@ -9,7 +9,7 @@ namespace orvane
 namespace
 {
 
-// The blanks inside three of the names are meant.
+// Three of the names have a blank inside. This is meant.
 constexpr ValueName kRrStates[] = {
     {0,  "RR_INACTIVE"                         },
     {1,  "RR_GOING_ACTIVE"                     },

@@ -34,7 +34,8 @@ constexpr std::size_t kProcessBytes = 9;
 constexpr auto kPrimaryCount = countAt<16>;
 constexpr auto kSecondaryCount = countAt<17>;
 
-// The format keeps 162 bytes for each primary process, not the 9 of its record.
+// The format keeps 162 bytes for each primary process, not the 9 of its record. This is
+// meant.
 std::size_t firstSecondaryProcess(PacketView packet)
 {
     return kFirstProcess + 162 * kPrimaryCount(packet);

@@ -76,7 +76,8 @@ LTEServingCellInfo::LTEServingCellInfo() : Section(kLayout) {}
 void LTEServingCellInfo::decode(PacketView packet, const PacketLayout& layout)
 {
     Section::decode(packet, layout);
-    // The modem's channels replace the one that the telephony server reports.
+    // The modem's channels replace the one that the telephony server reports, until it reports it
+    // again. This is meant.
     if (layout.logCode == kConfigurationCode)
         if (const auto shown = rows())
             shown->remove(kChannelRow);

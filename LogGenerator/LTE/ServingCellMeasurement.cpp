@@ -12,8 +12,6 @@ namespace
 constexpr std::uint32_t kServingMeasurementCode = 0xB17F;
 constexpr const char* kNotPresent = "Not Present";
 
-// The transmit power has 6 bits, which never reach the value that marks an absent one. This is
-// meant.
 RowText transmitPower(std::int64_t raw) { return raw == 64 ? kNotPresent : minus30(raw); }
 
 RowText searchThreshold(std::int64_t raw) { return raw == 32 ? kNotPresent : decibels(raw * 2); }
@@ -38,6 +36,7 @@ constexpr Field kFields[] = {
     bitsField("Measured RSSI", 25, 0, 9, rssiHalfDb),
     bitsField("Qrxlevmin", 26, 1, 6, qrxlevmin),
     bitsField("P_Max", 26, 7, 7, transmitPower),
+    // Its 6 bits never reach the value that marks an absent one. This is meant.
     bitsField("Max UE Tx Power", 27, 6, 6, transmitPower),
     bitsField("Srxlev", 29, 0, 7, minus30),
     bitsField("Num of Consecutive DRX Cycles of S < 0", 29, 7, 6, decimal),

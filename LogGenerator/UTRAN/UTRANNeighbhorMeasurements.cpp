@@ -39,6 +39,7 @@ constexpr PacketLayout kPackets[] = {
     recordsPacket(kMeasurementCode, 21, kCells),
 };
 
+// Calls are logged by another text than the section's name. This is meant.
 constexpr SectionLayout kLayout = {"Neighbor Cell List", "NeighbhorMeasurements List",
                                    UnknownCode::Ignore, kPackets};
 
