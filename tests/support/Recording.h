@@ -37,6 +37,14 @@ public:
                 found.push_back(line.text);
         return found;
     }
+    // All lines in order, of whatever priority.
+    [[nodiscard]] std::vector<std::string> texts() const
+    {
+        std::vector<std::string> found;
+        for (const Line& line : lines)
+            found.push_back(line.text);
+        return found;
+    }
     [[nodiscard]] std::vector<std::string> errors() const { return texts(LogPriority::Error); }
     [[nodiscard]] std::vector<std::string> warnings() const { return texts(LogPriority::Warning); }
     [[nodiscard]] std::size_t count(std::string_view text) const

@@ -70,6 +70,19 @@ TEST_F(GSMRRInfoTest, NamesEveryStateAndNoOther)
     }
 }
 
+TEST_F(GSMRRInfoTest, ThreeStatesKeepABlankInTheirNames)
+{
+    const std::pair<std::uint32_t, const char*> kStates[] = {
+        {13, "RR_W2G_INTERRAT_HANDOVER_ PROGRESS"},
+        {19, "RR_G2W_INTERRAT_HANDOVER_ PROGRESS"},
+        {21, "RR_W2G_INTERRAT_CC_ORDER_ PROGRESS"},
+    };
+    for (const auto& [state, name] : kStates) {
+        send(kState, PacketBuilder(kState, 17).put8(13, state));
+        EXPECT_EQ(row("RR State"), name);
+    }
+}
+
 TEST_F(GSMRRInfoTest, FlagsAreSetForEveryValueButZero)
 {
     const struct {

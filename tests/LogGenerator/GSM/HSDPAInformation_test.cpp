@@ -182,6 +182,19 @@ TEST_F(HSDPAInformationTest, CountsBeyondThePacketShowTheWholeRecords)
     }
 }
 
+TEST_F(HSDPAInformationTest, ATruncatedPacketEmptiesTheListsItCountsAndKeepsTheOthers)
+{
+    send(kCode, threeProcesses());
+    send(kCode, header(18, 2, 0));
+    EXPECT_THAT(primary(), IsEmpty()) << "counted, but not one whole record there";
+    EXPECT_EQ(secondary().size(), 1U) << "not counted";
+
+    send(kCode, threeProcesses());
+    send(kCode, header(18, 0, 1));
+    EXPECT_EQ(primary().size(), 2U);
+    EXPECT_THAT(secondary(), IsEmpty());
+}
+
 TEST_F(HSDPAInformationTest, TheLargestCountsAreShownWhole)
 {
     const std::size_t second = 18 + 162 * 255;

@@ -78,6 +78,17 @@ TEST_F(UMTSSetTest, ShowsARecordACellInTheRowsOwnOrder)
                 ElementsAre(RecordingLog::Line{LogPriority::Warning, "UMTSSet"}));
 }
 
+TEST_F(UMTSSetTest, RecordsBeginAtOffset15WhateverTheNumberOfGsmRecords)
+{
+    Bytes packet = twoCells(2);
+    send(kCode, packet);
+    const std::vector<Rows> withoutGsm = records();
+    packet[14] = 9;
+    send(kCode, packet);
+    EXPECT_EQ(records(), withoutGsm);
+    EXPECT_THAT(records(), SizeIs(2));
+}
+
 TEST_F(UMTSSetTest, FrequenciesShowAsSignedNumbers)
 {
     send(kCode, twoCells(2));

@@ -68,6 +68,18 @@ TEST_F(VRN_GSMLogGeneratorTest, SaysWhenItIsMadeAndWhenItGoes)
                 ElementsAre("Deallocing VRN_GSMClassIndex", "Deallocing ClassIndex"));
 }
 
+TEST_F(VRN_GSMLogGeneratorTest, LogsItselfThenItsSectionsThenItsBases)
+{
+    std::vector<std::string> texts = services.log.texts();
+    EXPECT_EQ(std::erase_if(
+                  texts, [](const std::string& text) { return text.starts_with("Array Count: "); }),
+              26U);
+    EXPECT_THAT(texts, ElementsAre("Creating VRN_GSMLogGenerator object",
+                                   StartsWith("Creating VRNLogGenerator2 object with 0x"),
+                                   StartsWith("Creating Log object: 0x"), "Class Index: 1"));
+    EXPECT_EQ(services.log.lines[1].text, "Array Count: 1");
+}
+
 TEST_F(VRN_GSMLogGeneratorTest, TheTemplateGivesEverySectionItsPartAndHoldsNothingElse)
 {
     services.log.lines.clear();

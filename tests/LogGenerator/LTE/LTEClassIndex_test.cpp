@@ -89,6 +89,20 @@ TEST_F(LTEClassIndexTest, ItsEndIsToldOnTheConsole)
                 ElementsAre("Deallocing LTEClassIndex", "Deallocing ClassIndex"));
 }
 
+TEST_F(LTEClassIndexTest, TheGeneratorLogsItselfThenItsSectionsThenItsBases)
+{
+    LTELogGenerator generator;
+    generator.init();
+    std::vector<std::string> texts = services.log.texts();
+    EXPECT_EQ(std::erase_if(
+                  texts, [](const std::string& text) { return text.starts_with("Array Count: "); }),
+              11U);
+    EXPECT_THAT(texts, ElementsAre("Creating LTELogGenerator object",
+                                   MatchesRegex("Creating VRNLogGenerator2 object with 0x.+"),
+                                   MatchesRegex("Creating Log object: 0x.+"), "Class Index: 1"));
+    EXPECT_EQ(services.log.lines[1].text, "Array Count: 3");
+}
+
 TEST_F(LTEClassIndexTest, TheGeneratorsStartAndEndAreLogged)
 {
     {
