@@ -43,6 +43,23 @@ public:
     std::function<void()> onUpdate;
 };
 
+// No display can be made of a number.
+constexpr const char* kBadTemplate =
+    "<plist><dict><key>bad</key><integer>1</integer></dict></plist>";
+
+class UnreadableResources final : public Resources
+{
+public:
+    [[nodiscard]] std::optional<Bytes> load(std::string_view, std::string_view) const override
+    {
+        throw std::runtime_error("the disk is gone");
+    }
+    [[nodiscard]] std::vector<std::string> pathsOfType(std::string_view) const override
+    {
+        throw std::runtime_error("the disk is gone");
+    }
+};
+
 class ConnectionTest : public ::testing::Test
 {
 protected:
@@ -69,6 +86,34 @@ protected:
     static Bytes servingCellPacket(unsigned cellId)
     {
         return PacketBuilder(0xB0C2, 38).put16(14, cellId);
+    }
+    // Lets a message come while there is no template, and a bad one lie ready for the refresh.
+    void receiveBeforeABadTemplate()
+    {
+        Services::current().setResources(&services.memoryResources);
+        startConnected();
+        ASSERT_TRUE(server.sendLogMessage(servingCellPacket(77)));
+        queue.advance(1s);
+        services.memoryResources.put("LTE.plist", kBadTemplate);
+        observer.onUpdate = [this] { model->topLevelNodes(); };
+        services.log.lines.clear();
+    }
+    // The session that follows a good template shows what comes.
+    void expectRecovery()
+    {
+        services.useShippedResources();
+        server.closeChannels();
+        queue.advance(7s);
+        ASSERT_TRUE(model->isConnected());
+        ASSERT_TRUE(server.sendLogMessage(servingCellPacket(78)));
+        queue.advance(2s);
+        EXPECT_EQ(shownCellId(), "78");
+    }
+    [[nodiscard]] std::vector<std::string> errorsThatStart(const std::string& start) const
+    {
+        std::vector<std::string> found = services.log.errors();
+        std::erase_if(found, [&](const std::string& line) { return !line.starts_with(start); });
+        return found;
     }
     std::string shownCellId()
     {
@@ -288,8 +333,7 @@ TEST_F(ConnectionTest, AMessageWithAnotherIdIsDroppedWithoutALine)
 
 TEST_F(ConnectionTest, AMessageThatIsThrownOutIsReportedOnceAndTheNextOneDecoded)
 {
-    services.memoryResources.put("LTE.plist",
-                                 "<plist><dict><key>bad</key><integer>1</integer></dict></plist>");
+    services.memoryResources.put("LTE.plist", kBadTemplate);
     Services::current().setResources(&services.memoryResources);
     startConnected();
     services.log.lines.clear();
@@ -307,6 +351,41 @@ TEST_F(ConnectionTest, AMessageThatIsThrownOutIsReportedOnceAndTheNextOneDecoded
     ASSERT_TRUE(server.sendLogMessage(servingCellPacket(78)));
     queue.advance(2s);
     EXPECT_EQ(shownCellId(), "78");
+}
+
+TEST_F(ConnectionTest, ABadTemplateInARefreshGivesOneErrorLineAndTheProgramGoesOn)
+{
+    receiveBeforeABadTemplate();
+    queue.advance(1s);
+    EXPECT_EQ(observer.updates, 1);
+    EXPECT_THAT(errorsThatStart("The "), ElementsAre(StartsWith("The display cannot be shown: ")));
+    expectRecovery();
+}
+
+TEST_F(ConnectionTest, ABadTemplateInAStartGivesOneErrorLineAndTheProgramGoesOn)
+{
+    receiveBeforeABadTemplate();
+    observer.onUpdate = {};
+    // The restart comes before the view update, and makes the tree of the old generator once more.
+    server.closeChannels();
+    queue.advance(1s);
+    EXPECT_TRUE(model->isConnected());
+    EXPECT_THAT(errorsThatStart("The "), ElementsAre(StartsWith("The display cannot be shown: ")));
+    expectRecovery();
+}
+
+TEST_F(ConnectionTest, AStartWhoseTemplatesCannotBeReadGivesOneErrorLineAndIsTriedAgain)
+{
+    UnreadableResources unreadable;
+    Services::current().setResources(&unreadable);
+    server.technology = kTSLogChannelTechnology_Varnel_UTRAN2;
+    start(model);
+    EXPECT_FALSE(model->isConnected());
+    EXPECT_THAT(errorsThatStart("The "),
+                ElementsAre("The monitor could not be started: the disk is gone"));
+    services.useShippedResources();
+    queue.advance(5s);
+    EXPECT_TRUE(model->isConnected());
 }
 
 TEST_F(ConnectionTest, ANotificationRefreshesAtOnce)
