@@ -1,0 +1,14 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <optional>
+
+namespace orvane
+{
+
+// The version report with which the DLF files of this program begin: of its version, the clock's
+// time and the local time zone. Nothing, with an error line, where it cannot be made.
+std::optional<Bytes> makeVersionReport();
+
+} // namespace orvane
