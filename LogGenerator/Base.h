@@ -47,6 +47,11 @@ public:
 
     void updateLogCodeDict(CodeDictionary& codeDict);
 
+    // All that the section goes on from: its part of the display, shared, and what it keeps from
+    // one packet to the next. restore() takes such a value back.
+    [[nodiscard]] PropertyValue checkpoint() const;
+    void restore(const PropertyValue& checkpoint);
+
     // Both change the array under ArrayLock, so that no reader sees it half filled.
     static void clearElementsInArray(PropertyArray* array);
     static void replaceArray(PropertyArray* array, std::vector<PropertyValue> with);
@@ -61,6 +66,10 @@ protected:
         return sectionRef.rows.lock();
     }
     [[nodiscard]] std::shared_ptr<PropertyArray> list() const { return sectionRef.list.lock(); }
+
+    // What a section with fields of its own keeps in them, and the inverse; by default nothing.
+    [[nodiscard]] virtual PropertyValue keptValues() const { return {}; }
+    virtual void takeKeptValues(const PropertyValue&) {}
 
 private:
     void init();

@@ -16,6 +16,11 @@ constexpr std::uint8_t kModemType = 1;
 constexpr std::uint8_t kServerType = 0xFF;
 constexpr std::uint8_t kWrapper = 0x81;
 constexpr std::uint16_t kFirstModemCode = 0x1000;
+
+// No question reaches further from the cursor: an item (of at most 64 KiB and its separator), the
+// one after it, and what begins within that one.
+constexpr std::size_t kReach = 4 * 65536;
+
 constexpr std::uint64_t kHour = 3600 * kDlfStepsPerSecond;
 constexpr std::uint64_t kMonth = 30 * 24 * kHour;
 
@@ -37,38 +42,48 @@ bool areWithin(std::uint64_t steps, std::uint64_t one, std::uint64_t other)
 
 // An item that fits at its place, with what stands between it and the item before.
 struct DlfReader::Start {
-    std::size_t position;
+    std::uint64_t position;
     std::size_t length;
     std::size_t separators;
     std::uint64_t timestamp;
     std::uint16_t code;
     std::uint8_t type;
 
-    [[nodiscard]] std::size_t end() const { return position + length; }
+    [[nodiscard]] std::uint64_t end() const { return position + length; }
 };
 
-std::optional<DlfReader::Start> DlfReader::fitting(std::size_t from, std::size_t separators,
+void DlfReader::look()
+{
+    _window = _source->bytes(_cursor, kReach);
+    _size = _source->size();
+}
+
+std::optional<std::uint64_t> DlfReader::unsignedAt(std::uint64_t position, std::size_t width) const
+{
+    return PacketView(_window).unsignedAt(position - _cursor, width);
+}
+
+std::optional<DlfReader::Start> DlfReader::fitting(std::uint64_t from, std::size_t separators,
                                                    std::uint64_t type) const
 {
-    const PacketView bytes(_file);
-    const std::size_t position = from + separators;
-    if (!bytes.holds(position, kHeaderBytes))
+    const std::uint64_t position = from + separators;
+    const auto header = unsignedAt(position, 4);
+    const auto timestamp = unsignedAt(position + 4, 8);
+    if (!header || !timestamp)
         return std::nullopt;
-    const auto length = static_cast<std::size_t>(*bytes.unsignedAt(position, 2));
-    const auto code = static_cast<std::uint16_t>(*bytes.unsignedAt(position + 2, 2));
-    if (length < kHeaderBytes || code == 0 || !bytes.holds(position, length))
+    const auto length = static_cast<std::size_t>(*header & 0xFFFF);
+    const auto code = static_cast<std::uint16_t>(*header >> 16);
+    if (length < kHeaderBytes || code == 0 || length > _size - position)
         return std::nullopt;
-    const std::uint64_t timestamp = *bytes.unsignedAt(position + 4, 8);
-    return Start{position, length, separators, timestamp, code, static_cast<std::uint8_t>(type)};
+    return Start{position, length, separators, *timestamp, code, static_cast<std::uint8_t>(type)};
 }
 
 // The first that passes of the ways to read an item at one place: without a separator, behind a
 // type byte, behind a wrapper, behind what is left of a wrapper.
 template <typename Test>
-std::optional<DlfReader::Start> DlfReader::firstStart(std::size_t from, bool followsItem,
+std::optional<DlfReader::Start> DlfReader::firstStart(std::uint64_t from, bool followsItem,
                                                       const Test& test) const
 {
-    const PacketView bytes(_file);
     const auto accepted = [&](std::size_t separators, std::uint64_t type) {
         std::optional<Start> start = fitting(from, separators, type);
         if (start && !test(*start))
@@ -77,17 +92,17 @@ std::optional<DlfReader::Start> DlfReader::firstStart(std::size_t from, bool fol
     };
     if (auto start = accepted(0, kModemType))
         return start;
-    const auto first = bytes.unsignedAt(from, 1);
+    const auto first = unsignedAt(from, 1);
     if (isType(first))
         if (auto start = accepted(1, *first))
             if (followsItem || first != kServerType || start->code < kFirstModemCode)
                 return start;
     if (first == kWrapper)
-        if (const auto third = bytes.unsignedAt(from + 2, 1); isType(third))
+        if (const auto third = unsignedAt(from + 2, 1); isType(third))
             if (auto start = accepted(3, *third))
                 return start;
     if (followsItem)
-        if (const auto second = bytes.unsignedAt(from + 1, 1); isType(second))
+        if (const auto second = unsignedAt(from + 1, 1); isType(second))
             return accepted(2, *second);
     return std::nullopt;
 }
@@ -109,7 +124,7 @@ bool DlfReader::isVouchedFor(const Start& start) const
     return (_clock == 0 || areWithin(kMonth, _clock, start.timestamp)) && isTimely(start);
 }
 
-bool DlfReader::hasVouchedStart(std::size_t from, std::size_t end)
+bool DlfReader::hasVouchedStart(std::uint64_t from, std::uint64_t end)
 {
     while (!_vouchedStarts.empty() && _vouchedStarts.front() < _cursor)
         _vouchedStarts.pop_front();
@@ -129,7 +144,7 @@ bool DlfReader::isSound(const Start& start)
 
 bool DlfReader::isFollowed(const Start& start)
 {
-    if (start.end() == _file.size())
+    if (start.end() == _size)
         return true;
     const auto follows = [&](const Start& follower) {
         return areWithin(kHour, start.timestamp, follower.timestamp) || isSound(follower);
@@ -159,11 +174,11 @@ DlfItem DlfReader::place(const Start& start)
 {
     _separators += start.separators;
     _placed += start.length;
+    const ByteView bytes = _window.subspan(start.position - _cursor, start.length);
     _cursor = start.end();
     _followsItem = true;
     _lastTimestamp = start.timestamp;
-    return {start.position, start.code, start.timestamp,
-            _file.subspan(start.position, start.length), start.type};
+    return {start.position, start.code, start.timestamp, bytes, start.type};
 }
 
 void DlfReader::passUnplacedByte()
@@ -181,9 +196,12 @@ void DlfReader::passUnplacedByte()
     _followsItem = false;
 }
 
-std::optional<DlfItem> DlfReader::next()
+std::optional<DlfItem> DlfReader::next(std::uint64_t mostUnplacedBytes)
 {
-    while (_cursor < _file.size()) {
+    for (std::uint64_t passed = 0; passed < mostUnplacedBytes; ++passed) {
+        look();
+        if (_cursor >= _size)
+            break;
         if (const std::optional<Start> start = startHere())
             return place(*start);
         passUnplacedByte();

@@ -1,16 +1,18 @@
 #pragma once
 
+#include "LogGenerator/ByteSource.h"
 #include "platform/PropertyValue.h"
 
 #include <cstdint>
 #include <deque>
+#include <memory>
 #include <optional>
 #include <vector>
 
 namespace orvane
 {
 
-// One log item of a DLF file. The bytes stay the file's.
+// One log item of a DLF file. The bytes stay the source's.
 struct DlfItem {
     std::uint64_t position = 0;  // of its length field, in bytes from the file's start
     std::uint16_t logCode = 0;   // never 0
@@ -19,8 +21,8 @@ struct DlfItem {
     std::uint8_t type = 1;       // 0xFF where that type byte stands before it, else 1
 };
 
-// Reads the log items of a file, in file order, without copies: `file` may be a mapped file and
-// must outlive the reader and its items. An item is its length (2 bytes, itself included), log code
+// Reads the log items of a file, in file order, without copies. A copy of a reader goes on from the
+// same place on its own. An item is its length (2 bytes, itself included), log code
 // (2), timestamp (8) and payload, little-endian. Items stand end to end, or, as in Orvane's own
 // exports, behind the type byte (1 or 0xFF) or the wrapper (0x81, any byte, type byte) of the
 // message that they came in. A snapshot's first message lost its first byte there: its type byte,
@@ -56,11 +58,20 @@ public:
     };
     static constexpr std::size_t kMaxUnplacedRanges = 256;
 
-    explicit DlfReader(ByteView file) : _file(file) {}
+    // Of bytes in memory, which must outlive the reader and its items.
+    explicit DlfReader(ByteView file) : DlfReader(std::make_shared<MemorySource>(file)) {}
+    explicit DlfReader(std::shared_ptr<ByteSource> source) : _source(std::move(source)) {}
 
-    // The next item; none at the end of the file, also when called again.
-    [[nodiscard]] std::optional<DlfItem> next();
+    // The next item; none at the end of the file, also when called again. Its bytes stay until the
+    // source is next asked, those in memory as long as they live.
+    [[nodiscard]] std::optional<DlfItem> next() { return next(UINT64_MAX); }
+    // The same, but gives up after so many bytes that are no item: none then as well, though
+    // isAtEnd() is false.
+    [[nodiscard]] std::optional<DlfItem> next(std::uint64_t mostUnplacedBytes);
+    [[nodiscard]] bool isAtEnd() const { return _cursor >= _source->size(); }
 
+    // How far reading has come, in bytes from the file's start.
+    [[nodiscard]] std::uint64_t position() const { return _cursor; }
     // What has been passed so far, in bytes. The three add up to the file's length at its end.
     [[nodiscard]] std::uint64_t placedBytes() const { return _placed; }
     [[nodiscard]] std::uint64_t separatorBytes() const { return _separators; }
@@ -70,25 +81,36 @@ public:
     [[nodiscard]] const std::vector<Range>& unplacedRanges() const { return _ranges; }
     [[nodiscard]] std::uint64_t unplacedRangeCount() const { return _rangeCount; }
 
+    // About how much memory it takes beside itself and the source.
+    [[nodiscard]] std::size_t bytesKept() const
+    {
+        return _ranges.size() * sizeof(Range) + _vouchedStarts.size() * sizeof(std::uint64_t);
+    }
+
 private:
     struct Start;
 
-    [[nodiscard]] std::optional<Start> fitting(std::size_t from, std::size_t separators,
+    void look();
+    [[nodiscard]] std::optional<std::uint64_t> unsignedAt(std::uint64_t position,
+                                                          std::size_t width) const;
+    [[nodiscard]] std::optional<Start> fitting(std::uint64_t from, std::size_t separators,
                                                std::uint64_t type) const;
     template <typename Test>
-    [[nodiscard]] std::optional<Start> firstStart(std::size_t from, bool followsItem,
+    [[nodiscard]] std::optional<Start> firstStart(std::uint64_t from, bool followsItem,
                                                   const Test& test) const;
     [[nodiscard]] bool isTimely(const Start& start) const;
     [[nodiscard]] bool isVouchedFor(const Start& start) const;
     [[nodiscard]] bool isSound(const Start& start);
     [[nodiscard]] bool isFollowed(const Start& start);
-    [[nodiscard]] bool hasVouchedStart(std::size_t from, std::size_t end);
+    [[nodiscard]] bool hasVouchedStart(std::uint64_t from, std::uint64_t end);
     [[nodiscard]] std::optional<Start> startHere();
     DlfItem place(const Start& start);
     void passUnplacedByte();
 
-    ByteView _file;
-    std::size_t _cursor = 0;
+    std::shared_ptr<ByteSource> _source;
+    ByteView _window;        // from the cursor on, as far as any question reaches
+    std::uint64_t _size = 0; // of the file
+    std::uint64_t _cursor = 0;
     bool _followsItem = false; // the item before ends at the cursor
     std::uint64_t _lastTimestamp = 0;
     std::uint64_t _clock = 0; // timestamp of the last item placed that is near the one after it
@@ -99,8 +121,8 @@ private:
     std::uint64_t _rangeCount = 0;
     // The starts vouched for from the cursor to _searchedTo, found when first asked for. Questions
     // reach at most two items ahead, so this stays small and no byte is searched twice.
-    std::deque<std::size_t> _vouchedStarts;
-    std::size_t _searchedTo = 0;
+    std::deque<std::uint64_t> _vouchedStarts;
+    std::uint64_t _searchedTo = 0;
 };
 
 } // namespace orvane

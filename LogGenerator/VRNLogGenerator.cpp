@@ -18,7 +18,7 @@ void VRNLogGenerator::init()
 
 void VRNLogGenerator::appendToBinData(ByteView message)
 {
-    if (_binData)
+    if (_binData && _keepsMessages)
         _binData->insert(_binData->end(), message.begin(), message.end());
 }
 

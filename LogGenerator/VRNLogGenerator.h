@@ -14,6 +14,7 @@ class VRNLogGenerator : public LogGenerator
 public:
     void init();
 
+    void keepNoMessages() override { _keepsMessages = false; }
     // The history's snapshots, oldest first, then an entry with the DLF file unless that failed.
     PropertyValue getSaveContentsFromState(PropertyDictionary& state) override;
     // The version report, then the raw messages of every snapshot. Nothing (with an error line)
@@ -30,6 +31,7 @@ protected:
 private:
     // The messages since the last display. Absent in an object that was never initialised.
     std::optional<Bytes> _binData;
+    bool _keepsMessages = true;
 };
 
 } // namespace orvane

@@ -35,6 +35,11 @@ public:
     // Reports what is neither dictionary, array nor string in the tree.
     static void printDict(const PropertyValue& object);
 
+protected:
+    // The sections: their parts of the display and what they keep beside it.
+    void addToCheckpoint(PropertyDictionary& values) const override;
+    void takeFromCheckpoint(const PropertyValue& values) override;
+
 private:
     PropertyValue loadTemplate(PropertyDictionary& state) const;
 

@@ -1,8 +1,8 @@
 #include "telephonyd/DaemonOptions.h"
 
+#include "LogGenerator/LogTechnology.h"
 #include "platform/CommandLine.h"
 #include "platform/LogOption.h"
-#include "telephonyd/ReplayTechnology.h"
 
 #include <algorithm>
 

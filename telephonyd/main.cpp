@@ -1,3 +1,4 @@
+#include "LogGenerator/LogTechnology.h"
 #include "platform/FileSystem.h"
 #include "platform/Services.h"
 #include "platform/qt/PortsDirectory.h"
@@ -10,7 +11,6 @@
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/ReplaySource.h"
-#include "telephonyd/ReplayTechnology.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <chrono>

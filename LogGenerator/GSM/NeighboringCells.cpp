@@ -76,4 +76,21 @@ std::vector<PropertyValue> NeighboringCells::elements(PacketView packet, const P
     return neighbours;
 }
 
+PropertyValue NeighboringCells::keptValues() const
+{
+    const PropertyValue values = PropertyValue::newDictionary();
+    for (const auto& [arfcn, bsic] : arfcnToBsic)
+        values.asDictionary()->set(arfcn, bsic);
+    return values;
+}
+
+void NeighboringCells::takeKeptValues(const PropertyValue& values)
+{
+    arfcnToBsic.clear();
+    if (const PropertyDictionary* dictionary = values.asDictionary())
+        for (const auto& [arfcn, bsic] : *dictionary)
+            if (const std::string* text = bsic.asString())
+                arfcnToBsic[arfcn] = *text;
+}
+
 } // namespace orvane

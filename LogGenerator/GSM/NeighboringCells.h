@@ -18,6 +18,8 @@ public:
 private:
     void decode(PacketView packet, const PacketLayout& layout) override;
     std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    [[nodiscard]] PropertyValue keptValues() const override;
+    void takeKeptValues(const PropertyValue& values) override;
     void decodeBsicList(PacketView packet);
 
     // Decimal texts, from the last BSIC list.

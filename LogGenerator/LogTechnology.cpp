@@ -1,11 +1,12 @@
-#include "telephonyd/ReplayTechnology.h"
+#include "LogGenerator/LogTechnology.h"
 
-#include "LogGenerator/DlfReader.h"
+#include "LogGenerator/DlfWriter.h"
 #include "LogGenerator/LogGenerator.h"
-#include "platform/Services.h"
+#include "LogGenerator/LogMessage.h"
+#include "LogGenerator/Silence.h"
+#include "LogGenerator/StateKeys.h"
 #include "platform/TelephonyServer.h"
 
-#include <map>
 #include <set>
 
 namespace orvane
@@ -27,58 +28,28 @@ constexpr Technology kTechnologies[] = {
     {"cellmonitor", kTSLogChannelTechnology_IFX          },
 };
 
-constexpr std::uint16_t kVersionReport = 0x1FFD;
-constexpr std::uint8_t kModemItem = 1;
-
-// Generators tell of their coming and going, which means nothing here.
-class Silence
+std::set<std::uint16_t> codesOf(const LogGenerator& generator)
 {
-public:
-    Silence()
-    {
-        Services::current().setLog(&_nothing);
-        Services::current().setConsole(nullptr);
-    }
-    ~Silence()
-    {
-        Services::current().setLog(&_log);
-        Services::current().setConsole(&_console);
-    }
-    Silence(const Silence&) = delete;
-    Silence& operator=(const Silence&) = delete;
-
-private:
-    NullLog _nothing;
-    SystemLog& _log = Services::current().log();
-    Console& _console = Services::current().console();
-};
-
-std::map<std::uint32_t, std::uint64_t> modemItemsByCode(ByteView file)
-{
-    std::map<std::uint32_t, std::uint64_t> counts;
-    DlfReader reader(file);
-    while (const auto item = reader.next())
-        if (item->logCode != kVersionReport && item->type == kModemItem)
-            ++counts[item->logCode];
-    return counts;
-}
-
-std::set<std::uint32_t> codesOf(const LogGenerator& generator)
-{
-    std::set<std::uint32_t> codes;
+    std::set<std::uint16_t> codes;
     const PropertyValue command = generator.getStartCommand();
-    if (const PropertyArray* array = command["SetVarnelLogCodes"].asArray())
+    if (const PropertyArray* array = command[kSetModemLogCodesKey].asArray())
         for (const PropertyValue& element : *array)
             if (const auto code = element.asInteger())
-                codes.insert(static_cast<std::uint32_t>(*code));
+                codes.insert(static_cast<std::uint16_t>(*code));
     return codes;
 }
 
 } // namespace
 
-std::optional<std::string> technologyOfLog(ByteView file)
+void TechnologyFinder::take(const DlfItem& item)
 {
-    const auto counts = modemItemsByCode(file);
+    if (item.logCode != kDlfVersionReportCode && item.type == kModemItem)
+        ++_itemsByCode[item.logCode];
+}
+
+std::optional<std::string> TechnologyFinder::technology() const
+{
+    // Generators tell of their coming and going, which means nothing here.
     const Silence silence;
     std::optional<std::string> best;
     std::uint64_t bestItems = 0;
@@ -87,9 +58,9 @@ std::optional<std::string> technologyOfLog(ByteView file)
         const auto generator = LogGenerator::generatorFromTechnology(technology.constant);
         if (!generator)
             continue;
-        const std::set<std::uint32_t> codes = codesOf(*generator);
+        const std::set<std::uint16_t> codes = codesOf(*generator);
         std::uint64_t items = 0;
-        for (const auto& [code, count] : counts)
+        for (const auto& [code, count] : _itemsByCode)
             items += codes.contains(code) ? count : 0;
         if (items > bestItems || (items > 0 && items == bestItems && codes.size() < bestCodes)) {
             best = technology.constant;
@@ -98,6 +69,15 @@ std::optional<std::string> technologyOfLog(ByteView file)
         }
     }
     return best;
+}
+
+std::optional<std::string> technologyOfLog(ByteView file)
+{
+    TechnologyFinder finder;
+    DlfReader reader(file);
+    while (const auto item = reader.next())
+        finder.take(*item);
+    return finder.technology();
 }
 
 std::optional<std::string> technologyNamed(std::string_view name)

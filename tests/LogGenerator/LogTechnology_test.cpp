@@ -1,4 +1,4 @@
-#include "telephonyd/ReplayTechnology.h"
+#include "LogGenerator/LogTechnology.h"
 
 #include "platform/FileSystem.h"
 #include "platform/TelephonyServer.h"
@@ -27,21 +27,21 @@ Bytes fileOf(std::initializer_list<std::uint16_t> codes)
     return file;
 }
 
-TEST(ReplayTechnologyTest, TheCodesOfARecordingTellItsTechnology)
+TEST(LogTechnologyTest, TheCodesOfARecordingTellItsTechnology)
 {
     EXPECT_EQ(technologyOfLog(fileOf({0x1FFD, 0xB0C2})), kTSLogChannelTechnology_Varnel_LTE);
     EXPECT_EQ(technologyOfLog(fileOf({0x1111, 0x2222, 0xB17F, 0x3333})),
               kTSLogChannelTechnology_Varnel_LTE);
 }
 
-TEST(ReplayTechnologyTest, ARealDriveIsRecognised)
+TEST(LogTechnologyTest, ARealDriveIsRecognised)
 {
     const auto file = readFile(ORVANE_TEST_DATA "/lte-drive.dlf");
     ASSERT_TRUE(file);
     EXPECT_EQ(technologyOfLog(*file), kTSLogChannelTechnology_Varnel_LTE);
 }
 
-TEST(ReplayTechnologyTest, EachTechnologyIsToldByACodeOfItsOwn)
+TEST(LogTechnologyTest, EachTechnologyIsToldByACodeOfItsOwn)
 {
     TestServices services;
     services.useShippedResources(); // UTRAN's codes come with its template
@@ -59,7 +59,7 @@ TEST(ReplayTechnologyTest, EachTechnologyIsToldByACodeOfItsOwn)
             << each.code;
 }
 
-TEST(ReplayTechnologyTest, TheTechnologyThatKnowsMostItemsWins)
+TEST(LogTechnologyTest, TheTechnologyThatKnowsMostItemsWins)
 {
     EXPECT_EQ(technologyOfLog(fileOf({0x417A, 0x4005, 0xB179, 0xB17F, 0xB17F})),
               kTSLogChannelTechnology_Varnel_LTE);
@@ -67,7 +67,7 @@ TEST(ReplayTechnologyTest, TheTechnologyThatKnowsMostItemsWins)
               kTSLogChannelTechnology_Varnel_GSM);
 }
 
-TEST(ReplayTechnologyTest, CodesThatNoGeneratorKnowsTellNothing)
+TEST(LogTechnologyTest, CodesThatNoGeneratorKnowsTellNothing)
 {
     EXPECT_FALSE(technologyOfLog({}));
     EXPECT_FALSE(technologyOfLog(fileOf({0x1FFD})));
@@ -75,7 +75,7 @@ TEST(ReplayTechnologyTest, CodesThatNoGeneratorKnowsTellNothing)
     EXPECT_FALSE(technologyOfLog(Bytes(100, 0xAB)));
 }
 
-TEST(ReplayTechnologyTest, AskingLeavesNoLines)
+TEST(LogTechnologyTest, AskingLeavesNoLines)
 {
     TestServices services;
     EXPECT_TRUE(technologyOfLog(fileOf({0xB0C2})));
@@ -85,7 +85,7 @@ TEST(ReplayTechnologyTest, AskingLeavesNoLines)
     EXPECT_EQ(services.log.lines.size(), 1U);
 }
 
-TEST(ReplayTechnologyTest, TechnologiesHaveNames)
+TEST(LogTechnologyTest, TechnologiesHaveNames)
 {
     EXPECT_EQ(technologyNamed("lte"), kTSLogChannelTechnology_Varnel_LTE);
     EXPECT_EQ(technologyNamed("umts"), kTSLogChannelTechnology_Varnel_GSM);

@@ -1,0 +1,38 @@
+#pragma once
+
+#include "LogGenerator/DlfReader.h"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+
+namespace orvane
+{
+
+// Finds the technology of a recording by the log codes of its items.
+class TechnologyFinder
+{
+public:
+    // Items of the server, and version reports, count for no technology.
+    void take(const DlfItem& item);
+    // The technology constant of the generator that knows most of the items taken; of equals the
+    // one with fewer codes of its own. Nothing when none knows any. Generators that need a template
+    // are asked only where the process's resources have it.
+    [[nodiscard]] std::optional<std::string> technology() const;
+
+private:
+    std::unordered_map<std::uint16_t, std::uint64_t> _itemsByCode;
+};
+
+// The technology of a whole recording.
+std::optional<std::string> technologyOfLog(ByteView file);
+
+// The technology constant for its name on the command line: "lte", "umts", "utran", "cdma" or
+// "cellmonitor". Nothing for any other text.
+std::optional<std::string> technologyNamed(std::string_view name);
+// All those names, as a text for people.
+std::string technologyNames();
+
+} // namespace orvane
