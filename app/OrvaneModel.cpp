@@ -41,6 +41,8 @@ NodePointer OrvaneModel::nodeAtPath(const std::string& path)
 
 void OrvaneModel::updateWithData(ByteView data)
 {
+    if (_environment.channelObserver)
+        _environment.channelObserver->messageReceived(data);
     if (_logGenerator)
         _logGenerator->updateState(*_state, data);
     _updated = true;

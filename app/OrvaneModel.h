@@ -1,5 +1,6 @@
 #pragma once
 
+#include "LogGenerator/LogChannelObserver.h"
 #include "LogGenerator/LogGenerator.h"
 #include "platform/MainQueue.h"
 #include "platform/MessagePort.h"
@@ -35,6 +36,8 @@ struct ModelEnvironment {
     std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
     // Makes the unique part of the local port's name.
     std::function<std::optional<std::string>()> makeUuid;
+    // Sees every channel and every message, before it is decoded. May be null.
+    LogChannelObserver* channelObserver = nullptr;
 };
 
 // The one model: owns the log-channel connection, the generator and the state that the generator

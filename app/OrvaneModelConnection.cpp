@@ -138,6 +138,8 @@ void OrvaneModel::configureGenerator()
         return;
     }
     adoptGenerator(LogGenerator::generatorFromTechnology(technology));
+    if (_logGenerator && _environment.channelObserver)
+        _environment.channelObserver->channelOpened(technology);
     logError("Got log generated: %p", static_cast<void*>(_logGenerator.get()));
 }
 
