@@ -1,0 +1,106 @@
+#include "recordings/LogRecorder.h"
+
+#include "LogGenerator/LogMessage.h"
+#include "LogGenerator/VersionReport.h"
+#include "platform/Console.h"
+#include "platform/SystemLog.h"
+#include "platform/TelephonyServer.h"
+
+#include <cerrno>
+#include <cstring>
+#include <filesystem>
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr std::size_t kLongestItem = 0xFFFF; // what the length field holds
+
+} // namespace
+
+std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::string& path,
+                                                 DiskRecordingFile::Existing existing,
+                                                 std::string& error)
+{
+    auto file = DiskRecordingFile::create(path, existing, error);
+    if (!file)
+        return nullptr;
+    const auto report = makeVersionReport();
+    const int failure = report ? file->append(*report) : EIO;
+    if (failure == 0)
+        return std::make_unique<LogRecorder>(queue, std::move(file), path);
+    error = path + " cannot be written (" + std::strerror(failure) +
+            "): make room, or give another name to record to";
+    std::error_code ignored;
+    if (std::filesystem::is_regular_file(path, ignored))
+        std::filesystem::remove(path, ignored);
+    return nullptr;
+}
+
+LogRecorder::LogRecorder(MainQueue& queue, std::unique_ptr<RecordingFile> file, std::string path)
+    : _queue(queue), _file(std::move(file)), _path(std::move(path))
+{
+}
+
+LogRecorder::~LogRecorder()
+{
+    if (_file)
+        endIfFailed(_file->synchronise());
+}
+
+void LogRecorder::channelOpened(const PropertyValue& technology)
+{
+    _hasModemMessages = technology != kTSLogChannelTechnology_IFX;
+    if (_hasModemMessages || !_file || std::exchange(_hasSaidThatNothingComes, true))
+        return;
+    consoleLine("Nothing to record to %s: a cell monitor has no messages of a modem.",
+                _path.c_str());
+}
+
+void LogRecorder::messageReceived(ByteView message)
+{
+    if (!_file || !_hasModemMessages || message.size() < kLogHeaderBytes)
+        return;
+    message = unwrappedMessage(message);
+    // No item of a file has code 0.
+    if (message.size() < kLogHeaderBytes || message[0] != kModemItem || logCodeOf(message) == 0)
+        return;
+    const ByteView item = message.subspan(1);
+    if (item.size() > kLongestItem) {
+        logError("Not recording a message of %zu bytes: no file holds it", message.size());
+        return;
+    }
+    // Its length is what it has; a wrong one would hide what follows.
+    _item.assign(item.begin(), item.end());
+    _item[0] = static_cast<std::uint8_t>(item.size());
+    _item[1] = static_cast<std::uint8_t>(item.size() >> 8);
+    endIfFailed(_file->append(_item));
+    synchroniseSoon();
+}
+
+void LogRecorder::synchroniseSoon()
+{
+    if (!_file || std::exchange(_isSynchronisationQueued, true))
+        return;
+    _queue.after(kSynchronisation, [this, alive = std::weak_ptr(_alive)] {
+        if (alive.expired())
+            return;
+        _isSynchronisationQueued = false;
+        if (_file)
+            endIfFailed(_file->synchronise());
+    });
+}
+
+void LogRecorder::endIfFailed(int error)
+{
+    if (error == 0)
+        return;
+    consoleLine("Recording to %s has ended: %s. What came before is kept.", _path.c_str(),
+                std::strerror(error));
+    _file.reset();
+}
+
+} // namespace orvane

@@ -1,0 +1,57 @@
+#pragma once
+
+#include "LogGenerator/LogChannelObserver.h"
+#include "platform/MainQueue.h"
+#include "recordings/RecordingFile.h"
+
+#include <chrono>
+#include <memory>
+#include <string>
+
+namespace orvane
+{
+
+// Records a log channel as a plain DLF file: the version report, then the item of every modem
+// message as it comes, without type bytes and wrappers, across all reconnections. What the server
+// made itself has no place in such a file.
+//
+// Each item is written at once, so that the end of the process loses none; what was written is made
+// safe from a power cut within a second. The first failure, a full disk as a rule, ends the
+// recording with one line on the console and leaves the whole items in the file.
+class LogRecorder final : public LogChannelObserver
+{
+public:
+    static constexpr std::chrono::milliseconds kSynchronisation{500};
+
+    // Null where the file cannot be begun; `error` then says so and what to do. The queue must
+    // outlive the recorder.
+    static std::unique_ptr<LogRecorder> create(MainQueue& queue, const std::string& path,
+                                               DiskRecordingFile::Existing existing,
+                                               std::string& error);
+    // Records to a file that begins here; `path` is its name for people. A file that takes nothing
+    // ends the recording at once.
+    LogRecorder(MainQueue& queue, std::unique_ptr<RecordingFile> file, std::string path);
+    ~LogRecorder() override;
+    LogRecorder(const LogRecorder&) = delete;
+    LogRecorder& operator=(const LogRecorder&) = delete;
+
+    void channelOpened(const PropertyValue& technology) override;
+    void messageReceived(ByteView message) override;
+
+    [[nodiscard]] bool isRecording() const { return _file != nullptr; }
+
+private:
+    void synchroniseSoon();
+    void endIfFailed(int error);
+
+    MainQueue& _queue;
+    std::unique_ptr<RecordingFile> _file; // null once it failed
+    std::string _path;
+    bool _hasModemMessages = true;
+    bool _hasSaidThatNothingComes = false;
+    bool _isSynchronisationQueued = false;
+    Bytes _item; // kept for its memory
+    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+};
+
+} // namespace orvane
