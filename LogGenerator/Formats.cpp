@@ -1,30 +1,20 @@
 #include "LogGenerator/Formats.h"
 
+#include "platform/FormatText.h"
+
 #include <charconv>
 #include <cstdarg>
-#include <cstdio>
 
 namespace orvane
 {
 
 std::string printed(const char* format, ...)
 {
-    char text[128];
     std::va_list arguments;
     va_start(arguments, format);
-    std::va_list again;
-    va_copy(again, arguments);
-    const int length = std::vsnprintf(text, sizeof text, format, arguments);
+    std::string text = formatText(format, arguments).value_or("");
     va_end(arguments);
-    std::string result;
-    if (length >= 0 && static_cast<std::size_t>(length) < sizeof text) {
-        result.assign(text, static_cast<std::size_t>(length));
-    } else if (length > 0) {
-        result.resize(static_cast<std::size_t>(length));
-        std::vsnprintf(result.data(), result.size() + 1, format, again);
-    }
-    va_end(again);
-    return result;
+    return text;
 }
 
 RowText decimal(std::int64_t raw)

@@ -1,5 +1,6 @@
 #include "platform/Console.h"
 
+#include "platform/FormatText.h"
 #include "platform/Services.h"
 
 #include <cstdarg>
@@ -20,16 +21,9 @@ void consoleLine(const char* format, ...)
 {
     std::va_list arguments;
     va_start(arguments, format);
-    std::va_list again;
-    va_copy(again, arguments);
-    const int length = std::vsnprintf(nullptr, 0, format, arguments);
+    if (const auto text = formatText(format, arguments))
+        Services::current().console().writeLine(*text);
     va_end(arguments);
-    if (length >= 0) {
-        std::string text(static_cast<std::size_t>(length), '\0');
-        std::vsnprintf(text.data(), text.size() + 1, format, again);
-        Services::current().console().writeLine(text);
-    }
-    va_end(again);
 }
 
 } // namespace orvane

@@ -1,5 +1,6 @@
 #include "platform/SystemLog.h"
 
+#include "platform/FormatText.h"
 #include "platform/Services.h"
 
 #include <algorithm>
@@ -25,18 +26,8 @@ std::string_view withoutNewline(std::string_view text)
     SystemLog& log = Services::current().log();
     if (!log.accepts(priority))
         return;
-    std::va_list again;
-    va_copy(again, arguments);
-    char text[256];
-    const int length = std::vsnprintf(text, sizeof text, format, arguments);
-    if (length >= 0 && static_cast<std::size_t>(length) < sizeof text) {
-        log.write(priority, std::string_view(text, static_cast<std::size_t>(length)));
-    } else if (length > 0) {
-        std::string longText(static_cast<std::size_t>(length), '\0');
-        std::vsnprintf(longText.data(), longText.size() + 1, format, again);
-        log.write(priority, longText);
-    }
-    va_end(again);
+    if (const auto text = formatText(format, arguments))
+        log.write(priority, *text);
 }
 
 } // namespace
