@@ -12,10 +12,4 @@ inline constexpr const char* kHistoryKey = "History";
 inline constexpr const char* kDateKey = "Date";
 inline constexpr const char* kDescriptionKey = "Description";
 
-// Keys of the start command.
-inline constexpr const char* kSetStateKey = "SetState";
-inline constexpr const char* kStreaming = "Streaming";
-inline constexpr const char* kSetModemLogCodesKey = "SetVarnelLogCodes";
-inline constexpr const char* kSetExtraCodesKey = "SetTsExtraCodes";
-
 } // namespace orvane

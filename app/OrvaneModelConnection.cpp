@@ -20,20 +20,12 @@ using namespace std::chrono_literals;
 constexpr auto kSendTimeout = 1000ms;
 constexpr auto kReplyTimeout = 1000ms;
 constexpr auto kRetryDelay = 5s;
-constexpr std::int32_t kChannelMessage = 0;
-constexpr const char* kGetTechnologyKey = "GetTechnology";
 
-ByteView bytesOf(const std::string& text)
-{
-    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
-}
-
-SendStatus sendTo(RemoteMessagePort* port, const std::string& text, Bytes* reply)
+SendStatus sendTo(RemoteMessagePort* port, ByteView data, Bytes* reply)
 {
     if (!port)
         return SendStatus::NotValid;
-    return port->send(kChannelMessage, bytesOf(text), kSendTimeout, reply ? kReplyTimeout : 0ms,
-                      reply);
+    return port->send(kChannelMessage, data, kSendTimeout, reply ? kReplyTimeout : 0ms, reply);
 }
 
 } // namespace
@@ -109,7 +101,7 @@ void OrvaneModel::destroyPorts()
 
 void OrvaneModel::configureGenerator()
 {
-    const auto query = writeXmlPropertyList(PropertyValue::dictionaryOf({
+    const auto query = xmlPropertyListBytes(PropertyValue::dictionaryOf({
         {kGetTechnologyKey, kGetTechnologyKey}
     }));
     if (!query) {
@@ -170,7 +162,7 @@ bool OrvaneModel::openSession()
         logError("No log generator technology works");
         return false;
     }
-    const auto command = writeXmlPropertyList(_logGenerator->getStartCommand());
+    const auto command = xmlPropertyListBytes(_logGenerator->getStartCommand());
     if (!command) {
         logError(" Could not generate PLIST");
         return false;

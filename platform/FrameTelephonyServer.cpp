@@ -48,15 +48,14 @@ public:
 
     LogChannelResult requestChannel(const std::string& localPortName)
     {
-        const auto request = writeXmlPropertyList(PropertyValue::dictionaryOf({
+        const auto request = xmlPropertyListBytes(PropertyValue::dictionaryOf({
             {kCreateLogChannelKey, localPortName}
         }));
         if (!request)
             return kUnusableAnswer; // the name is not even text
         Bytes answer;
-        const SendStatus status =
-            _requester.send(kCreateLogChannelMessage, Bytes(request->begin(), request->end()),
-                            kSendTimeout, kReceiveTimeout, &answer);
+        const SendStatus status = _requester.send(kCreateLogChannelMessage, *request, kSendTimeout,
+                                                  kReceiveTimeout, &answer);
         if (status != SendStatus::Success)
             return {static_cast<std::int32_t>(status), std::nullopt};
         return parseAnswer(answer);

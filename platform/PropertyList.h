@@ -32,6 +32,8 @@ PropertyListResult readPropertyList(ByteView bytes);
 // U+FFFF or invalid UTF-8, a date outside the years 1 to 9999); dates lose the fraction of a
 // second.
 std::optional<std::string> writeXmlPropertyList(const PropertyValue& value);
+// The same as bytes, as messages and files carry it.
+std::optional<Bytes> xmlPropertyListBytes(const PropertyValue& value);
 
 // Whether the bytes are well-formed UTF-8 (no surrogates, nothing beyond U+10FFFF).
 bool isValidUtf8(std::string_view text);

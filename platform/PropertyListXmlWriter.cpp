@@ -229,4 +229,10 @@ std::optional<std::string> writeXmlPropertyList(const PropertyValue& value)
     return writer.takeText();
 }
 
+std::optional<Bytes> xmlPropertyListBytes(const PropertyValue& value)
+{
+    const std::optional<std::string> text = writeXmlPropertyList(value);
+    return text ? std::optional(Bytes(text->begin(), text->end())) : std::nullopt;
+}
+
 } // namespace orvane

@@ -83,4 +83,12 @@ inline constexpr const char* kNotificationNameKey = "Name";
 inline constexpr const char* kNotificationInfoKey = "Info";
 inline constexpr const char* kChannelStreamingNotification = "ChannelStreaming";
 
+// Those of a log channel: technology query, start command and log messages.
+inline constexpr std::int32_t kChannelMessage = 0;
+inline constexpr const char* kGetTechnologyKey = "GetTechnology";
+inline constexpr const char* kSetStateKey = "SetState";
+inline constexpr const char* kStreaming = "Streaming";
+inline constexpr const char* kSetModemLogCodesKey = "SetVarnelLogCodes";
+inline constexpr const char* kSetExtraCodesKey = "SetTsExtraCodes";
+
 } // namespace orvane

@@ -3,23 +3,13 @@
 #include "platform/FrameRequester.h"
 #include "platform/PropertyList.h"
 #include "platform/SystemLog.h"
+#include "platform/TelephonyServer.h"
 #include "telephonyd/StartCommand.h"
 
 #include <utility>
 
 namespace orvane
 {
-
-namespace
-{
-
-constexpr std::int32_t kCommandMessage = 0;
-constexpr std::int32_t kLogMessage = 0;
-constexpr const char* kTechnologyKey = "GetTechnology";
-constexpr const char* kStateKey = "SetState";
-constexpr const char* kStreaming = "Streaming";
-
-} // namespace
 
 LogChannel::LogChannel(std::string name, std::unique_ptr<FrameListener> listener,
                        std::unique_ptr<FrameConnection> toClient, std::unique_ptr<LogSource> source,
@@ -50,7 +40,7 @@ void LogChannel::take(const FrameReader::View& frame)
     if (frame.isReply || _hasEnded)
         return;
     const std::optional<Bytes> reply =
-        frame.messageId == kCommandMessage ? obey(frame) : std::nullopt;
+        frame.messageId == kChannelMessage ? obey(frame) : std::nullopt;
     if (frame.wantsReply && !answerRequest(*_fromClient, frame.messageId, frame.serial, reply))
         end();
 }
@@ -62,13 +52,12 @@ std::optional<Bytes> LogChannel::obey(const FrameReader::View& frame)
         logError("%s: a command is no property list: %s", _name.c_str(), command.error.c_str());
         return std::nullopt;
     }
-    if (command.value[kTechnologyKey]) {
-        const auto answer = writeXmlPropertyList(PropertyValue::dictionaryOf({
-            {kTechnologyKey, _source->technology()}
+    if (command.value[kGetTechnologyKey]) {
+        return xmlPropertyListBytes(PropertyValue::dictionaryOf({
+            {kGetTechnologyKey, _source->technology()}
         }));
-        return answer ? std::optional(Bytes(answer->begin(), answer->end())) : std::nullopt;
     }
-    const std::string* state = command.value[kStateKey].asString();
+    const std::string* state = command.value[kSetStateKey].asString();
     if (state && *state == kStreaming)
         start(command.value);
     else
@@ -102,7 +91,7 @@ bool LogChannel::send(ByteView message)
         end();
         return false;
     }
-    if (!_toClient->send(kLogMessage, 0, false, false, message)) {
+    if (!_toClient->send(kChannelMessage, 0, false, false, message)) {
         end();
         return false;
     }

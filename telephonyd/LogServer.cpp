@@ -23,11 +23,7 @@ bool isClientPort(const std::string& name)
     return isUsablePortName(name) && !name.starts_with(kTelephonyServerPort);
 }
 
-Bytes xmlBytes(const PropertyValue& value)
-{
-    const std::string text = writeXmlPropertyList(value).value_or("");
-    return Bytes(text.begin(), text.end());
-}
+Bytes xmlBytes(const PropertyValue& value) { return xmlPropertyListBytes(value).value_or(Bytes()); }
 
 } // namespace
 

@@ -1,6 +1,7 @@
 #include "telephonyd/StartCommand.h"
 
 #include "platform/SystemLog.h"
+#include "platform/TelephonyServer.h"
 
 namespace orvane
 {
@@ -38,7 +39,7 @@ std::set<std::uint32_t> codesUnder(const PropertyValue& command, const char* key
 
 LogSelection selectionOfStartCommand(const PropertyValue& command)
 {
-    return {codesUnder(command, "SetVarnelLogCodes"), codesUnder(command, "SetTsExtraCodes")};
+    return {codesUnder(command, kSetModemLogCodesKey), codesUnder(command, kSetExtraCodesKey)};
 }
 
 } // namespace orvane

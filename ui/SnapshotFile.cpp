@@ -41,18 +41,17 @@ PropertyValue storable(const PropertyValue& value, std::size_t depth = 0)
 
 // Unchanged wherever that can be: a text that the network sent must not keep the rest from being
 // saved.
-std::optional<std::string> xmlOf(const PropertyValue& snapshot)
+std::optional<Bytes> xmlOf(const PropertyValue& snapshot)
 {
-    const std::optional<std::string> xml = writeXmlPropertyList(snapshot);
-    return xml ? xml : writeXmlPropertyList(storable(snapshot));
+    const std::optional<Bytes> xml = xmlPropertyListBytes(snapshot);
+    return xml ? xml : xmlPropertyListBytes(storable(snapshot));
 }
 
 bool write(const std::string& path, const PropertyValue& snapshot)
 {
-    const std::optional<std::string> xml = xmlOf(snapshot);
+    const std::optional<Bytes> xml = xmlOf(snapshot);
     // Directly, not through a temporary file. This is meant.
-    return xml &&
-           writeFile(path, {reinterpret_cast<const std::uint8_t*>(xml->data()), xml->size()});
+    return xml && writeFile(path, *xml);
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 #include "LogGenerator/LogMessage.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/Services.h"
+#include "platform/TelephonyServer.h"
 
 #include <algorithm>
 

@@ -3,6 +3,7 @@
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/PropertyList.h"
+#include "platform/TelephonyServer.h"
 
 #include <utility>
 

@@ -11,15 +11,12 @@ namespace orvane
 namespace
 {
 
-constexpr std::int32_t kCommandMessage = 0;
-constexpr const char* kGetTechnology = "GetTechnology";
-
 Bytes xmlBytes(const PropertyValue& value)
 {
-    const auto text = writeXmlPropertyList(value);
-    if (!text)
+    const auto bytes = xmlPropertyListBytes(value);
+    if (!bytes)
         throw std::invalid_argument("a test lets the server send what XML cannot carry");
-    return Bytes(text->begin(), text->end());
+    return *bytes;
 }
 
 Bytes garbage()
@@ -137,7 +134,7 @@ std::string ScriptedTelephonyServer::openChannel(const std::string& clientPort)
 
 void ScriptedTelephonyServer::takeChannelMessage(Channel& channel, const FrameReader::View& frame)
 {
-    if (frame.messageId != kCommandMessage)
+    if (frame.messageId != kChannelMessage)
         return;
     PropertyValue command = readPropertyList(frame.data).value;
     if (!frame.wantsReply) {
@@ -149,7 +146,7 @@ void ScriptedTelephonyServer::takeChannelMessage(Channel& channel, const FrameRe
     case TechnologyAnswer::Technology:
         answer(channel.fromClient, frame.serial,
                xmlBytes(PropertyValue::dictionaryOf({
-                   {kGetTechnology, technology}
+                   {kGetTechnologyKey, technology}
         })));
         break;
     case TechnologyAnswer::NoKey:

@@ -125,8 +125,7 @@ PhoneMessage CellMonitorScenario::cellList() const
         {"Serving Cell",   servingCell()   },
         {"Neighbor Cells", neighbourCells()},
     });
-    const std::string text = writeXmlPropertyList(list).value_or("");
-    return {PhoneMessage::Kind::Bare, 0, Bytes(text.begin(), text.end())};
+    return {PhoneMessage::Kind::Bare, 0, xmlPropertyListBytes(list).value_or(Bytes())};
 }
 
 PropertyValue CellMonitorScenario::network() const

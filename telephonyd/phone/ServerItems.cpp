@@ -7,8 +7,7 @@ namespace orvane
 
 PhoneMessage serverItem(std::uint16_t number, const PropertyValue& value)
 {
-    const std::string text = writeXmlPropertyList(value).value_or("");
-    return {PhoneMessage::Kind::Server, number, Bytes(text.begin(), text.end())};
+    return {PhoneMessage::Kind::Server, number, xmlPropertyListBytes(value).value_or(Bytes())};
 }
 
 PropertyValue simFiles()
