@@ -22,10 +22,10 @@ constexpr std::size_t kLongestItem = 0xFFFF; // what the length field holds
 } // namespace
 
 std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::string& path,
-                                                 DiskRecordingFile::Existing existing,
+                                                 DiskBlockFile::Existing existing,
                                                  std::string& error)
 {
-    auto file = DiskRecordingFile::create(path, existing, error);
+    auto file = DiskBlockFile::create(path, existing, error);
     if (!file)
         return nullptr;
     const auto report = makeVersionReport();
@@ -40,7 +40,7 @@ std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::st
     return nullptr;
 }
 
-LogRecorder::LogRecorder(MainQueue& queue, std::unique_ptr<RecordingFile> file, std::string path)
+LogRecorder::LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path)
     : _queue(queue), _file(std::move(file)), _path(std::move(path))
 {
 }

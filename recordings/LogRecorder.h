@@ -2,7 +2,7 @@
 
 #include "LogGenerator/LogChannelObserver.h"
 #include "platform/MainQueue.h"
-#include "recordings/RecordingFile.h"
+#include "recordings/BlockFile.h"
 
 #include <chrono>
 #include <memory>
@@ -26,11 +26,11 @@ public:
     // Null where the file cannot be begun; `error` then says so and what to do. The queue must
     // outlive the recorder.
     static std::unique_ptr<LogRecorder> create(MainQueue& queue, const std::string& path,
-                                               DiskRecordingFile::Existing existing,
+                                               DiskBlockFile::Existing existing,
                                                std::string& error);
     // Records to a file that begins here; `path` is its name for people. A file that takes nothing
     // ends the recording at once.
-    LogRecorder(MainQueue& queue, std::unique_ptr<RecordingFile> file, std::string path);
+    LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path);
     ~LogRecorder() override;
     LogRecorder(const LogRecorder&) = delete;
     LogRecorder& operator=(const LogRecorder&) = delete;
@@ -45,7 +45,7 @@ private:
     void endIfFailed(int error);
 
     MainQueue& _queue;
-    std::unique_ptr<RecordingFile> _file; // null once it failed
+    std::unique_ptr<BlockFile> _file; // null once it failed
     std::string _path;
     bool _hasModemMessages = true;
     bool _hasSaidThatNothingComes = false;

@@ -11,7 +11,7 @@ namespace orvane
 {
 
 // A file with a recording, recognised by its content.
-struct RecordingFile {
+struct BlockFile {
     // The one or the other, unless there is an error: a diagnostic log (or what may be one), read
     // as it is needed, or a snapshot, read whole.
     std::shared_ptr<ByteSource> log;
@@ -21,6 +21,6 @@ struct RecordingFile {
     std::optional<std::string> error;
 };
 
-RecordingFile openRecordingFile(const std::string& path);
+BlockFile openBlockFile(const std::string& path);
 
 } // namespace orvane

@@ -1,4 +1,4 @@
-#include "recordings/RecordingFile.h"
+#include "recordings/BlockFile.h"
 
 #include "platform/FileSystem.h"
 #include "platform/PropertyList.h"
@@ -31,7 +31,7 @@ bool looksLikePropertyList(ByteView start)
     return false;
 }
 
-void readSnapshot(RecordingFile& recording, const std::string& path)
+void readSnapshot(BlockFile& recording, const std::string& path)
 {
     const std::optional<Bytes> content = readFile(path, kLongestSnapshot);
     if (!content) {
@@ -51,9 +51,9 @@ void readSnapshot(RecordingFile& recording, const std::string& path)
 
 } // namespace
 
-RecordingFile openRecordingFile(const std::string& path)
+BlockFile openBlockFile(const std::string& path)
 {
-    RecordingFile recording;
+    BlockFile recording;
     std::string reason;
     recording.log = FileWindow::open(path, reason);
     if (!recording.log) {
