@@ -1,0 +1,97 @@
+#include "recordings/LogPlay.h"
+
+#include "LogGenerator/Silence.h"
+#include "LogGenerator/StateKeys.h"
+#include "recordings/LogSlice.h"
+
+#include <algorithm>
+#include <exception>
+#include <stdexcept>
+
+namespace orvane
+{
+
+namespace
+{
+
+std::unique_ptr<LogGenerator> newGenerator(const std::string& technology)
+{
+    const Silence silence;
+    auto generator = LogGenerator::generatorFromTechnology(technology);
+    if (!generator)
+        throw std::invalid_argument("there is no technology \"" + technology + "\"");
+    generator->keepNoMessages();
+    return generator;
+}
+
+} // namespace
+
+LogPlay::LogPlay(std::shared_ptr<ByteSource> log, const std::string& technology)
+    : _place{DlfReader(std::move(log)), ServingCell(technology)},
+      _generator(newGenerator(technology))
+{
+}
+
+LogPlay::~LogPlay()
+{
+    const Silence silence;
+    _generator.reset();
+}
+
+void LogPlay::lookAhead()
+{
+    if (_place.hasNext)
+        return;
+    const std::optional<DlfItem> item = _place.reader.next(LogSlice::kBytes);
+    if (!item)
+        return;
+    if (item->timestamp != 0 && !_place.hasClock) {
+        _place.clock = LogClock(item->timestamp);
+        _place.hasClock = true;
+    }
+    _place.hasNext = true;
+    _place.nextTime = std::max(_place.time, _place.clock.timeOf(item->timestamp));
+    _place.nextMessage.assign(1, item->type);
+    _place.nextMessage.insert(_place.nextMessage.end(), item->bytes.begin(), item->bytes.end());
+}
+
+void LogPlay::takeNext()
+{
+    if (!_place.hasNext)
+        return;
+    decodeNext();
+    _place.hasNext = false;
+    _place.time = _place.nextTime;
+    ++_place.itemsTaken;
+    lookAhead();
+    const bool isWholeMoment = !_place.hasNext || _place.nextTime > _place.time;
+    if (isWholeMoment && _place.servingCell.note(display()))
+        ++_place.servingCellChanges;
+}
+
+void LogPlay::decodeNext()
+{
+    const Silence silence(_tellsErrors ? Silence::Of::AllButErrors : Silence::Of::Everything);
+    try {
+        _generator->updateState(_state, _place.nextMessage);
+    } catch (const std::exception& failure) {
+        logError("Dropping a message of %zu bytes: %s", _place.nextMessage.size(), failure.what());
+    }
+}
+
+const PropertyValue& LogPlay::display() const { return _state[kDisplayKey]; }
+
+std::size_t LogPlay::Checkpoint::bytes() const
+{
+    return sizeof *this + generator.bytes + place.nextMessage.size() + place.reader.bytesKept();
+}
+
+LogPlay::Checkpoint LogPlay::checkpoint() const { return {_place, _generator->checkpoint(_state)}; }
+
+void LogPlay::restore(const Checkpoint& checkpoint)
+{
+    _place = checkpoint.place;
+    _generator->restore(_state, checkpoint.generator);
+}
+
+} // namespace orvane

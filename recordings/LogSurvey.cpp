@@ -1,0 +1,78 @@
+#include "recordings/LogSurvey.h"
+
+#include "LogGenerator/DlfWriter.h"
+#include "recordings/LogSlice.h"
+
+#include <algorithm>
+
+namespace orvane
+{
+
+namespace
+{
+
+constexpr std::size_t kNamedRanges = 3;
+
+} // namespace
+
+LogSurvey::LogSurvey(std::shared_ptr<ByteSource> log) : _log(std::move(log)), _reader(_log) {}
+
+bool LogSurvey::takeSlice()
+{
+    for (LogSlice slice(_reader); slice.goesOn();) {
+        const auto item = _reader.next(LogSlice::kBytes);
+        if (!item)
+            return !_reader.isAtEnd();
+        if (item->position == 0 && item->logCode == kDlfVersionReportCode)
+            _beginsWithReport = true;
+        _finder.take(*item);
+    }
+    return true;
+}
+
+double LogSurvey::progress() const
+{
+    const auto size = static_cast<double>(_log->size());
+    return size > 0 ? std::min(static_cast<double>(_reader.position()) / size, 1.0) : 1.0;
+}
+
+// Among any bytes a few are found that could be items. A log consists of them.
+bool LogSurvey::isLog() const
+{
+    return _beginsWithReport || _reader.placedBytes() > _reader.unplacedBytes();
+}
+
+std::optional<std::string> LogSurvey::technology() const
+{
+    return isLog() ? _finder.technology() : std::nullopt;
+}
+
+std::string LogSurvey::complaint(const std::string& path) const
+{
+    if (isLog())
+        return "\"" + path +
+               "\" holds no log codes that tell its technology: name it with --technology, one "
+               "of " +
+               technologyNames();
+    return "\"" + path +
+           "\" is neither a diagnostic log (.dlf) nor a snapshot (.orvane): name another file or, "
+           "for a badly damaged log, its technology with --technology, one of " +
+           technologyNames();
+}
+
+std::string unplacedRemark(const DlfReader& reader)
+{
+    if (reader.unplacedBytes() == 0)
+        return "";
+    std::string text = std::to_string(reader.unplacedBytes()) + " bytes could not be placed: ";
+    const auto& ranges = reader.unplacedRanges();
+    const std::size_t named = std::min(ranges.size(), kNamedRanges);
+    for (std::size_t i = 0; i < named; ++i)
+        text += (i > 0 ? ", " : "") + std::to_string(ranges[i].length) + " at byte " +
+                std::to_string(ranges[i].position);
+    if (reader.unplacedRangeCount() > named)
+        text += " and at " + std::to_string(reader.unplacedRangeCount() - named) + " more places";
+    return text;
+}
+
+} // namespace orvane

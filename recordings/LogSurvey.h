@@ -1,0 +1,42 @@
+#pragma once
+
+#include "LogGenerator/LogTechnology.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+// A first pass over a log, which decodes nothing: what technology it is of, and whether it is a log
+// at all.
+class LogSurvey
+{
+public:
+    explicit LogSurvey(std::shared_ptr<ByteSource> log);
+
+    // Goes on for a slice of some milliseconds; false at the end of the log.
+    bool takeSlice();
+    // How much has been read, 0 to 1.
+    [[nodiscard]] double progress() const;
+
+    // Once takeSlice() was false: the technology constant, or one line for the person who named the
+    // file that says what is wrong and what to do.
+    [[nodiscard]] std::optional<std::string> technology() const;
+    [[nodiscard]] std::string complaint(const std::string& path) const;
+
+private:
+    [[nodiscard]] bool isLog() const;
+
+    std::shared_ptr<ByteSource> _log;
+    DlfReader _reader;
+    TechnologyFinder _finder;
+    bool _beginsWithReport = false;
+};
+
+// What a person should know about a log that has been read: how many bytes could not be placed, and
+// where. Empty where all could.
+std::string unplacedRemark(const DlfReader& reader);
+
+} // namespace orvane

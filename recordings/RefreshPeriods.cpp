@@ -1,0 +1,37 @@
+#include "recordings/RefreshPeriods.h"
+
+#include "recordings/LogSlice.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+RefreshPeriods::RefreshPeriods(std::shared_ptr<ByteSource> log, const std::string& technology,
+                               LogTime period)
+    : _play(std::move(log), technology), _period(period)
+{
+    _play.setTellsErrors(true);
+}
+
+RefreshPeriods::Reached RefreshPeriods::takeSlice()
+{
+    for (LogSlice slice(_play.reader()); slice.goesOn();) {
+        _play.lookAhead();
+        if (!_play.hasNext()) {
+            if (!_play.isAtEnd())
+                return Reached::Nothing;
+            return std::exchange(_isOpen, false) ? Reached::Period : Reached::End;
+        }
+        const auto next = _play.nextTime() / _period;
+        if (_isOpen && next > _play.time() / _period) {
+            _isOpen = false;
+            return Reached::Period;
+        }
+        _isOpen = true;
+        _play.takeNext();
+    }
+    return Reached::Nothing;
+}
+
+} // namespace orvane

@@ -1,0 +1,34 @@
+#pragma once
+
+#include "LogGenerator/ByteSource.h"
+#include "platform/PropertyValue.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace orvane
+{
+
+// A saved snapshot: what was kept of a live view, with what the user wrote about it. Whatever a
+// file lacks, or has of the wrong kind, is empty here.
+struct Snapshot {
+    // One of the things that were saved: a display as it was, or the log.
+    struct Entry {
+        std::string description;
+        std::string date;                          // as written: "2026-11-21 10:00:00 +0000"
+        std::optional<std::int64_t> secondsOfDate; // since 1970, where the date can be read
+        PropertyValue display;                     // absent where the entry has none
+        std::shared_ptr<ByteSource> log;           // a diagnostic log; null where it has none
+    };
+
+    std::string timestamp;
+    std::string description;
+    std::vector<Entry> entries;
+};
+
+// Nothing for what is no dictionary with any of a snapshot's keys.
+std::optional<Snapshot> snapshotFrom(const PropertyValue& value);
+
+} // namespace orvane
