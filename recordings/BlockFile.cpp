@@ -1,11 +1,10 @@
 #include "recordings/BlockFile.h"
 
-#include "platform/FileSystem.h"
-#include "platform/PropertyList.h"
-#include "recordings/FileWindow.h"
-
-#include <algorithm>
-#include <string_view>
+#include <cerrno>
+#include <cstring>
+#include <fcntl.h>
+#include <filesystem>
+#include <unistd.h>
 
 namespace orvane
 {
@@ -13,60 +12,55 @@ namespace orvane
 namespace
 {
 
-constexpr std::size_t kLongestSnapshot = 256 << 20;
-constexpr std::size_t kLongestStart = 64;
-
-bool looksLikePropertyList(ByteView start)
+std::string whyNot(const std::string& path, int error)
 {
-    std::string_view text(reinterpret_cast<const char*>(start.data()), start.size());
-    for (const char* beginning : {"bplist00", "\xFE\xFF", "\xFF\xFE"})
-        if (text.starts_with(beginning))
-            return true;
-    if (text.starts_with("\xEF\xBB\xBF"))
-        text.remove_prefix(3);
-    text.remove_prefix(std::min(text.find_first_not_of(" \t\r\n"), text.size()));
-    for (const char* beginning : {"<?xml", "<plist", "<!--", "<!DOCTYPE"})
-        if (text.starts_with(beginning))
-            return true;
-    return false;
-}
-
-void readSnapshot(BlockFile& recording, const std::string& path)
-{
-    const std::optional<Bytes> content = readFile(path, kLongestSnapshot);
-    if (!content) {
-        recording.error = "\"" + path + "\" is too long for a snapshot: check what file it is";
-        return;
-    }
-    const PropertyListResult list = readPropertyList(*content);
-    recording.snapshot = snapshotFrom(list.value);
-    if (!list.value)
-        recording.error = "\"" + path + "\" cannot be read as a snapshot (" + list.error +
-                          "): it may have been cut short; name another file";
-    else if (!recording.snapshot)
-        recording.error = "\"" + path +
-                          "\" is a property list, but no snapshot of this program: name a snapshot "
-                          "(.orvane) or a diagnostic log (.dlf)";
+    std::error_code ignored;
+    if (error == EEXIST && !std::filesystem::is_directory(path, ignored))
+        return path + " is there already: give --force to overwrite it, or another name";
+    return path + " cannot be written (" + std::strerror(error == EEXIST ? EISDIR : error) +
+           "): give another name to record to";
 }
 
 } // namespace
 
-BlockFile openBlockFile(const std::string& path)
+std::unique_ptr<DiskBlockFile> DiskBlockFile::create(const std::string& path, Existing existing,
+                                                     std::string& error)
 {
-    BlockFile recording;
-    std::string reason;
-    recording.log = FileWindow::open(path, reason);
-    if (!recording.log) {
-        recording.error =
-            "cannot read \"" + path + "\" (" + reason +
-            "): name a diagnostic log (.dlf) or a snapshot (.orvane) that may be read";
-        return recording;
+    // Without O_NONBLOCK, a named pipe would be waited for.
+    const int flags = O_WRONLY | O_CREAT | O_CLOEXEC | O_NONBLOCK |
+                      (existing == Existing::Overwritten ? O_TRUNC : O_EXCL);
+    const int descriptor = ::open(path.c_str(), flags, 0666);
+    if (descriptor < 0) {
+        error = whyNot(path, errno);
+        return nullptr;
     }
-    if (looksLikePropertyList(recording.log->bytes(0, kLongestStart))) {
-        recording.log = nullptr;
-        readSnapshot(recording, path);
+    return std::unique_ptr<DiskBlockFile>(new DiskBlockFile(descriptor));
+}
+
+DiskBlockFile::~DiskBlockFile() { ::close(_descriptor); }
+
+int DiskBlockFile::append(ByteView block)
+{
+    ByteView rest = block;
+    while (!rest.empty()) {
+        const ssize_t written = ::write(_descriptor, rest.data(), rest.size());
+        if (written > 0) {
+            rest = rest.subspan(static_cast<std::size_t>(written));
+        } else if (written == 0 || errno != EINTR) {
+            const int error = written == 0 ? EIO : errno;
+            [[maybe_unused]] const int cut = ::ftruncate(_descriptor, _length);
+            ::lseek(_descriptor, _length, SEEK_SET);
+            return error;
+        }
     }
-    return recording;
+    _length += static_cast<std::int64_t>(block.size());
+    return 0;
+}
+
+int DiskBlockFile::synchronise()
+{
+    // Devices and pipes, which keep nothing, answer that there is nothing to do.
+    return ::fdatasync(_descriptor) == 0 || errno == EINVAL || errno == EROFS ? 0 : errno;
 }
 
 } // namespace orvane

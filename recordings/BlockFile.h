@@ -1,26 +1,48 @@
 #pragma once
 
-#include "LogGenerator/ByteSource.h"
-#include "recordings/Snapshot.h"
+#include "platform/PropertyValue.h"
 
+#include <cstdint>
 #include <memory>
-#include <optional>
 #include <string>
 
 namespace orvane
 {
 
-// A file with a recording, recognised by its content.
-struct BlockFile {
-    // The one or the other, unless there is an error: a diagnostic log (or what may be one), read
-    // as it is needed, or a snapshot, read whole.
-    std::shared_ptr<ByteSource> log;
-    std::optional<Snapshot> snapshot;
-
-    // One line that says what is wrong and what to do.
-    std::optional<std::string> error;
+// A file that grows by whole blocks. The operations return 0, or what went wrong as an errno.
+class BlockFile
+{
+public:
+    virtual ~BlockFile() = default;
+    // Writes the block at the file's end, at once. Where that fails, what was written of it is
+    // taken back, so that the file ends with the block before.
+    virtual int append(ByteView block) = 0;
+    // Waits until all that was appended is safe from a power cut.
+    virtual int synchronise() = 0;
 };
 
-BlockFile openBlockFile(const std::string& path);
+// A file on disk.
+class DiskBlockFile final : public BlockFile
+{
+public:
+    enum class Existing { Refused, Overwritten };
+
+    // Null where the file cannot be made, or is there and may not be overwritten; `error` then says
+    // so and what to do.
+    static std::unique_ptr<DiskBlockFile> create(const std::string& path, Existing existing,
+                                                 std::string& error);
+    ~DiskBlockFile() override;
+    DiskBlockFile(const DiskBlockFile&) = delete;
+    DiskBlockFile& operator=(const DiskBlockFile&) = delete;
+
+    int append(ByteView block) override;
+    int synchronise() override;
+
+private:
+    explicit DiskBlockFile(int descriptor) : _descriptor(descriptor) {}
+
+    int _descriptor;
+    std::int64_t _length = 0; // of the whole blocks
+};
 
 } // namespace orvane
