@@ -4,7 +4,7 @@
 
 # What building needs, and what ./check needs on top. Add here what a CMakeLists.txt looks for.
 # shellcheck disable=SC2034
-build_packages=(g++ cmake ninja-build libexpat1-dev qt6-base-dev)
+build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev)
 # shellcheck disable=SC2034
 check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev)
 
@@ -28,6 +28,7 @@ purpose_of() {
     cmake) echo "CMake 3.25 or newer" ;;
     ninja-build) echo "Ninja" ;;
     libexpat1-dev) echo "Expat with its headers" ;;
+    libncurses-dev) echo "ncurses with its headers, wide characters included" ;;
     qt6-base-dev) echo "Qt 6.4 or newer with its headers" ;;
     clang) echo "clang 14 or newer" ;;
     libclang-rt-dev) echo "clang's sanitizers and libFuzzer" ;;

@@ -10,12 +10,13 @@ namespace
 {
 
 // More cells than any screen shows are kept by nobody.
-constexpr std::size_t kLargestPool = 256;
+constexpr std::size_t kLargestPool = 1024;
 
 } // namespace
 
 void TableView::reloadData()
 {
+    ++_reloadCount;
     _selectedRow.reset();
     for (auto& [row, cell] : std::exchange(_cells, {}))
         recycle(row, std::move(cell));

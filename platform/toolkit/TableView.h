@@ -54,6 +54,8 @@ public:
 
     // Puts all cells into the pool, forgets the selection and asks the data source anew.
     void reloadData();
+    // How often that was, so that a front end sees whether there is something new.
+    [[nodiscard]] std::size_t reloadCount() const { return _reloadCount; }
     // As of the last reload.
     [[nodiscard]] std::size_t numberOfRows() const { return _rowCount; }
     [[nodiscard]] double rowHeight() const { return TableViewCell::kDefaultHeight; }
@@ -89,6 +91,7 @@ private:
 
     TableViewDataSource* _dataSource = nullptr;
     TableViewDelegate* _delegate = nullptr;
+    std::size_t _reloadCount = 0;
     std::size_t _rowCount = 0;
     std::size_t _firstVisible = 0;
     std::size_t _visibleCount = 0;
