@@ -16,6 +16,7 @@ void prepareStandardDescriptors()
         if (::fcntl(descriptor, F_GETFD) < 0 && errno == EBADF) [[maybe_unused]]
             const int opened = ::open("/dev/null", O_RDWR);
     std::signal(SIGPIPE, SIG_IGN);
+    std::signal(SIGXFSZ, SIG_IGN);
 }
 
 } // namespace orvane
