@@ -1,0 +1,60 @@
+#include "recordings/Checkpoints.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+// However large they are, so many are kept.
+constexpr std::size_t kFewest = 8;
+
+// The last of those for which the test holds, it being true for those up to some place.
+template <typename Test>
+const LogPlay::Checkpoint* lastOf(const std::vector<LogPlay::Checkpoint>& all, const Test& test)
+{
+    const auto behind = std::partition_point(all.begin(), all.end(), test);
+    return behind == all.begin() ? nullptr : &*std::prev(behind);
+}
+
+} // namespace
+
+void Checkpoints::pass(const LogPlay& play)
+{
+    if (play.itemsTaken() % _spacing != 0)
+        return;
+    _all.push_back(play.checkpoint());
+    _bytes += _all.back().bytes();
+    while (_all.size() > kMost || (_bytes > kMostBytes && _all.size() > kFewest))
+        thinOut();
+}
+
+void Checkpoints::thinOut()
+{
+    _spacing *= 2;
+    std::erase_if(_all, [this](const LogPlay::Checkpoint& each) {
+        return each.place.itemsTaken % _spacing != 0;
+    });
+    _bytes = 0;
+    for (const LogPlay::Checkpoint& each : _all)
+        _bytes += each.bytes();
+}
+
+const LogPlay::Checkpoint* Checkpoints::before(LogTime time) const
+{
+    return lastOf(_all, [time](const LogPlay::Checkpoint& each) {
+        return each.place.itemsTaken == 0 || each.place.time < time;
+    });
+}
+
+const LogPlay::Checkpoint* Checkpoints::withCellChanges(std::uint64_t most) const
+{
+    return lastOf(_all, [most](const LogPlay::Checkpoint& each) {
+        return each.place.servingCellChanges <= most;
+    });
+}
+
+} // namespace orvane

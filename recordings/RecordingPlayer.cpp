@@ -1,0 +1,260 @@
+#include "recordings/RecordingPlayer.h"
+
+#include "recordings/TypedTime.h"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+using std::chrono::nanoseconds;
+
+constexpr int kSpeeds[] = {1, 2, 5, 10, 20, 50, 100, 200, 500, 1000};
+
+// What a person sees of a display that changes more often.
+constexpr nanoseconds kShortestTurn = std::chrono::milliseconds(50);
+
+// Of the time that reading takes, about what finding the technology does.
+constexpr double kSurveyShare = 0.05;
+
+double secondsOf(LogTime time) { return std::chrono::duration<double>(time).count(); }
+
+LogTime timeOf(double seconds)
+{
+    const double farthest = secondsOf(LogTime::max()) / 2;
+    if (!(seconds > 0))
+        return LogTime(0);
+    return LogTime(std::llround(std::min(seconds, farthest) * 1e9));
+}
+
+} // namespace
+
+RecordingPlayer::RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
+                                 PlayerSettings settings, OnChange onChange)
+    : _queue(queue), _now(std::move(now)), _log(std::move(log)), _settings(std::move(settings)),
+      _onChange(std::move(onChange))
+{
+    if (_settings.technology)
+        beginReading(*_settings.technology);
+    else
+        _survey.emplace(_log);
+    readLater();
+}
+
+void RecordingPlayer::readLater()
+{
+    _queue.async([this, alive = std::weak_ptr(_alive)] {
+        if (!alive.expired())
+            read();
+    });
+}
+
+void RecordingPlayer::read()
+{
+    if (_failure || isReady())
+        return;
+    if (_survey) {
+        if (!_survey->takeSlice()) {
+            if (const auto technology = _survey->technology())
+                beginReading(*technology);
+            else
+                _failure = _survey->complaint(_settings.name);
+            _survey.reset();
+        }
+    } else if (!_timeline->readSlice()) {
+        endReading();
+        return;
+    }
+    if (!_failure)
+        readLater();
+    tell();
+}
+
+void RecordingPlayer::beginReading(const std::string& technology)
+{
+    _timeline = std::make_unique<LogTimeline>(_log, technology);
+}
+
+void RecordingPlayer::endReading() { moveTo(_settings.refreshPeriod); }
+
+void RecordingPlayer::stopReading()
+{
+    if (!_timeline || isReady())
+        return;
+    _timeline->stopReading();
+    endReading();
+}
+
+double RecordingPlayer::progress() const
+{
+    if (_timeline)
+        return isReady() ? 1 : kSurveyShare + (1 - kSurveyShare) * _timeline->progress();
+    return _survey ? kSurveyShare * _survey->progress() : 1;
+}
+
+NodePointer RecordingPlayer::topLevelNodes()
+{
+    if (!_nodes && isReady())
+        _nodes = OrvaneModelNode::makeTreeFromObject(_timeline->display(), _nodesByPath);
+    return _nodes;
+}
+
+NodePointer RecordingPlayer::nodeAtPath(const std::string& path)
+{
+    topLevelNodes();
+    const auto found = _nodesByPath.find(path);
+    return found == _nodesByPath.end() ? nullptr : found->second;
+}
+
+double RecordingPlayer::position() const
+{
+    return _timeline ? secondsOf(_timeline->position()) : 0;
+}
+
+double RecordingPlayer::duration() const
+{
+    return _timeline ? secondsOf(_timeline->duration()) : 0;
+}
+
+std::string RecordingPlayer::positionText() const
+{
+    return isReady() ? _timeline->clock().text(_timeline->position()) : "";
+}
+
+std::string RecordingPlayer::remark() const { return _timeline ? _timeline->remark() : ""; }
+
+double RecordingPlayer::speed() const { return kSpeeds[_speed]; }
+
+void RecordingPlayer::play()
+{
+    if (!isReady() || isPlaying())
+        return;
+    if (_timeline->position() == _timeline->duration())
+        _timeline->moveTo(LogTime(0));
+    _playedTo = _now();
+    startTimer();
+    moved();
+}
+
+void RecordingPlayer::startTimer()
+{
+    const nanoseconds turn = std::max(_settings.refreshPeriod / kSpeeds[_speed], kShortestTurn);
+    _timer = _queue.repeatingTimer(turn, [this] { goOn(); });
+}
+
+// As many whole refresh periods as have passed at this speed since the last time.
+void RecordingPlayer::goOn()
+{
+    const nanoseconds perPeriod = _settings.refreshPeriod / kSpeeds[_speed];
+    const auto periods = (_now() - _playedTo) / std::max(perPeriod, nanoseconds(1));
+    if (periods <= 0)
+        return;
+    _playedTo += periods * perPeriod;
+    const LogTime left = _timeline->duration() - _timeline->position();
+    const bool isEnd = periods >= left / _settings.refreshPeriod + 1;
+    moveTo(isEnd ? _timeline->duration()
+                 : _timeline->position() + periods * _settings.refreshPeriod);
+    if (_timeline->position() == _timeline->duration())
+        pause();
+}
+
+void RecordingPlayer::pause()
+{
+    if (!isPlaying())
+        return;
+    _timer.reset();
+    tell();
+}
+
+void RecordingPlayer::faster()
+{
+    if (_speed + 1 >= std::size(kSpeeds))
+        return;
+    ++_speed;
+    if (isPlaying())
+        startTimer();
+    tell();
+}
+
+void RecordingPlayer::slower()
+{
+    if (_speed == 0)
+        return;
+    --_speed;
+    if (isPlaying())
+        startTimer();
+    tell();
+}
+
+void RecordingPlayer::step()
+{
+    if (!isReady())
+        return;
+    _timer.reset();
+    const LogTime left = _timeline->duration() - _timeline->position();
+    moveTo(_timeline->position() + std::min(left, LogTime(_settings.refreshPeriod)));
+}
+
+void RecordingPlayer::stepBack()
+{
+    if (!isReady())
+        return;
+    _timer.reset();
+    moveTo(_timeline->position() - _settings.refreshPeriod);
+}
+
+void RecordingPlayer::jumpTo(double position) { moveTo(timeOf(position)); }
+
+void RecordingPlayer::jumpToEnd()
+{
+    if (_timeline)
+        moveTo(_timeline->duration());
+}
+
+void RecordingPlayer::jumpToNextServingCell()
+{
+    if (!isReady())
+        return;
+    _timeline->moveToNextServingCell();
+    moved();
+}
+
+bool RecordingPlayer::jumpToText(const std::string& text)
+{
+    if (!isReady())
+        return false;
+    const auto time =
+        typedTime(text, _timeline->clock(), _timeline->position(), _timeline->duration());
+    if (time)
+        moveTo(*time);
+    return time.has_value();
+}
+
+void RecordingPlayer::moveTo(LogTime position)
+{
+    if (!isReady())
+        return;
+    _timeline->moveTo(position);
+    moved();
+}
+
+void RecordingPlayer::moved()
+{
+    _nodes = nullptr;
+    _nodesByPath.clear();
+    tell();
+}
+
+void RecordingPlayer::tell() const
+{
+    if (_onChange)
+        _onChange();
+}
+
+} // namespace orvane

@@ -1,0 +1,96 @@
+#pragma once
+
+#include "platform/MainQueue.h"
+#include "platform/toolkit/Playback.h"
+#include "recordings/LogSurvey.h"
+#include "recordings/LogTimeline.h"
+#include "ui/OrvaneModelNode.h"
+
+#include <chrono>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+// What a log is played with.
+struct PlayerSettings {
+    std::string name;                      // what the person calls the log: for messages
+    std::optional<std::string> technology; // the constant; nothing where its codes are to tell
+    std::chrono::nanoseconds refreshPeriod = std::chrono::seconds(2); // more than 0
+};
+
+// Plays a diagnostic log as if it were a live view that refreshes every refresh period, from the
+// queue of the main thread. First the log is read, a slice a turn of the queue; then it stands at
+// the end of its first period. While it plays, it goes on by whole refresh periods of the
+// recording, at a higher speed several at once.
+class RecordingPlayer final : public Playback
+{
+public:
+    // Time that goes on steadily, from any start.
+    using Now = std::function<std::chrono::nanoseconds()>;
+    // Something that is asked for here has changed. Never called by the constructor.
+    using OnChange = std::function<void()>;
+
+    // The queue must outlive the player.
+    RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
+                    PlayerSettings settings, OnChange onChange);
+
+    // One line that says why the log cannot be played, and what to do. Reading has ended then.
+    [[nodiscard]] const std::optional<std::string>& failure() const { return _failure; }
+    [[nodiscard]] bool isReady() const { return _timeline && _timeline->isRead(); }
+
+    // The display at the position, as a live view's: null before the log has been read.
+    NodePointer topLevelNodes();
+    // The node under that path or null.
+    NodePointer nodeAtPath(const std::string& path);
+
+    [[nodiscard]] double progress() const override;
+    void stopReading() override;
+    [[nodiscard]] double position() const override;
+    [[nodiscard]] double duration() const override;
+    [[nodiscard]] std::string positionText() const override;
+    [[nodiscard]] std::string remark() const override;
+    [[nodiscard]] bool isPlaying() const override { return _timer != nullptr; }
+    [[nodiscard]] double speed() const override;
+    void play() override;
+    void pause() override;
+    void faster() override;
+    void slower() override;
+    void step() override;
+    void stepBack() override;
+    void jumpTo(double position) override;
+    void jumpToEnd() override;
+    void jumpToNextServingCell() override;
+    bool jumpToText(const std::string& text) override;
+
+private:
+    void readLater();
+    void read();
+    void beginReading(const std::string& technology);
+    void endReading();
+    void startTimer();
+    void goOn();
+    void moveTo(LogTime position);
+    void moved();
+    void tell() const;
+
+    MainQueue& _queue;
+    Now _now;
+    std::shared_ptr<ByteSource> _log;
+    PlayerSettings _settings;
+    OnChange _onChange;
+    std::optional<std::string> _failure;
+    std::optional<LogSurvey> _survey;       // while the technology is sought
+    std::unique_ptr<LogTimeline> _timeline; // from then on
+    NodePointer _nodes;
+    PathDictionary _nodesByPath;
+    std::unique_ptr<Timer> _timer; // while playing
+    std::size_t _speed = 0;        // index
+    std::chrono::nanoseconds _playedTo{0};
+    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+};
+
+} // namespace orvane
