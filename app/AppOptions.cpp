@@ -21,6 +21,7 @@ constexpr CommandLineOption kOptions[] = {
     {"ports",         Value::Required},
     {"root",          Value::Required},
     {"refresh",       Value::Required},
+    {"fullscreen",    Value::None    },
     {kLogOption,      Value::Required},
     {kLogLevelOption, Value::Required},
 };
@@ -37,17 +38,28 @@ std::string joined(std::span<const std::string> names)
     return text;
 }
 
+struct FrontEndName {
+    const char* name;
+    FrontEndKind kind;
+};
+
+constexpr FrontEndName kFrontEnds[] = {
+    {"window",   FrontEndKind::Window  },
+    {"terminal", FrontEndKind::Terminal},
+    {"text",     FrontEndKind::Text    },
+    {"json",     FrontEndKind::Json    },
+};
+
 void takeFrontEnd(AppOptions& options, CommandLine& line)
 {
     const std::optional<std::string> name = line.value("ui");
-    if (!name || *name == "text")
+    if (!name)
         return;
-    if (*name == "json")
-        options.frontEnd = FrontEnd::Json;
-    else if (*name == "window" || *name == "terminal")
-        line.fail("--ui " + *name + " is not available yet: use --ui text or --ui json");
-    else
-        line.fail("--ui takes text or json, not \"" + *name + "\"");
+    for (const FrontEndName& known : kFrontEnds)
+        if (*name == known.name)
+            options.frontEnd = known.kind;
+    if (!options.frontEnd)
+        line.fail("--ui takes window, terminal, text or json, not \"" + *name + "\"");
 }
 
 void takeWords(CommandLine& line, std::span<const std::string> scenarios)
@@ -88,6 +100,7 @@ AppOptions parseAppOptions(std::span<const std::string> arguments,
             return options;
         takeWords(line, scenarios);
         takeFrontEnd(options, line);
+        options.isFullScreen = line.has("fullscreen");
         takeDemo(options, line, scenarios);
         options.ports = line.value("ports").value_or("");
         if (line.has("ports") && options.ports.empty())
@@ -104,6 +117,13 @@ AppOptions parseAppOptions(std::span<const std::string> arguments,
     return options;
 }
 
+FrontEndKind defaultFrontEnd(bool hasDisplay, bool hasTerminal)
+{
+    if (hasDisplay)
+        return FrontEndKind::Window;
+    return hasTerminal ? FrontEndKind::Terminal : FrontEndKind::Text;
+}
+
 std::string appHelp(std::span<const std::string> scenarios)
 {
     return "Usage: orvane [OPTION...]\n"
@@ -114,7 +134,12 @@ std::string appHelp(std::span<const std::string> scenarios)
            joined(scenarios) +
            "\n"
            "                            (default lte)\n"
-           "  --ui text|json            how to show it (default text)\n"
+           "  --ui window|terminal|text|json\n"
+           "                            how to show it (default: a window where there is a "
+           "display,\n"
+           "                            else the terminal where standard output is one, else "
+           "text)\n"
+           "  --fullscreen              let the window fill the screen\n"
            "  --ports DIR               where the telephony server's ports are (default\n"
            "                            $ORVANE_PORTS, $XDG_RUNTIME_DIR/telephony or\n"
            "                            /tmp/telephony-UID)\n"
@@ -124,9 +149,9 @@ std::string appHelp(std::span<const std::string> scenarios)
            "  --help                    show this\n"
            "  --version                 show the version\n"
            "\n"
-           "Lines on standard input are commands: \"save DESCRIPTION\" saves a snapshot where "
-           "saving\n"
-           "is offered, \"quit\" ends the program.\n"
+           "With text and json, lines on standard input are commands: \"save DESCRIPTION\" saves "
+           "a\n"
+           "snapshot where saving is offered, \"quit\" ends the program.\n"
            "\n"
            "Exit status: 0 after a normal end, 2 for unusable arguments, 1 for any other "
            "failure.\n";

@@ -11,14 +11,15 @@
 namespace orvane
 {
 
-enum class FrontEnd { Text, Json };
+enum class FrontEndKind { Window, Terminal, Text, Json };
 
 // What the command line asks `orvane` for.
 struct AppOptions {
     bool wantsHelp = false;
     bool wantsVersion = false;
-    std::optional<std::string> demo; // the scenario of a simulated phone
-    FrontEnd frontEnd = FrontEnd::Text;
+    std::optional<std::string> demo;      // the scenario of a simulated phone
+    std::optional<FrontEndKind> frontEnd; // nothing where not given
+    bool isFullScreen = false;
     std::string ports;               // empty where not given
     std::optional<std::string> root; // nothing where not given
     std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
@@ -31,6 +32,9 @@ struct AppOptions {
 // `arguments` are those after the program's name; `scenarios` the simulated phones that there are.
 AppOptions parseAppOptions(std::span<const std::string> arguments,
                            std::span<const std::string> scenarios);
+
+// The front end where none is asked for.
+FrontEndKind defaultFrontEnd(bool hasDisplay, bool hasTerminal);
 
 // The text of --help.
 std::string appHelp(std::span<const std::string> scenarios);

@@ -1,29 +1,26 @@
 #include "app/AppOptions.h"
-#include "app/CommandInterpreter.h"
 #include "app/OrvaneApp.h"
+#include "app/program/Display.h"
+#include "app/program/FrontEnd.h"
+#include "app/program/SimulatedPhone.h"
+#include "app/program/TerminalFrontEnd.h"
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
-#include "platform/OutputDescriptor.h"
 #include "platform/Services.h"
 #include "platform/Uuid.h"
-#include "platform/qt/EventThread.h"
-#include "platform/qt/LineReader.h"
 #include "platform/qt/PortsDirectory.h"
 #include "platform/qt/QtEventLoop.h"
 #include "platform/qt/QtFrameTransport.h"
 #include "platform/qt/QtMainQueue.h"
+#include "platform/qt/QtPreferencesStore.h"
 #include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
 #include "platform/qt/StandardDescriptors.h"
-#include "telephonyd/LogServer.h"
+#include "platform/terminal/TerminalKind.h"
 #include "telephonyd/phone/Scenarios.h"
-#include "ui/output/JsonPane.h"
-#include "ui/output/TextPane.h"
 
 #include <cstdio>
-#include <cstdlib>
 #include <exception>
-#include <filesystem>
 #include <stdexcept>
 #include <unistd.h>
 
@@ -35,118 +32,54 @@ namespace
 constexpr int kFailure = 1;
 constexpr int kUnusableArguments = 2;
 
-void complain(const std::string& text) { std::fprintf(stderr, "orvane: %s\n", text.c_str()); }
-
-// The simulated phone's telephony server, on a thread of its own.
-class SimulatedPhone
+std::unique_ptr<FrontEnd> makeFrontEnd(FrontEndKind kind, const AppOptions& options,
+                                       QtEventLoop& loop)
 {
-public:
-    SimulatedPhone(std::string portsDirectory, std::string scenario)
-        : _thread([directory = std::move(portsDirectory),
-                   name = std::move(scenario)](MainQueue& queue) -> std::shared_ptr<void> {
-              auto parts = std::make_shared<Parts>(directory, queue, name);
-              if (const auto error = parts->server.start())
-                  throw std::runtime_error(*error);
-              return parts;
-          })
-    {
+    switch (kind) {
+    case FrontEndKind::Terminal:
+        return makeTerminalFrontEnd(options, loop);
+    case FrontEndKind::Window:
+        throw std::runtime_error("this front end is not built in: use --ui text or --ui json");
+    case FrontEndKind::Text:
+    case FrontEndKind::Json:
+        break;
     }
-
-private:
-    struct Parts {
-        Parts(const std::string& directory, MainQueue& queue, const std::string& scenario)
-            : transport(directory), server(transport, queue, phoneSourceFactory(scenario, queue))
-        {
-        }
-        QtFrameTransport transport;
-        LogServer server;
-    };
-
-    EventThread _thread;
-};
-
-// Where a simulated phone's files are: kept from one run to the next, with the install marker and
-// the log folder in it, so that saving works.
-std::string demoRoot()
-{
-    const char* state = std::getenv("XDG_STATE_HOME");
-    const char* home = std::getenv("HOME");
-    std::filesystem::path root;
-    if (state && state[0] == '/')
-        root = state;
-    else if (home && *home)
-        root = std::filesystem::path(home) / ".local/state";
-    else
-        throw std::runtime_error("there is no home directory for the simulated phone's files: set "
-                                 "HOME or XDG_STATE_HOME, or give --root DIR");
-    root /= "orvane/demo";
-    const FileSystem files(root.string());
-    std::error_code error;
-    for (const char* folder : {kInstallMarker, kLogFolder})
-        if (!std::filesystem::create_directories(files.located(folder), error) && error)
-            throw std::runtime_error("the simulated phone's files cannot be kept in " +
-                                     root.string() + " (" + error.message() +
-                                     "): set XDG_STATE_HOME, or give --root DIR");
-    return root.string();
-}
-
-std::unique_ptr<OutputPane> makePane(const AppOptions& options, OutputPane::Write write)
-{
-    const bool isSimulated = options.demo.has_value();
-    if (options.frontEnd == FrontEnd::Json)
-        return std::make_unique<JsonPane>(std::move(write), isSimulated);
-    return std::make_unique<TextPane>(std::move(write), isSimulated);
-}
-
-int exitStatus(const OutputDescriptor& output)
-{
-    if (output.state() != OutputDescriptor::State::Failed)
-        return 0;
-    complain(std::string("standard output cannot be written: ") + output.failure() +
-             "; send it somewhere else");
-    return kFailure;
+    return makeOutputFrontEnd(kind, options, loop);
 }
 
 // Shows the live view until it is ended.
-int watch(const AppOptions& options, QtEventLoop& loop, const std::string& portsDirectory,
-          const std::string& root)
+int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
+          const std::string& portsDirectory, const std::string& root)
 {
     QtMainQueue queue;
     QtFrameTransport transport(portsDirectory);
     FramePorts ports(transport, queue);
     FrameTelephonyServer server(transport, ports, queue);
     const FileSystem files(root);
+    QtPreferencesStore preferences;
 
-    OutputDescriptor output(STDOUT_FILENO);
-    const auto pane = makePane(options, [&output, &loop](std::string_view text) {
-        const auto state = output.write(text);
-        // Interrupted: the signal's own callback ends the loop.
-        if (state == OutputDescriptor::State::Closed || state == OutputDescriptor::State::Failed)
-            loop.quit();
-    });
-    SinglePaneStack panes(*pane);
-    OrvaneApp app({queue, ports, server, options.refreshInterval, makeUuid}, files, panes);
-
-    CommandInterpreter commands(app, *pane, [&loop] { loop.quit(); });
-    const LineReader lines(STDIN_FILENO, [&commands](std::string_view line, bool wasCut) {
-        commands.takeLine(line, wasCut);
-    });
+    const std::unique_ptr<FrontEnd> frontEnd = makeFrontEnd(kind, options, loop);
+    OrvaneApp app({queue, ports, server, options.refreshInterval, makeUuid}, files, preferences,
+                  frontEnd->rootPaneMaker());
     const SignalWatcher signals([&loop](int) { loop.quit(); });
 
+    frontEnd->begin(app);
     app.applicationDidFinishLaunching();
     loop.run();
     app.applicationWillTerminate();
-    return exitStatus(output);
+    return frontEnd->exitStatus();
 }
 
 int run(const AppOptions& options)
 {
+    const FrontEndKind kind = options.frontEnd.value_or(
+        defaultFrontEnd(hasDisplay(), !terminalProblem()));
     QtEventLoop loop;
     if (options.demo) {
         const PrivatePortsDirectory directory;
-        const std::string root = options.root ? *options.root : demoRoot();
+        const std::string root = options.root ? *options.root : simulatedPhoneRoot();
         const SimulatedPhone phone(directory.path(), *options.demo);
-        return watch(options, loop, directory.path(), root);
+        return watch(options, kind, loop, directory.path(), root);
     }
     std::string error;
     const auto directory = PortsDirectory::open(options.ports, error);
@@ -154,10 +87,15 @@ int run(const AppOptions& options)
         complain(error);
         return kFailure;
     }
-    return watch(options, loop, directory->path(), options.root.value_or("/"));
+    return watch(options, kind, loop, directory->path(), options.root.value_or("/"));
 }
 
 } // namespace
+
+void orvane::complain(const std::string& text)
+{
+    std::fprintf(stderr, "orvane: %s\n", text.c_str());
+}
 
 int main(int argc, char** argv)
 {

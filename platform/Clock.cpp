@@ -16,6 +16,8 @@ constexpr std::int64_t kSecondsADay = 86400;
 // Far beyond any year that can be shown, and safe to compute with.
 constexpr double kFarthestSecond = 1e15;
 
+} // namespace
+
 std::int64_t wholeSeconds(double seconds)
 {
     if (std::isnan(seconds))
@@ -26,8 +28,6 @@ std::int64_t wholeSeconds(double seconds)
         seconds = -kFarthestSecond;
     return static_cast<std::int64_t>(std::floor(seconds));
 }
-
-} // namespace
 
 double RealClock::secondsSince1970() const
 {
@@ -91,17 +91,6 @@ std::string absoluteDateText(double seconds)
     const CalendarTime time = calendarTime(wholeSeconds(seconds));
     char text[64];
     std::snprintf(text, sizeof text, "%04lld-%02d-%02d %02d:%02d:%02d +0000",
-                  static_cast<long long>(time.year), time.month, time.day, time.hour, time.minute,
-                  time.second);
-    return text;
-}
-
-std::string updatedText(const Clock& clock)
-{
-    const double now = clock.secondsSince1970();
-    const CalendarTime time = calendarTime(wholeSeconds(now), clock.timeZoneAt(now).secondsFromGmt);
-    char text[64];
-    std::snprintf(text, sizeof text, "Updated %04lld-%02d-%02d at %02d:%02d:%02d",
                   static_cast<long long>(time.year), time.month, time.day, time.hour, time.minute,
                   time.second);
     return text;

@@ -47,7 +47,7 @@ std::int64_t secondsSince1970(const CalendarTime& time);
 
 // "2026-11-21 10:00:00 +0000", always in UTC, fraction dropped.
 std::string absoluteDateText(double secondsSince1970);
-// "Updated 2026-11-21 at 10:00:00" in the clock's local zone.
-std::string updatedText(const Clock& clock);
+// The fraction dropped downwards; what is beyond any calendar is cut to its ends.
+std::int64_t wholeSeconds(double seconds);
 
 } // namespace orvane

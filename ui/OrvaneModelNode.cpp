@@ -77,8 +77,8 @@ NodePointer makeNode(std::string_view name, const PropertyValue& value, PathDict
                                                      childrenOf(*array, paths, path));
     else
         node = std::make_shared<OrvaneModelLeafNode>(std::string(name), kUnknownValue);
-    // Of siblings with one name, the later one is found under their path; both stay in the tree. This
-    // is meant.
+    // Of siblings with one name, the later one is found under their path; both stay in the tree.
+    // This is meant.
     paths[path] = node;
     return node;
 }

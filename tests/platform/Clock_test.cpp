@@ -113,20 +113,6 @@ TEST(ClockTest, AbsoluteTextOfAnySecondHasItsForm)
     EXPECT_TRUE(absoluteDateText(infinity).ends_with(" +0000"));
 }
 
-TEST(ClockTest, UpdatedTextIsInTheLocalZone)
-{
-    TestClock clock;
-    EXPECT_EQ(updatedText(clock), "Updated 2026-11-21 at 10:00:00");
-    clock.now += 0.9;
-    EXPECT_EQ(updatedText(clock), "Updated 2026-11-21 at 10:00:00");
-    clock.zone.secondsFromGmt = 5 * 3600 + 45 * 60;
-    EXPECT_EQ(updatedText(clock), "Updated 2026-11-21 at 15:45:00");
-    clock.zone.secondsFromGmt = 14 * 3600;
-    EXPECT_EQ(updatedText(clock), "Updated 2026-11-22 at 00:00:00");
-    clock.zone.secondsFromGmt = -11 * 3600;
-    EXPECT_EQ(updatedText(clock), "Updated 2026-11-20 at 23:00:00");
-}
-
 // The process's time zone, put back in the end.
 class ZoneSetting
 {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "ui/Pane.h"
+#include "ui/OrvaneModelNode.h"
 #include "ui/SnapshotFile.h"
 
 #include <functional>
@@ -11,21 +11,23 @@
 namespace orvane
 {
 
-// The root pane of a front end that prints: one output for every change of the status and for every
+// What a front end that prints shows: one output for every change of the status and for every
 // reload, a reload and the status that comes with it being one. Answers to commands are printed in
 // between. JSON and text differ in the forms only.
-class OutputPane : public Pane
+class OutputPane
 {
 public:
     // Takes one finished output, newline included.
     using Write = std::function<void(std::string_view output)>;
 
     explicit OutputPane(Write write) : _write(std::move(write)) {}
+    virtual ~OutputPane() = default;
+    OutputPane(const OutputPane&) = default;
+    OutputPane& operator=(const OutputPane&) = delete;
 
-    [[nodiscard]] std::string path() const override { return "/"; }
-    void reloadWithNode(NodePointer node) override;
-    void setStatus(std::optional<std::string> status, bool isLoading) override;
-    [[nodiscard]] bool isLoading() const override { return _isLoading; }
+    // Another tree, or none: printed with the status that comes next.
+    void reloadWithNode(NodePointer node);
+    void setStatus(std::optional<std::string> status, bool isLoading);
 
     void showSaved(const SnapshotResult& result);
     void showError(const std::string& text);

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "platform/qt/EventThread.h"
+
+#include <string>
+
+namespace orvane
+{
+
+// The simulated phone's telephony server, on a thread of its own: it meets the viewer at the ports
+// only. Ends with the object.
+class SimulatedPhone
+{
+public:
+    // Throws std::runtime_error with a line for the user where the server cannot start.
+    SimulatedPhone(const std::string& portsDirectory, const std::string& scenario);
+
+private:
+    EventThread _thread;
+};
+
+// Where a simulated phone's files are: kept from one run to the next, with the install marker and
+// the log folder in it, so that saving works. Throws std::runtime_error with a line for the user.
+std::string simulatedPhoneRoot();
+
+} // namespace orvane

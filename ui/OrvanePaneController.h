@@ -1,0 +1,55 @@
+#pragma once
+
+#include "platform/toolkit/TableViewController.h"
+#include "ui/OrvaneModelNode.h"
+#include "ui/Shell.h"
+
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+// Shows one node of the display tree as a table, a row a child: groups lead to a further pane,
+// values show key and value. Its toolbar has the status with a busy indicator and, where saving is
+// offered, a Save button.
+class OrvanePaneController : public TableViewController
+{
+public:
+    // Busy, with an empty status. The node may be null. The shell must outlive the pane.
+    OrvanePaneController(NodePointer node, std::string path, Shell& shell);
+
+    // The path of the node in the display tree; "/" for the root.
+    [[nodiscard]] const std::string& path() const { return _keyPath; }
+    // Shows another node; null for none.
+    virtual void reloadWithNode(NodePointer node);
+    // No status is an empty one.
+    virtual void setStatus(std::optional<std::string> text, bool isBusy);
+    [[nodiscard]] const std::string& statusText() const { return status; }
+    [[nodiscard]] bool isBusy() const { return isLoading; }
+
+    // Builds the toolbar anew.
+    void createToolbarItems();
+
+    void viewWillAppear(bool animated) override;
+    void viewWillDisappear(bool animated) override;
+
+    std::size_t numberOfRowsInSection(TableView& table, std::size_t section) override;
+    std::shared_ptr<TableViewCell> cellForRowAtIndexPath(TableView& table,
+                                                         const IndexPath& indexPath) override;
+    void didSelectRowAtIndexPath(TableView& table,
+                                 const std::optional<IndexPath>& indexPath) override;
+
+private:
+    [[nodiscard]] const OrvaneModelNode* nodeAt(const IndexPath& indexPath) const;
+    [[nodiscard]] NodePointer sharedNodeAt(const IndexPath& indexPath) const;
+    void showTitle();
+
+    NodePointer _nodes;
+    std::string _keyPath;
+    std::string status;
+    bool isLoading = true;
+    Shell& _shell;
+};
+
+} // namespace orvane

@@ -1,0 +1,24 @@
+#pragma once
+
+#include "platform/FileSystem.h"
+#include "platform/MainQueue.h"
+
+namespace orvane
+{
+
+// What panes and the save screen ask of the application that they are part of.
+class Shell
+{
+public:
+    virtual ~Shell() = default;
+    // Whether saving is offered.
+    [[nodiscard]] virtual bool allowSaveButton() const = 0;
+    // Opens the save screen, closes it. Nothing where it is, or is not, open.
+    virtual void showSaveView() = 0;
+    virtual void closeSaveView() = 0;
+
+    [[nodiscard]] virtual MainQueue& mainQueue() = 0;
+    [[nodiscard]] virtual const FileSystem& files() const = 0;
+};
+
+} // namespace orvane
