@@ -12,7 +12,7 @@ namespace
 {
 
 constexpr int kWidestAlert = 56;
-constexpr int kKeyColumns = 22;
+constexpr int kKeyColumns = 18;
 
 struct HelpLine {
     const char* keys;
@@ -20,28 +20,29 @@ struct HelpLine {
 };
 
 constexpr HelpLine kHelp[] = {
-    {"Up Down  k j",       "row above, row below"          },
-    {"Page Up, Page Down", "a screen up, a screen down"    },
-    {"Home, End",          "first row, last row"           },
-    {"Enter  Right  l",    "open the row"                  },
-    {"Left  h  Backspace", "back"                          },
-    {"Escape",             "show all rows, then back"      },
-    {"Right, Left",        "scroll a long value"           },
-    {"/",                  "filter the rows as you type"   },
-    {"s",                  "save, where that is offered"   },
-    {"?",                  "this list"                     },
-    {"q",                  "quit"                          },
-    {"Mouse",              "a click opens, the wheel moves"},
+    {"Up Down k j",      "a row up, down"      },
+    {"PgUp PgDn",        "a screen up, down"   },
+    {"Home End",         "first row, last row" },
+    {"Enter Right l",    "open the row"        },
+    {"Left h Backspace", "back"                },
+    {"Escape",           "all rows, then back" },
+    {"Right Left",       "scroll a long value" },
+    {"/",                "filter as you type"  },
+    {"s",                "save a snapshot"     },
+    {"?",                "these keys"          },
+    {"q",                "quit"                },
+    {"Ctrl-L",           "draw the screen anew"},
+    {"Mouse",            "click and wheel"     },
 };
 
 constexpr HelpLine kPlaybackHelp[] = {
-    {"Space", "play, pause"                    },
-    {". ,",   "a refresh period on, back"      },
-    {"+ -",   "faster, slower"                 },
-    {"g",     "go to a time"                   },
-    {"n",     "to the next serving cell"       },
-    {"0 G",   "to the start, to the end"       },
-    {"x",     "stop reading, keep what is read"},
+    {"Space", "play, pause"          },
+    {". ,",   "a step on, back"      },
+    {"+ -",   "faster, slower"       },
+    {"g",     "go to a time"         },
+    {"n",     "next serving cell"    },
+    {"0 G",   "start, end"           },
+    {"x",     "stop reading the file"},
 };
 
 } // namespace

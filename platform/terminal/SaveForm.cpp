@@ -56,8 +56,10 @@ void SaveForm::draw(Canvas& canvas, Lines area)
         ++line;
         canvas.grid.put(line++, 1, "What will be saved:", {Ink::Quiet, false});
     }
-    const int buttons = area.end() - (isRoomy ? 2 : 1);
-    drawContents(canvas, {line, std::max(buttons - line - (isRoomy ? 1 : 0), 0)});
+    const int gap = isRoomy ? 1 : 0;
+    const int room = std::max(area.end() - line - 1 - 2 * gap, 0);
+    drawContents(canvas, {line, room});
+    const int buttons = line + std::min(static_cast<int>(_rows.count()), room) + gap;
     drawButton(canvas, buttons, 1, *_save, Focus::Save);
     drawButton(canvas, buttons, 12, *_cancel, Focus::Cancel);
 }
@@ -101,7 +103,7 @@ std::vector<Hint> SaveForm::hints(const Marks&) const
 {
     std::vector<Hint> hints;
     if (isTyping())
-        hints.push_back({"Enter", "done typing", keyOfKind(Key::Kind::Enter)});
+        hints.push_back({"Enter", "done", keyOfKind(Key::Kind::Enter)});
     else
         hints.push_back(
             {"Enter", _focus == Focus::Save ? "save" : "cancel", keyOfKind(Key::Kind::Enter)});

@@ -124,6 +124,8 @@ void StackPage::drawRows(Canvas& canvas, Lines area)
 
 void StackPage::drawStatus(Canvas& canvas, int line)
 {
+    const Style bar{Ink::BarQuiet, false};
+    canvas.grid.fill(line, canvas.grid.wholeLine(), bar);
     const TableRows* shown = rows();
     const int start = top() ? drawToolbar(canvas, line, *top()) : 1;
     if (!shown || shown->total() == 0)
@@ -134,7 +136,7 @@ void StackPage::drawStatus(Canvas& canvas, int line)
         place = "\"" + shown->filter() + "\" " + place + " of " + std::to_string(shown->total());
     const int column = canvas.columns() - 1 - columnsOf(place);
     if (column > start)
-        canvas.grid.put(line, column, place, {Ink::Quiet, false});
+        canvas.grid.put(line, column, place, bar);
 }
 
 bool StackPage::drawPrompt(Canvas& canvas, int line)

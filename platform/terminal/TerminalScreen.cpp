@@ -22,6 +22,8 @@ constexpr auto kIndicatorInterval = 150ms;
 // Longer than between two refreshes, as a rule.
 constexpr auto kMarkTime = 5s;
 constexpr const char* kSimulated = "simulated phone";
+constexpr const char* kShortSimulated = "simulated"; // leaves more room for the path
+constexpr int kNarrow = 60;
 constexpr char32_t kRedraw = 'L' & 0x1F; // Ctrl-L
 
 NavigationController* navigationOf(const Screen& screen)
@@ -119,7 +121,8 @@ void TerminalScreen::drawPages()
                                              [this] { dismissAlert(); });
         _alert->draw(_canvas, area);
     }
-    drawTitle(_canvas, 0, crumbs, _settings.isSimulated ? kSimulated : "");
+    const char* mark = _canvas.columns() < kNarrow ? kShortSimulated : kSimulated;
+    drawTitle(_canvas, 0, crumbs, _settings.isSimulated ? mark : "");
     const int foot = _device.lines() - 1;
     if (foot < 1 || front().drawPrompt(_canvas, foot))
         return;

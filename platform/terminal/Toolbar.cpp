@@ -21,12 +21,12 @@ int drawToolbar(Canvas& canvas, int line, const ViewController& controller)
             if (!indicator->isAnimating())
                 continue;
             const std::size_t turn = static_cast<std::size_t>(canvas.turn) % turns.size();
-            column = canvas.grid.put(line, column, turns[turn] + " ", {Ink::StatusKey, false});
+            column = canvas.grid.put(line, column, turns[turn] + " ", {Ink::Bar, false});
         } else if (const auto* label = dynamic_cast<const Label*>(view)) {
             column = canvas.grid.put(
                 line, column,
                 shortened(label->text(), canvas.columns() - column - 1, canvas.marks.cut) + " ",
-                {Ink::Status, false});
+                {Ink::BarQuiet, false});
         }
     }
     return column;
