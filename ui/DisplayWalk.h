@@ -1,0 +1,66 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <algorithm>
+#include <charconv>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace orvane
+{
+
+// How a display value reads as groups and rows, for whatever walks over one. Holding the array lock
+// is the caller's business.
+
+// A dictionary or an array; anything else is a row.
+inline bool isDisplayGroup(const PropertyValue& value)
+{
+    return value.asDictionary() || value.asArray();
+}
+
+// The text that a row shows: "(unknown)" for what is no text.
+const std::string& displayText(const PropertyValue& row);
+
+// Under a key "_sorted" the keys are shown in the order of their characters, not of numbers: "10;Y"
+// before "2;X".
+inline constexpr const char* kSortedKey = "_sorted";
+// What such a key is shown as: "01;Serving Cell" as "Serving Cell"; one of any other number of
+// parts is kept whole.
+std::string_view nameOfSortedKey(std::string_view key);
+
+// Calls visit(std::string_view name, const PropertyValue& child) for each child of a group, in the
+// order in which they are shown. A row has none. The group must not change meanwhile.
+template <typename Visit>
+void forEachDisplayChild(const PropertyValue& group, const Visit& visit)
+{
+    if (const PropertyArray* array = group.asArray()) {
+        char name[20];
+        for (std::size_t i = 0; i < array->size(); ++i) {
+            const char* end = std::to_chars(name, name + sizeof name, i).ptr;
+            visit(std::string_view(name, end), (*array)[i]);
+        }
+        return;
+    }
+    const PropertyDictionary* dictionary = group.asDictionary();
+    if (!dictionary)
+        return;
+    if (!dictionary->contains(kSortedKey)) {
+        for (const auto& [key, child] : *dictionary)
+            visit(std::string_view(key), child);
+        return;
+    }
+    using Entry = const std::pair<std::string, PropertyValue>*;
+    std::vector<Entry> entries;
+    for (const auto& entry : *dictionary)
+        if (entry.first != kSortedKey)
+            entries.push_back(&entry);
+    std::sort(entries.begin(), entries.end(),
+              [](Entry left, Entry right) { return left->first < right->first; });
+    for (const Entry entry : entries)
+        visit(nameOfSortedKey(entry->first), entry->second);
+}
+
+} // namespace orvane
