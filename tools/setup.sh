@@ -4,7 +4,8 @@
 
 # What building needs, and what ./check needs on top. Add here what a CMakeLists.txt looks for.
 # shellcheck disable=SC2034
-build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev)
+build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev qt6-tools-dev
+    libqt6opengl6-dev)
 # shellcheck disable=SC2034
 check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev)
 
@@ -30,6 +31,8 @@ purpose_of() {
     libexpat1-dev) echo "Expat with its headers" ;;
     libncurses-dev) echo "ncurses with its headers, wide characters included" ;;
     qt6-base-dev) echo "Qt 6.4 or newer with its headers" ;;
+    qt6-tools-dev) echo "Qt UI Tools, which read interface files" ;;
+    libqt6opengl6-dev) echo "Qt OpenGL's CMake package, which that of Qt UI Tools asks for" ;;
     clang) echo "clang 14 or newer" ;;
     libclang-rt-dev) echo "clang's sanitizers and libFuzzer" ;;
     llvm) echo "llvm-symbolizer, for readable sanitizer reports" ;;

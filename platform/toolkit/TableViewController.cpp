@@ -2,6 +2,8 @@
 
 #include "platform/toolkit/Screen.h"
 
+#include <utility>
+
 namespace orvane
 {
 
@@ -23,6 +25,13 @@ TableView& TableViewController::tableView()
         _table->setDelegate(this);
     }
     return *_table;
+}
+
+void TableViewController::viewWillAppear(bool animated)
+{
+    ViewController::viewWillAppear(animated);
+    if (!std::exchange(_hasAppeared, true))
+        tableView().reloadData();
 }
 
 std::shared_ptr<View> TableViewController::loadView()

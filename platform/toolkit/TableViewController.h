@@ -16,11 +16,15 @@ public:
 
     [[nodiscard]] TableView& tableView();
 
+    // The first time, fills the table.
+    void viewWillAppear(bool animated) override;
+
 protected:
     [[nodiscard]] std::shared_ptr<View> loadView() override;
 
 private:
     std::shared_ptr<TableView> _table;
+    bool _hasAppeared = false;
 };
 
 } // namespace orvane

@@ -21,6 +21,8 @@ END
     put app/Shell.h <<<$'#pragma once\n#include "ui/panes/Pane.h"\n#include "platform/Value.h"'
     put app/main.cpp <<<'#include "platform/qt/Loop.h"'
     put platform/qt/Loop.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <QObject>'
+    put platform/window/Row.h <<<$'#pragma once\n#include <QWidget>'
+    put tests/window/Row_test.cpp <<<'#include <QTest>'
     put tests/support/Helper.cpp <<<'#include "support/Helper.h"'
     put tests/support/Helper.h <<<'#pragma once'
     put fuzz/Target.h <<<'#pragma once'
@@ -52,9 +54,9 @@ expect_complaint app/Other.h "$once#include \"../ui/panes/Pane.h\"" app/Other.h:
 expect_complaint app/Other.h "$once#include \"./Shell.h\"" app/Other.h:2 "an include starts at the root"
 expect_complaint app/Other.h "$once#include \"ui/../ui/panes/Pane.h\"" app/Other.h:2 "an include starts at the root"
 expect_complaint app/Other.cpp '#include "Shell.h"' app/Other.cpp:1 "no such header"
-expect_complaint app/Other.cpp '#include <QTimer>' app/Other.cpp:1 "Qt is for platform/qt/ alone"
-expect_complaint app/main.cpp '#include <QCoreApplication>' app/main.cpp:1 "Qt is for platform/qt/ alone"
-expect_complaint tests/app/Other_test.cpp '#  include <QtCore/QTimer>' tests/app/Other_test.cpp:1 "Qt is for platform/qt/ alone"
+expect_complaint app/Other.cpp '#include <QTimer>' app/Other.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
+expect_complaint app/main.cpp '#include <QCoreApplication>' app/main.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
+expect_complaint tests/app/Other_test.cpp '#  include <QtCore/QTimer>' tests/app/Other_test.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
 expect_complaint ui/Other.cpp '#include <ncurses.h>' ui/Other.cpp:1 "ncurses is for platform/terminal/ alone"
 expect_complaint ui/Other.cpp '#include <ncursesw/curses.h>' ui/Other.cpp:1 "ncurses is for platform/terminal/ alone"
 expect_complaint platform/Other.cpp '#include <expat.h>' platform/Other.cpp:1 "Expat is for"

@@ -1,0 +1,71 @@
+#include "platform/window/AlertWidget.h"
+
+#include "platform/toolkit/AlertView.h"
+#include "platform/window/FlatButton.h"
+#include "platform/window/Fonts.h"
+
+#include <QLabel>
+#include <QVBoxLayout>
+
+#include <algorithm>
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+QLabel* makeLabel(QWidget* parent, const Font& font)
+{
+    auto* label = new QLabel(parent);
+    label->setTextFormat(Qt::PlainText);
+    label->setFont(fontFor(font));
+    label->setAlignment(Qt::AlignHCenter);
+    label->setWordWrap(true);
+    return label;
+}
+
+} // namespace
+
+AlertWidget::AlertWidget(QWidget* parent, std::function<void()> dismiss)
+    : Overlay(parent), _title(makeLabel(&card(), Font::boldSystem(17))),
+      _message(makeLabel(&card(), Font::system(15))), _button(new FlatButton(&card()))
+{
+    auto* column = new QVBoxLayout(&card());
+    column->setContentsMargins(20, 20, 20, 8);
+    column->setSpacing(8);
+    column->addWidget(_title);
+    column->addWidget(_message);
+    column->addWidget(_button);
+    _button->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+    connect(_button, &QAbstractButton::clicked, this,
+            [dismiss = std::move(dismiss)] { dismiss(); });
+}
+
+void AlertWidget::sync(const AlertView* alert)
+{
+    if (!alert)
+        return hide();
+    _title->setText(QString::fromStdString(alert->title()));
+    _message->setText(QString::fromStdString(alert->message()));
+    _button->setText(QString::fromStdString(alert->buttonTitle()));
+    card().setAccessibleName(_title->text());
+    card().setAccessibleDescription(_message->text());
+    if (isVisible())
+        return placeCard();
+    show();
+    raise();
+    _button->setFocus(Qt::OtherFocusReason);
+}
+
+QRect AlertWidget::cardPlace(const QSize& size) const
+{
+    constexpr int kWidest = 320;
+    constexpr int kMargin = 24;
+    const int width = std::min(kWidest, size.width() - 2 * kMargin);
+    const int height = card().layout()->heightForWidth(width);
+    return {(size.width() - width) / 2, (size.height() - height) / 2, width, height};
+}
+
+} // namespace orvane

@@ -1,0 +1,38 @@
+#pragma once
+
+#include "platform/window/Drawing.h"
+
+#include <QAbstractButton>
+
+#include <optional>
+
+namespace orvane
+{
+
+// A button without a frame: a sign, a text, or a sign and then a text. At least 44 points high and
+// wide. Its text is what a screen reader speaks unless it has another name.
+class FlatButton final : public QAbstractButton
+{
+public:
+    static constexpr int kSize = 44;
+
+    explicit FlatButton(QWidget* parent);
+
+    [[nodiscard]] std::optional<Sign> sign() const { return _sign; }
+    void setSign(Sign sign);
+    // For a button of a sign alone: what it does, for screen readers and as a tooltip.
+    void setName(const QString& name);
+
+    [[nodiscard]] QSize sizeHint() const override;
+    [[nodiscard]] QSize minimumSizeHint() const override { return {kSize, kSize}; }
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void focusInEvent(QFocusEvent* event) override;
+
+private:
+    std::optional<Sign> _sign;
+    bool _hasRing = false;
+};
+
+} // namespace orvane
