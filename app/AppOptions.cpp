@@ -22,6 +22,8 @@ constexpr CommandLineOption kOptions[] = {
     {"root",          Value::Required},
     {"refresh",       Value::Required},
     {"fullscreen",    Value::None    },
+    {"record",        Value::Required},
+    {"force",         Value::None    },
     {kLogOption,      Value::Required},
     {kLogLevelOption, Value::Required},
 };
@@ -86,6 +88,16 @@ void takeDemo(AppOptions& options, CommandLine& line, std::span<const std::strin
         line.fail("--ports cannot be used with --demo, which has a private directory of its own");
 }
 
+void takeRecord(AppOptions& options, CommandLine& line)
+{
+    options.record = line.value("record");
+    options.overwritesRecord = line.has("force");
+    if (options.record && options.record->empty())
+        line.fail("--record needs the name of a file");
+    if (options.overwritesRecord && !options.record)
+        line.fail("--force is for --record FILE, which is not given");
+}
+
 } // namespace
 
 AppOptions parseAppOptions(std::span<const std::string> arguments,
@@ -102,6 +114,7 @@ AppOptions parseAppOptions(std::span<const std::string> arguments,
         takeFrontEnd(options, line);
         options.isFullScreen = line.has("fullscreen");
         takeDemo(options, line, scenarios);
+        takeRecord(options, line);
         options.ports = line.value("ports").value_or("");
         if (line.has("ports") && options.ports.empty())
             line.fail("--ports needs the name of a directory");
@@ -144,7 +157,10 @@ std::string appHelp(std::span<const std::string> scenarios)
            "                            $ORVANE_PORTS, $XDG_RUNTIME_DIR/telephony or\n"
            "                            /tmp/telephony-UID)\n"
            "  --root DIR                take the log folder and the install marker below DIR\n"
-           "  --refresh SECONDS         the refresh period (default 2.0)\n" +
+           "  --refresh SECONDS         the refresh period (default 2.0)\n"
+           "  --record FILE             write every message of the modem to FILE, a diagnostic "
+           "log\n"
+           "  --force                   overwrite FILE where it is there already\n" +
            kLogOptionsHelp +
            "  --help                    show this\n"
            "  --version                 show the version\n"

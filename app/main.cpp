@@ -17,6 +17,7 @@
 #include "platform/qt/SignalWatcher.h"
 #include "platform/qt/StandardDescriptors.h"
 #include "platform/terminal/TerminalKind.h"
+#include "recordings/LogRecorder.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <cstdio>
@@ -47,6 +48,20 @@ std::unique_ptr<FrontEnd> makeFrontEnd(FrontEndKind kind, const AppOptions& opti
     return makeOutputFrontEnd(kind, options, loop);
 }
 
+// Null where nothing is to be recorded.
+std::unique_ptr<LogRecorder> makeRecorder(const AppOptions& options, MainQueue& queue)
+{
+    if (!options.record)
+        return nullptr;
+    using Existing = DiskBlockFile::Existing;
+    const auto existing = options.overwritesRecord ? Existing::Overwritten : Existing::Refused;
+    std::string error;
+    auto recorder = LogRecorder::create(queue, *options.record, existing, error);
+    if (!recorder)
+        throw std::runtime_error(error);
+    return recorder;
+}
+
 // Shows the live view until it is ended.
 int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
           const std::string& portsDirectory, const std::string& root)
@@ -58,9 +73,10 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
     const FileSystem files(root);
     QtPreferencesStore preferences;
 
+    const std::unique_ptr<LogRecorder> recorder = makeRecorder(options, queue);
     const std::unique_ptr<FrontEnd> frontEnd = makeFrontEnd(kind, options, loop);
-    OrvaneApp app({queue, ports, server, options.refreshInterval, makeUuid}, files, preferences,
-                  frontEnd->rootPaneMaker());
+    OrvaneApp app({queue, ports, server, options.refreshInterval, makeUuid, recorder.get()}, files,
+                  preferences, frontEnd->rootPaneMaker());
     const SignalWatcher signals([&loop](int) { loop.quit(); });
 
     frontEnd->begin(app);
@@ -72,8 +88,8 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
 
 int run(const AppOptions& options)
 {
-    const FrontEndKind kind = options.frontEnd.value_or(
-        defaultFrontEnd(hasDisplay(), !terminalProblem()));
+    const FrontEndKind kind =
+        options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
     QtEventLoop loop;
     if (options.demo) {
         const PrivatePortsDirectory directory;
