@@ -105,6 +105,8 @@ int columnsOf(char32_t character)
 {
     if (character >= 0x20 && character < 0x7F)
         return 1;
+    if (character < 0x20)
+        return -1;
     const Utf8Locale utf8;
     return ::wcwidth(static_cast<wchar_t>(character));
 }

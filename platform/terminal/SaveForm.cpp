@@ -78,7 +78,7 @@ void SaveForm::drawDescription(Canvas& canvas, int line)
 
 void SaveForm::drawContents(Canvas& canvas, Lines area)
 {
-    _rows.update(*_contents, canvas.columns(), area.count);
+    _rows.update(*_contents, std::min(canvas.columns(), TableRows::kReadableColumns), area.count);
     for (int i = 0; i < area.count; ++i) {
         const std::size_t place = _rows.top() + static_cast<std::size_t>(i);
         if (place >= _rows.count())

@@ -86,9 +86,21 @@ void StackPage::updateTables(int columns, int lines)
     std::erase_if(_rows, [](const auto& entry) { return entry.first.expired(); });
     if (!_stack)
         return;
-    for (const auto& controller : _stack->viewControllers())
-        if (auto* tables = dynamic_cast<TableViewController*>(controller.get()))
-            _rows[controller].update(tables->tableView(), columns, lines);
+    const auto update = [&] {
+        for (const auto& controller : _stack->viewControllers())
+            if (auto* tables = dynamic_cast<TableViewController*>(controller.get()))
+                _rows[controller].update(tables->tableView(), rowColumns(columns), lines);
+    };
+    const int before = rowColumns(columns);
+    update();
+    if (rowColumns(columns) != before)
+        update();
+}
+
+int StackPage::rowColumns(int columns) const
+{
+    const TableRows* shown = rows();
+    return shown && shown->isWide() ? columns : std::min(columns, TableRows::kReadableColumns);
 }
 
 std::vector<std::string> StackPage::emptyText() const

@@ -36,6 +36,8 @@ public:
     bool drawPrompt(Canvas& canvas, int line) override;
 
     [[nodiscard]] std::vector<Crumb> crumbs() const;
+    // The columns that rows take: not more than is easy to read, unless a value needs them.
+    [[nodiscard]] int rowColumns(int columns) const;
     // Whether a busy indicator turns in what was drawn last.
     [[nodiscard]] bool isBusy() const { return _isBusy; }
     // How often refreshes have changed values that are marked since, until they are forgotten.

@@ -9,44 +9,21 @@
 namespace orvane
 {
 
-namespace
-{
-
-// A value at the far edge of a very wide terminal is hard to tell whose it is.
-constexpr int kReadableColumns = 100;
-
-} // namespace
-
 void TableRows::update(TableView& table, int columns, int lines)
 {
     _lines = std::max(lines, 1);
-    if (table.reloadCount() != _reloadsSeen || !_isRead) {
+    const bool isRefreshed = !_isRead || table.reloadCount() != _reloadsSeen;
+    table.setFrame(rectOfCells(columns, lines)); // reloads, if the width is another one
+    if (isRefreshed || columns != _columns) {
+        _columns = columns;
         const auto before = std::exchange(_values, {});
-        fit(table, columns, lines);
         read(table);
-        if (_isRead)
+        if (isRefreshed && _isRead)
             findChanges(before);
         _isRead = true;
-    } else if (const int wanted = _needsAllColumns ? columns : std::min(columns, kReadableColumns);
-               wanted != _columns) {
-        fit(table, columns, lines);
-        read(table);
+        _reloadsSeen = table.reloadCount();
     }
-    const bool isTooLong = std::any_of(_rows.begin(), _rows.end(),
-                                       [](const RowContent& row) { return row.overhang() > 0; });
-    if (isTooLong && !_needsAllColumns && columns > kReadableColumns) {
-        _needsAllColumns = true;
-        fit(table, columns, lines);
-        read(table);
-    }
-    _reloadsSeen = table.reloadCount();
     showSelection();
-}
-
-void TableRows::fit(TableView& table, int columns, int lines)
-{
-    _columns = _needsAllColumns ? columns : std::min(columns, kReadableColumns);
-    table.setFrame(rectOfCells(_columns, lines));
 }
 
 void TableRows::read(TableView& table)
@@ -67,6 +44,9 @@ void TableRows::read(TableView& table)
     }
     std::erase_if(_sideways, [&](const auto& entry) { return !_values.contains(entry.first); });
     std::erase_if(_changed, [&](const auto& entry) { return !_values.contains(entry.first); });
+    _isWide = _isWide || std::any_of(_rows.begin(), _rows.end(), [](const RowContent& row) {
+                  return row.extent >= kReadableColumns;
+              });
     applyFilter();
 
     const auto found = std::find_if(_matching.begin(), _matching.end(),

@@ -17,10 +17,14 @@ namespace orvane
 class TableRows
 {
 public:
+    // A value at the far edge of a very wide terminal is hard to tell whose it is.
+    static constexpr int kReadableColumns = 100;
+
     // Fits the table to so many columns and lines, and reads it again if it was reloaded.
     void update(TableView& table, int columns, int lines);
-    // Columns that the rows take: not more than a person reads with ease, unless a value needs it.
     [[nodiscard]] int columns() const { return _columns; }
+    // Whether there is, or was, a value that is too long for a width that is easy to read.
+    [[nodiscard]] bool isWide() const { return _isWide; }
     // As of the last update.
     [[nodiscard]] std::size_t total() const { return _rows.size(); }
 
@@ -57,7 +61,6 @@ private:
     // Rows of the same name are told apart by their order.
     using RowName = std::pair<std::string, std::size_t>;
 
-    void fit(TableView& table, int columns, int lines);
     void read(TableView& table);
     void findChanges(const std::map<RowName, std::string>& before);
     void applyFilter();
@@ -74,7 +77,7 @@ private:
     std::size_t _top = 0;
     std::ptrdiff_t _lines = 1;
     int _columns = 0;
-    bool _needsAllColumns = false;
+    bool _isWide = false;
     std::size_t _changeCount = 0;
     std::size_t _reloadsSeen = 0;
     bool _isRead = false;

@@ -44,7 +44,11 @@ TerminalScreen::TerminalScreen(TerminalDevice& device, MainQueue& queue, Setting
 
 TerminalScreen::~TerminalScreen() = default;
 
-Rect TerminalScreen::bounds() const { return rectOfCells(_device.columns(), _device.lines()); }
+// As wide as rows are: new cells are laid out in it.
+Rect TerminalScreen::bounds() const
+{
+    return rectOfCells(_stack.rowColumns(_device.columns()), _device.lines());
+}
 
 Size TerminalScreen::sizeWithFont(std::string_view text, const Font&) const
 {

@@ -1,0 +1,148 @@
+#include "platform/toolkit/Playback.h"
+
+#include "terminal/TerminalScreenTest.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+using ::testing::ElementsAre;
+using ::testing::EndsWith;
+using ::testing::HasSubstr;
+using ::testing::StartsWith;
+
+using Kind = Key::Kind;
+
+// A recording of an hour that notes what is asked of it.
+class NotedPlayback final : public Playback
+{
+public:
+    [[nodiscard]] double progress() const override { return read; }
+    void stopReading() override { calls.emplace_back("stopReading"); }
+    [[nodiscard]] double position() const override { return at; }
+    [[nodiscard]] double duration() const override { return 3600; }
+    [[nodiscard]] std::string positionText() const override { return "2026-11-21 10:00:00 UTC"; }
+    [[nodiscard]] std::string remark() const override { return note; }
+    [[nodiscard]] bool isPlaying() const override { return plays; }
+    [[nodiscard]] double speed() const override { return 10; }
+    void play() override { calls.emplace_back("play"); }
+    void pause() override { calls.emplace_back("pause"); }
+    void faster() override { calls.emplace_back("faster"); }
+    void slower() override { calls.emplace_back("slower"); }
+    void step() override { calls.emplace_back("step"); }
+    void stepBack() override { calls.emplace_back("stepBack"); }
+    void jumpTo(double position) override
+    {
+        calls.push_back("jumpTo " + std::to_string(static_cast<int>(position)));
+    }
+    void jumpToEnd() override { calls.emplace_back("jumpToEnd"); }
+    void jumpToNextServingCell() override { calls.emplace_back("jumpToNextServingCell"); }
+    bool jumpToText(const std::string& text) override
+    {
+        calls.push_back("jumpToText " + text);
+        return text.starts_with('+');
+    }
+
+    std::vector<std::string> calls;
+    double read = 1;
+    double at = 900;
+    bool plays = false;
+    std::string note;
+};
+
+class PlaybackLineTest : public TerminalScreenTest
+{
+protected:
+    PlaybackLineTest()
+    {
+        screen->setPlayback(&playback);
+        refresh(numberedRows(3));
+    }
+    ~PlaybackLineTest() override { screen->setPlayback(nullptr); }
+
+    NotedPlayback playback;
+};
+
+} // namespace
+
+TEST_F(PlaybackLineTest, StateSpeedPositionAndTimeAreShown)
+{
+    EXPECT_THAT(device.text(21), StartsWith(" ‖ paused 10x  ━"));
+    EXPECT_THAT(device.text(21), EndsWith("─  15:00 / 1:00:00  2026-11-21 10:00:00 UTC"));
+    playback.plays = true;
+    screen->setNeedsUpdate();
+    queue.runPending();
+    EXPECT_THAT(device.text(21), StartsWith(" ▶ playing 10x"));
+}
+
+TEST_F(PlaybackLineTest, OnANarrowTerminalTheTimeStays)
+{
+    resize(10, 40);
+    EXPECT_EQ(device.text(7), " ‖ paused 10x   2026-11-21 10:00:00 UTC");
+}
+
+TEST_F(PlaybackLineTest, TheKeysDriveIt)
+{
+    type(" .,+=-0Gn");
+    playback.plays = true;
+    type(" ");
+    EXPECT_THAT(playback.calls,
+                ElementsAre("play", "step", "stepBack", "faster", "faster", "slower", "jumpTo 0",
+                            "jumpToEnd", "jumpToNextServingCell", "pause"));
+}
+
+TEST_F(PlaybackLineTest, ATimeIsTypedAndJumpedTo)
+{
+    type("g10:0q");
+    EXPECT_THAT(device.text(23), StartsWith(" Go to time: 10:0q"));
+    press(Kind::Enter);
+    EXPECT_THAT(device.text(23), HasSubstr("not a time"));
+    for (int i = 0; i < 5; ++i)
+        press(Kind::Backspace);
+    type("+90");
+    press(Kind::Enter);
+    EXPECT_THAT(playback.calls, ElementsAre("jumpToText 10:0q", "jumpToText +90"));
+    EXPECT_THAT(device.text(23), HasSubstr("q quit"));
+    type("g");
+    press(Kind::Escape);
+    EXPECT_THAT(device.text(23), HasSubstr("q quit"));
+}
+
+TEST_F(PlaybackLineTest, AClickOnTheBarJumps)
+{
+    const std::string line = device.text(21);
+    const int start = columnsOf(line.substr(0, line.find("━")));
+    click(21, start);
+    EXPECT_THAT(playback.calls, ElementsAre("jumpTo 0"));
+}
+
+TEST_F(PlaybackLineTest, WhileTheFileIsReadItsProgressAndHowToStopAreShown)
+{
+    playback.read = 0.42;
+    screen->setNeedsUpdate();
+    queue.runPending();
+    EXPECT_THAT(device.text(21), StartsWith(" Reading the file  ━"));
+    EXPECT_THAT(device.text(21), EndsWith(" 42 %"));
+    EXPECT_THAT(device.text(23), HasSubstr("x stop reading"));
+    type(" x");
+    EXPECT_THAT(playback.calls, ElementsAre("stopReading")) << "it cannot be played yet";
+}
+
+TEST_F(PlaybackLineTest, TheRemarkHasALineOfItsOwn)
+{
+    playback.note = "198 bytes could not be placed";
+    screen->setNeedsUpdate();
+    queue.runPending();
+    EXPECT_EQ(device.text(21), " 198 bytes could not be placed");
+    EXPECT_THAT(device.text(20), StartsWith(" ‖ paused"));
+}
+
+TEST_F(PlaybackLineTest, TheListOfKeysHasItsKeys)
+{
+    type("?");
+    EXPECT_GE(device.lineOf("play, pause"), 0);
+}
+
+} // namespace orvane
