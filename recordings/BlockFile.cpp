@@ -16,9 +16,9 @@ std::string whyNot(const std::string& path, int error)
 {
     std::error_code ignored;
     if (error == EEXIST && !std::filesystem::is_directory(path, ignored))
-        return path + " is there already: give --force to overwrite it, or another name";
-    return path + " cannot be written (" + std::strerror(error == EEXIST ? EISDIR : error) +
-           "): give another name to record to";
+        return "\"" + path + "\" is there already: give --force to overwrite it, or another name";
+    return "\"" + path + "\" cannot be written (" +
+           std::strerror(error == EEXIST ? EISDIR : error) + "): give another name to record to";
 }
 
 } // namespace

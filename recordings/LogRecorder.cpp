@@ -32,7 +32,7 @@ std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::st
     const int failure = report ? file->append(*report) : EIO;
     if (failure == 0)
         return std::make_unique<LogRecorder>(queue, std::move(file), path);
-    error = path + " cannot be written (" + std::strerror(failure) +
+    error = "\"" + path + "\" cannot be written (" + std::strerror(failure) +
             "): make room, or give another name to record to";
     std::error_code ignored;
     if (std::filesystem::is_regular_file(path, ignored))
@@ -56,7 +56,7 @@ void LogRecorder::channelOpened(const PropertyValue& technology)
     _hasModemMessages = technology != kTSLogChannelTechnology_IFX;
     if (_hasModemMessages || !_file || std::exchange(_hasSaidThatNothingComes, true))
         return;
-    consoleLine("Nothing to record to %s: a cell monitor has no messages of a modem.",
+    consoleLine("Nothing to record to \"%s\": a cell monitor has no messages of a modem.",
                 _path.c_str());
 }
 
@@ -98,7 +98,7 @@ void LogRecorder::endIfFailed(int error)
 {
     if (error == 0)
         return;
-    consoleLine("Recording to %s has ended: %s. What came before is kept.", _path.c_str(),
+    consoleLine("Recording to \"%s\" has ended: %s. What came before is kept.", _path.c_str(),
                 std::strerror(error));
     _file.reset();
 }

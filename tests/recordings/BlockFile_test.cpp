@@ -72,7 +72,8 @@ TEST_F(BlockFileTest, AnExistingFileIsRefusedAndLeftAlone)
 {
     ASSERT_TRUE(writeFile(path, Bytes{9, 9}));
     EXPECT_FALSE(create());
-    EXPECT_EQ(error, path + " is there already: give --force to overwrite it, or another name");
+    EXPECT_EQ(error,
+              "\"" + path + "\" is there already: give --force to overwrite it, or another name");
     EXPECT_EQ(readFile(path), (Bytes{9, 9}));
 }
 

@@ -177,9 +177,10 @@ TEST_F(LogRecorderTest, AFullDiskEndsTheRecordingWithOneLine)
     recorder->messageReceived(joined({{1}, item(kCode, 20)}));
     queue.advance(10s);
     EXPECT_EQ(file.bytes, item(kCode, 20));
-    EXPECT_THAT(services.console.lines,
-                ElementsAre("Recording to drive.dlf has ended: No space left on device. What came "
-                            "before is kept."));
+    EXPECT_THAT(
+        services.console.lines,
+        ElementsAre("Recording to \"drive.dlf\" has ended: No space left on device. What came "
+                    "before is kept."));
 }
 
 TEST_F(LogRecorderTest, ADiskThatFailsLaterEndsTheRecordingToo)
@@ -198,7 +199,7 @@ TEST_F(LogRecorderTest, ACellMonitorHasNothingToRecordAndThatIsSaidOnce)
     recorder->messageReceived(joined({{1}, item(kCode, 20)}));
     EXPECT_THAT(file.bytes, IsEmpty());
     EXPECT_THAT(services.console.lines,
-                ElementsAre("Nothing to record to drive.dlf: a cell monitor "
+                ElementsAre("Nothing to record to \"drive.dlf\": a cell monitor "
                             "has no messages of a modem."));
 }
 
@@ -247,7 +248,7 @@ TEST_F(RecordedFileTest, ADiskThatIsFullFromTheStartIsAnError)
 {
     path = "/dev/full";
     EXPECT_FALSE(LogRecorder::create(queue, path, DiskBlockFile::Existing::Overwritten, error));
-    EXPECT_THAT(error, HasSubstr("/dev/full cannot be written (No space left on device)"));
+    EXPECT_THAT(error, HasSubstr("\"/dev/full\" cannot be written (No space left on device)"));
     EXPECT_TRUE(std::filesystem::exists("/dev/full"));
 }
 
