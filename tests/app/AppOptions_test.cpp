@@ -26,7 +26,7 @@ TEST(AppOptionsTest, WithoutArgumentsEverythingHasItsDefault)
     const AppOptions options = parsed({});
     EXPECT_FALSE(options.error);
     EXPECT_FALSE(options.demo);
-    EXPECT_EQ(options.frontEnd, FrontEnd::Text);
+    EXPECT_EQ(options.frontEnd, std::nullopt);
     EXPECT_EQ(options.ports, "");
     EXPECT_FALSE(options.root);
     EXPECT_EQ(options.refreshInterval, 2s);
@@ -40,7 +40,7 @@ TEST(AppOptionsTest, TakesEachOption)
     const AppOptions options = parsed({"--ui=json", "--ports", "/p", "--root", "/r", "--refresh",
                                        "0.25", "--log", "none", "--log-level", "info"});
     EXPECT_FALSE(options.error);
-    EXPECT_EQ(options.frontEnd, FrontEnd::Json);
+    EXPECT_EQ(options.frontEnd, FrontEndKind::Json);
     EXPECT_EQ(options.ports, "/p");
     EXPECT_EQ(options.root, "/r");
     EXPECT_EQ(options.refreshInterval, 250ms);

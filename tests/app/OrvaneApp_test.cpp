@@ -4,10 +4,15 @@
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
 #include "platform/PropertyList.h"
+#include "platform/fake/FakePreferencesStore.h"
+#include "platform/fake/FakeScreen.h"
 #include "platform/fake/LoopbackTransport.h"
 #include "platform/fake/ScriptedTelephonyServer.h"
 #include "support/Recording.h"
+#include "support/SaveScreen.h"
 #include "support/TemporaryDirectory.h"
+#include "ui/OrvaneCell.h"
+#include "ui/PaneStack.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -24,57 +29,27 @@ using namespace std::chrono_literals;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 
-// A pane that notes what it is told.
-class NotingPane final : public Pane
+// A root pane that notes what it is told.
+class NotingPane final : public OrvanePaneController
 {
 public:
-    NotingPane(std::string path, std::vector<std::string>& notes)
-        : _path(std::move(path)), _notes(notes)
+    NotingPane(Shell& shell, std::vector<std::string>& notes)
+        : OrvanePaneController(nullptr, "/", shell), _notes(notes)
     {
     }
-    [[nodiscard]] std::string path() const override { return _path; }
     void reloadWithNode(NodePointer node) override
     {
-        _notes.push_back(_path + " reload " + (node ? node->displayName() : "nothing"));
+        _notes.push_back("reload " + (node ? node->displayName() : "nothing"));
+        OrvanePaneController::reloadWithNode(std::move(node));
     }
-    void setStatus(std::optional<std::string> status, bool isLoading) override
+    void setStatus(std::optional<std::string> text, bool isBusy) override
     {
-        _isLoading = isLoading;
-        _notes.push_back(_path + " " + status.value_or("(none)") + (isLoading ? " busy" : ""));
+        _notes.push_back(text.value_or("(none)") + (isBusy ? " busy" : ""));
+        OrvanePaneController::setStatus(std::move(text), isBusy);
     }
-    [[nodiscard]] bool isLoading() const override { return _isLoading; }
 
 private:
-    std::string _path;
     std::vector<std::string>& _notes;
-    bool _isLoading = true;
-};
-
-class NotingStack final : public PaneStack
-{
-public:
-    void push(const std::string& path)
-    {
-        _panes.push_back(std::make_unique<NotingPane>(path, notes));
-    }
-    [[nodiscard]] std::vector<Pane*> panes() const override
-    {
-        std::vector<Pane*> all;
-        for (const auto& pane : _panes)
-            all.push_back(pane.get());
-        return all;
-    }
-    void popToPane(const Pane& pane) override
-    {
-        notes.push_back("pop to " + pane.path());
-        while (_panes.back().get() != &pane)
-            _panes.pop_back();
-    }
-
-    std::vector<std::string> notes;
-
-private:
-    std::vector<std::unique_ptr<NotingPane>> _panes;
 };
 
 class OrvaneAppTest : public ::testing::Test
@@ -83,7 +58,7 @@ protected:
     OrvaneAppTest()
     {
         services.useShippedResources();
-        panes.push("/");
+        screen.setInterface("OrvaneSaveViewController", [] { return makeSaveScreen(); });
     }
 
     void launch()
@@ -104,7 +79,26 @@ protected:
     {
         std::filesystem::create_directories(root.path() + "/var/mobile/Library/Logs/DiagDrop");
     }
-    std::vector<std::string> takeNotes() { return std::exchange(panes.notes, {}); }
+    std::vector<std::string> takeNotes() { return std::exchange(notes, {}); }
+    void refresh()
+    {
+        sendServingCell();
+        queue.advance(2s);
+    }
+    [[nodiscard]] std::vector<std::string> paths() const
+    {
+        std::vector<std::string> all;
+        for (const auto& controller : screen.navigation()->viewControllers())
+            all.push_back(dynamic_cast<OrvanePaneController&>(*controller).path());
+        return all;
+    }
+    [[nodiscard]] OrvanePaneController& top() const { return *topPane(*screen.navigation()); }
+    // Onto the pane in front, as if the tree had led there.
+    void push(const std::string& path)
+    {
+        screen.navigation()->pushViewController(
+            std::make_shared<OrvanePaneController>(nullptr, path, app), true);
+    }
 
     TestServices services;
     TemporaryDirectory root;
@@ -114,11 +108,14 @@ protected:
     FramePorts ports{transport, queue};
     FrameTelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
-    NotingStack panes;
+    FakePreferencesStore preferences;
+    FakeScreen screen;
+    std::vector<std::string> notes;
     OrvaneApp app{
-        {queue, ports, client, 2s, [] { return std::optional<std::string>("UUID"); }},
+        {queue, ports,                                           client, 2s, [] { return std::optional<std::string>("UUID"); }},
         files,
-        panes
+        preferences,
+        [this](Shell& shell) { return std::make_shared<NotingPane>(shell, notes);                                                    }
     };
 };
 
@@ -127,10 +124,10 @@ protected:
 TEST_F(OrvaneAppTest, StartsAsConnectingAndTheFirstAttemptComesAfterTheLaunch)
 {
     app.applicationDidFinishLaunching();
-    EXPECT_THAT(takeNotes(), ElementsAre("/ Connecting busy", "/ Connecting... busy"));
+    EXPECT_THAT(takeNotes(), ElementsAre("Connecting busy", "Connecting... busy"));
     EXPECT_THAT(server.requestedPorts(), IsEmpty());
     queue.runPending();
-    EXPECT_THAT(takeNotes(), ElementsAre("/ Connecting..."));
+    EXPECT_THAT(takeNotes(), ElementsAre("Connecting..."));
 }
 
 TEST_F(OrvaneAppTest, AReloadShowsWhenItWasInLocalTime)
@@ -140,7 +137,7 @@ TEST_F(OrvaneAppTest, AReloadShowsWhenItWasInLocalTime)
     sendServingCell();
     takeNotes();
     queue.advance(2s);
-    EXPECT_THAT(takeNotes(), ElementsAre("/ reload Orvane", "/ Updated 2026-11-21 at 11:00:00"));
+    EXPECT_THAT(takeNotes(), ElementsAre("reload Orvane", "Updated 2026-11-21 at 11:00:00"));
 }
 
 TEST_F(OrvaneAppTest, FailedAttemptsDoNotFlicker)
@@ -148,7 +145,7 @@ TEST_F(OrvaneAppTest, FailedAttemptsDoNotFlicker)
     server.die();
     launch();
     queue.advance(30s);
-    EXPECT_THAT(takeNotes(), ElementsAre("/ Connecting busy", "/ Connecting... busy"));
+    EXPECT_THAT(takeNotes(), ElementsAre("Connecting busy", "Connecting... busy"));
 }
 
 TEST_F(OrvaneAppTest, ALostAndRegainedConnectionShowsAtOnce)
@@ -159,25 +156,129 @@ TEST_F(OrvaneAppTest, ALostAndRegainedConnectionShowsAtOnce)
     takeNotes();
     server.die();
     queue.advance(2s);
-    EXPECT_THAT(takeNotes(), ElementsAre("/ Connecting... busy"));
+    EXPECT_THAT(takeNotes(), ElementsAre("Connecting... busy"));
     ASSERT_TRUE(server.restart());
     queue.advance(5s);
-    EXPECT_THAT(takeNotes(), ElementsAre("/ Updated 2026-11-21 at 10:00:00"));
+    EXPECT_THAT(takeNotes(), ElementsAre("Updated 2026-11-21 at 10:00:00"));
+}
+
+TEST_F(OrvaneAppTest, TheRootPaneFillsTheWindow)
+{
+    launch();
+    EXPECT_EQ(screen.keyWindow()->frame(), screen.bounds());
+    EXPECT_THAT(paths(), ElementsAre("/"));
+    EXPECT_EQ(screen.title(), "Orvane");
+}
+
+TEST_F(OrvaneAppTest, EveryPaneOfTheStackIsReloadedAndTheTopOneShowsTheTime)
+{
+    launch();
+    refresh();
+    screen.pressRow(0);
+    EXPECT_THAT(paths(), ElementsAre("/", "/Serving Cell Info"));
+    takeNotes();
+    services.clock.now += 4;
+    ASSERT_TRUE(server.sendLogMessage(PacketBuilder(0xB0C2, 38).put16(14, 77).bytes()));
+    queue.advance(2s);
+    EXPECT_THAT(takeNotes(), ElementsAre("reload Orvane"));
+    EXPECT_EQ(top().statusText(), "Updated 2026-11-21 at 10:00:04");
+    const auto cell = std::dynamic_pointer_cast<OrvaneCell>(screen.row(0));
+    EXPECT_EQ(cell->key()->text() + " " + cell->value()->text(), "Physical Cell ID 77");
 }
 
 TEST_F(OrvaneAppTest, PanesWhosePathIsGoneArePoppedWithThoseAboveThem)
 {
     launch();
-    panes.push("/Serving Cell Info");
-    panes.push("/Serving Cell Info/gone");
-    panes.push("/Serving Cell Info/gone/deeper");
-    sendServingCell();
+    push("/Serving Cell Info");
+    push("/Serving Cell Info/gone");
+    push("/Serving Cell Info/gone/deeper");
+    refresh();
+    EXPECT_THAT(paths(), ElementsAre("/", "/Serving Cell Info"));
+    EXPECT_TRUE(screen.navigation()->isLastChangeAnimated());
+    EXPECT_EQ(screen.title(), "Serving Cell Info");
+    EXPECT_EQ(top().statusText(), "Updated 2026-11-21 at 10:00:00");
+}
+
+TEST_F(OrvaneAppTest, APaneThatIsShownAgainShowsTheStatusOfNow)
+{
+    launch();
+    refresh();
+    screen.pressRow(0);
+    services.clock.now += 60;
+    refresh();
     takeNotes();
+    screen.pressBack();
+    EXPECT_THAT(takeNotes(), ElementsAre("Updated 2026-11-21 at 10:01:00"));
+    server.die();
     queue.advance(2s);
-    EXPECT_THAT(takeNotes(),
-                ElementsAre("/ reload Orvane", "/Serving Cell Info reload Serving Cell Info",
-                            "pop to /Serving Cell Info",
-                            "/Serving Cell Info Updated 2026-11-21 at 10:00:00"));
+    screen.pressRow(0);
+    EXPECT_EQ(top().statusText(), "Connecting...");
+    EXPECT_TRUE(top().isBusy());
+}
+
+TEST_F(OrvaneAppTest, SaveOpensTheSaveScreenOnceWithWhatThereIsNow)
+{
+    makeMarker();
+    makeLogFolder();
+    launch();
+    refresh();
+    screen.pressToolbar(BarButtonItem::Kind::Save);
+    OrvaneSaveViewController* const first = app.saveView();
+    ASSERT_NE(first, nullptr);
+    app.showSaveView();
+    EXPECT_EQ(app.saveView(), first);
+    EXPECT_EQ(screen.navigation()->modalViewController().get(), first);
+    EXPECT_EQ(first->saveContentTable()->numberOfRows(), 2U);
+    first->saveDescription()->setText("here");
+    first->savePressed();
+    queue.runPending();
+    EXPECT_EQ(app.saveView(), nullptr);
+    EXPECT_EQ(screen.navigation()->modalViewController(), nullptr);
+    EXPECT_FALSE(std::filesystem::is_empty(root.path() + kLogFolder));
+    app.closeSaveView();
+}
+
+TEST_F(OrvaneAppTest, AFailedSaveClosesTheScreenAndLeavesTheAlert)
+{
+    makeMarker();
+    launch();
+    app.showSaveView();
+    app.saveView()->savePressed();
+    queue.runPending();
+    EXPECT_EQ(app.saveView(), nullptr);
+    ASSERT_NE(screen.alert(), nullptr);
+    EXPECT_EQ(screen.alert()->title(), "File Error");
+}
+
+TEST_F(OrvaneAppTest, WithoutTheInterfaceFileNothingIsInTheWay)
+{
+    screen.setInterface("OrvaneSaveViewController", [] { return nullptr; });
+    launch();
+    app.showSaveView();
+    EXPECT_EQ(app.saveView(), nullptr);
+    EXPECT_EQ(screen.navigation()->modalViewController(), nullptr);
+}
+
+TEST_F(OrvaneAppTest, BeforeTheLaunchThereIsNothingToUpdate)
+{
+    app.updateViewControllerFromModel();
+    app.monitorStartEnded();
+    app.showSaveView();
+    app.closeSaveView();
+    EXPECT_THAT(takeNotes(), IsEmpty());
+}
+
+TEST_F(OrvaneAppTest, ItsEndStopsTheNumericSignalStrengthAndLeavesTheScreen)
+{
+    launch();
+    EXPECT_THAT(preferences.notes, IsEmpty());
+    app.showSaveView();
+    app.applicationWillTerminate();
+    EXPECT_THAT(preferences.notes,
+                ElementsAre("set home-screen HSShowGSMRSSI false", "synchronize home-screen",
+                            "notice home-screen HSShowGSMRSSI"));
+    EXPECT_EQ(app.saveView(), nullptr);
+    EXPECT_EQ(screen.keyWindow(), nullptr);
 }
 
 TEST_F(OrvaneAppTest, WithoutTheMarkerSavingIsNotOffered)

@@ -20,6 +20,7 @@ END
     put ui/panes/Pane.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <vector>'
     put app/Shell.h <<<$'#pragma once\n#include "ui/panes/Pane.h"\n#include "platform/Value.h"'
     put app/main.cpp <<<'#include "platform/qt/Loop.h"'
+    put app/program/FrontEnd.cpp <<<'#include "platform/qt/Loop.h"'
     put platform/qt/Loop.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <QObject>'
     put platform/window/Row.h <<<$'#pragma once\n#include <QWidget>'
     put tests/window/Row_test.cpp <<<'#include <QTest>'
@@ -88,7 +89,7 @@ if type -P git >/dev/null; then
     make_tree
     git init -q . && put .gitignore <<<'/ignored/'
     put ignored/Bad.h <<<'#include <QTimer>'
-    git add . && rm platform/qt/Loop.h app/main.cpp
+    git add . && rm platform/qt/Loop.h app/main.cpp app/program/FrontEnd.cpp
     put ui/New.cpp <<<'#include <QTimer>'
     check
     expect_equal "$(cut -d: -f1 <<<"$complaints")" "ui/New.cpp"
