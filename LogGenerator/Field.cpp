@@ -34,16 +34,17 @@ void writeRows(PropertyDictionary* rows, PacketView packet, std::span<const Fiel
 {
     if (!rows)
         return;
+    rows->reserve(fields.size());
     for (const Field& field : fields)
         if (const auto raw = field.valueIn(packet))
             if (RowText text = field.format(*raw))
-                rows->set(field.row, std::move(*text));
+                rows->setText(field.row, std::move(*text));
 }
 
 void setRow(PropertyDictionary* rows, const char* row, std::string text)
 {
     if (rows)
-        rows->set(row, std::move(text));
+        rows->setText(row, std::move(text));
 }
 
 void setListRow(PropertyDictionary* rows, const char* row, std::vector<PropertyValue> elements)

@@ -4,9 +4,22 @@
 
 #include <charconv>
 #include <cstdarg>
+#include <utility>
 
 namespace orvane
 {
+
+namespace
+{
+
+RowText textOf(const char* begin, const char* end, std::string_view unit)
+{
+    RowText text(std::in_place, begin, end);
+    text->append(unit);
+    return text;
+}
+
+} // namespace
 
 std::string printed(const char* format, ...)
 {
@@ -17,21 +30,30 @@ std::string printed(const char* format, ...)
     return text;
 }
 
-RowText decimal(std::int64_t raw)
+RowText wholeNumber(std::int64_t value, std::string_view unit)
 {
-    // What "%d" prints, without the cost of parsing a format for the most frequent of all rows.
-    char text[16];
-    const auto end = std::to_chars(text, text + sizeof text, static_cast<std::int32_t>(raw)).ptr;
-    return std::string(text, end);
+    char text[20];
+    return textOf(text, std::to_chars(text, text + sizeof text, value).ptr, unit);
 }
 
-RowText unsignedDecimal(std::int64_t raw) { return printed("%u", static_cast<std::uint32_t>(raw)); }
+RowText fixedPoint(double value, int digits, std::string_view unit)
+{
+    // The longest double has 309 digits before its point.
+    char text[1 + 309 + 1 + kMostDigits];
+    const auto end =
+        std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, digits).ptr;
+    return textOf(text, end, unit);
+}
 
-RowText decibels(std::int64_t raw) { return printed("%d dB", static_cast<std::int32_t>(raw)); }
+RowText decimal(std::int64_t raw) { return wholeNumber(static_cast<std::int32_t>(raw)); }
+
+RowText unsignedDecimal(std::int64_t raw) { return wholeNumber(static_cast<std::uint32_t>(raw)); }
+
+RowText decibels(std::int64_t raw) { return wholeNumber(static_cast<std::int32_t>(raw), " dB"); }
 
 RowText decibelMilliwatts(std::int64_t raw)
 {
-    return printed("%d dBm", static_cast<std::int32_t>(raw));
+    return wholeNumber(static_cast<std::int32_t>(raw), " dBm");
 }
 
 } // namespace orvane

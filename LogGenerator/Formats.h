@@ -13,6 +13,13 @@ namespace orvane
 // printf into a text.
 [[gnu::format(printf, 1, 2)]] std::string printed(const char* format, ...);
 
+// What printf makes of the most frequent formats, at a quarter of its cost: "%d" and "%.*f"
+// (nearest even digit where the binary value lies just between two, as C has it), followed by the
+// unit.
+RowText wholeNumber(std::int64_t value, std::string_view unit = {});
+constexpr int kMostDigits = 16;
+RowText fixedPoint(double value, int digits, std::string_view unit = {});
+
 // Names of a field's values.
 struct ValueName {
     std::int64_t value;
@@ -36,7 +43,7 @@ RowText named(std::int64_t raw)
     return nameOf(Table, raw, "Unknown");
 }
 
-// Formats that several sections share. Each holds one printf format.
+// Formats that several sections share, each named by its printf format.
 
 // "%d": an unsigned 32-bit value beyond 2147483647 shows as C shows it, negative.
 RowText decimal(std::int64_t raw);

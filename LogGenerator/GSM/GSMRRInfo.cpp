@@ -37,7 +37,7 @@ constexpr ValueName kRrStates[] = {
 
 RowText mode(std::int64_t flag) { return flag != 0 ? "Data" : "Voice"; }
 RowText onOrOff(std::int64_t flag) { return flag != 0 ? "ON" : "OFF"; }
-RowText seconds(std::int64_t raw) { return printed("%d sec", static_cast<std::int32_t>(raw)); }
+RowText seconds(std::int64_t raw) { return wholeNumber(raw, " sec"); }
 
 constexpr Field kStateFields[] = {
     bytesField("RR State", 13, 1, named<kRrStates>),

@@ -13,7 +13,7 @@ RowText receivedPower(std::int64_t raw) { return decibels(raw - 21); }
 
 RowText halfDecibels(std::int64_t steps)
 {
-    return printed("%f dB", static_cast<double>(steps) * 0.5);
+    return fixedPoint(static_cast<double>(steps) * 0.5, 6, " dB");
 }
 
 constexpr Field kCellFields[] = {

@@ -5,15 +5,15 @@
 namespace orvane
 {
 
-RowText rsrpQuarterDb(std::int64_t raw) { return printed("%4.2f dBm", quarterDecibelPower(raw)); }
+RowText rsrpQuarterDb(std::int64_t raw) { return fixedPoint(quarterDecibelPower(raw), 2, " dBm"); }
 
-RowText rsrpHalfDb(std::int64_t raw) { return printed("%4.2f dBm", halfDecibelPower(raw)); }
+RowText rsrpHalfDb(std::int64_t raw) { return fixedPoint(halfDecibelPower(raw), 2, " dBm"); }
 
-RowText rsrqEighthDb(std::int64_t raw) { return printed("%4.2f dB", eighthDecibelQuality(raw)); }
+RowText rsrqEighthDb(std::int64_t raw) { return fixedPoint(eighthDecibelQuality(raw), 2, " dB"); }
 
-RowText rsrqQuarterDb(std::int64_t raw) { return printed("%4.2f dB", quarterDecibelQuality(raw)); }
+RowText rsrqQuarterDb(std::int64_t raw) { return fixedPoint(quarterDecibelQuality(raw), 2, " dB"); }
 
-RowText rssiHalfDb(std::int64_t raw) { return printed("%4.2f dBm", halfDecibelPower(raw)); }
+RowText rssiHalfDb(std::int64_t raw) { return fixedPoint(halfDecibelPower(raw), 2, " dBm"); }
 
 RowText minus30(std::int64_t raw) { return decibelMilliwatts(raw - 30); }
 

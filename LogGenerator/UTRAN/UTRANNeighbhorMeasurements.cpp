@@ -12,7 +12,7 @@ constexpr std::uint32_t kMeasurementCode = 0xD00A;
 
 RowText filteredPower(std::int64_t raw)
 {
-    return printed("%f", static_cast<double>(raw) * 0.00390625); // 256 steps
+    return fixedPoint(static_cast<double>(raw) * 0.00390625, 6); // 256 steps
 }
 
 constexpr const char* kSets[] = {"ASET", "MSET", "DSET"}; // active, monitored, detected
