@@ -531,6 +531,124 @@ TEST(DlfReaderTest, DamagesInALongFileMakeNoFurtherLosses)
     EXPECT_EQ(reading.found.size(), 3U * 1104 + 1103);
 }
 
+// A file of which nothing but what is asked for is in memory.
+class NarrowSource final : public ByteSource
+{
+public:
+    explicit NarrowSource(const Bytes& file) : _file(file) {}
+    [[nodiscard]] std::uint64_t size() const override { return _file.size(); }
+    [[nodiscard]] ByteView bytes(std::uint64_t position, std::size_t count) override
+    {
+        const auto first = _file.begin() + static_cast<std::ptrdiff_t>(position);
+        const std::size_t most = std::min(count, _file.size() - position);
+        widest = std::max(widest, most);
+        // Always at another place, so that the address sanitizer sees who looks at an old one.
+        _window = Bytes(first, first + static_cast<std::ptrdiff_t>(most));
+        return _window;
+    }
+    std::size_t widest = 0;
+
+private:
+    const Bytes& _file;
+    Bytes _window;
+};
+
+TEST(DlfReaderTest, AWindowOntoTheFileIsEnough)
+{
+    // Longest items, foreign bytes that look like such, and a real damaged recording.
+    std::vector<Bytes> parts = {recording("lte-drive-damaged.dlf")};
+    for (int i = 0; i < 6; ++i)
+        parts.push_back(item(0xB0C0, kStart + static_cast<std::uint64_t>(i) * kHalfSecond,
+                             i % 2 == 0 ? 65523 : 3));
+    parts.emplace_back(3000, 0x77);
+    parts.push_back(item(0xB0C1, kStart + kHalfSecond, 65523));
+    parts.emplace_back(200, 0xFF);
+    parts.push_back(recording("lte-drive-damaged.dlf"));
+    const Bytes file = joined(parts);
+
+    const Reading whole(file);
+    const auto source = std::make_shared<NarrowSource>(file);
+    DlfReader reader(source);
+    std::vector<Bytes> found;
+    while (const auto each = reader.next())
+        found.emplace_back(each->bytes.begin(), each->bytes.end());
+    EXPECT_EQ(found, whole.bytes());
+    EXPECT_EQ(reader.unplacedRanges(), whole.ranges);
+    EXPECT_EQ(reader.separatorBytes(), whole.separators);
+    EXPECT_LE(source->widest, std::size_t{1} << 18);
+}
+
+TEST(DlfReaderTest, ReadingCanBeLimitedWhereNoItemIs)
+{
+    Bytes file = joined(items(3));
+    file.insert(file.end(), 1000, 0x20);
+    append(file, joined(items(3)));
+    DlfReader reader(file);
+    std::size_t found = 0;
+    std::size_t breaks = 0;
+    while (!reader.isAtEnd()) {
+        if (reader.next(100))
+            ++found;
+        else
+            ++breaks;
+    }
+    EXPECT_EQ(found, 5U); // not the one before the foreign bytes
+    EXPECT_EQ(breaks, 10U);
+    EXPECT_EQ(reader.unplacedRangeCount(), 1U);
+    EXPECT_FALSE(reader.next(100));
+}
+
+TEST(DlfReaderTest, ACopyGoesOnFromTheSamePlaceOnItsOwn)
+{
+    const Bytes file = recording("lte-drive-damaged.dlf");
+    const std::vector<Bytes> whole = Reading(file).bytes();
+    DlfReader reader(file);
+    for (std::size_t i = 0; i < whole.size(); ++i) {
+        DlfReader copy = reader;
+        for (std::size_t k = i; k < std::min(i + 3, whole.size()); ++k) {
+            const auto each = copy.next();
+            ASSERT_TRUE(each);
+            ASSERT_EQ(Bytes(each->bytes.begin(), each->bytes.end()), whole[k]);
+        }
+        ASSERT_TRUE(reader.next());
+    }
+    EXPECT_FALSE(reader.next());
+}
+
+// What is cut off a file while it is read.
+class ShrinkingSource final : public ByteSource
+{
+public:
+    ShrinkingSource(const Bytes& file, std::uint64_t size) : _file(file), _size(size) {}
+    [[nodiscard]] std::uint64_t size() const override { return _calls < 20 ? _file.size() : _size; }
+    [[nodiscard]] ByteView bytes(std::uint64_t position, std::size_t count) override
+    {
+        ++_calls;
+        return position < size() ? ByteView(_file).subspan(position).first(
+                                       std::min<std::size_t>(count, size() - position))
+                                 : ByteView();
+    }
+
+private:
+    const Bytes& _file;
+    std::uint64_t _size;
+    int _calls = 0;
+};
+
+TEST(DlfReaderTest, AFileThatBecomesShorterEndsThere)
+{
+    const Bytes file = joined(items(100));
+    for (std::uint64_t size = 0; size < file.size(); size += 7) {
+        DlfReader reader(std::make_shared<ShrinkingSource>(file, size));
+        std::size_t found = 0;
+        while (reader.next())
+            ++found;
+        EXPECT_GE(found, 19U);
+        EXPECT_LT(found, 100U);
+        EXPECT_TRUE(reader.isAtEnd());
+    }
+}
+
 TEST(DlfReaderTest, RecordingOneByteShortLosesItsLastTwoItems)
 {
     Bytes file = recording("lte-drive.dlf");
