@@ -1,27 +1,31 @@
 #include "app/AppOptions.h"
+#include "app/ExportOptions.h"
 #include "app/OrvaneApp.h"
 #include "app/program/Display.h"
+#include "app/program/ExportProgram.h"
 #include "app/program/FrontEnd.h"
+#include "app/program/ProgramServices.h"
 #include "app/program/SimulatedPhone.h"
 #include "app/program/TerminalFrontEnd.h"
+#include "app/program/WindowFrontEnd.h"
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
-#include "platform/Services.h"
 #include "platform/Uuid.h"
 #include "platform/qt/PortsDirectory.h"
 #include "platform/qt/QtEventLoop.h"
 #include "platform/qt/QtFrameTransport.h"
 #include "platform/qt/QtMainQueue.h"
 #include "platform/qt/QtPreferencesStore.h"
-#include "platform/qt/ResourceDirectory.h"
 #include "platform/qt/SignalWatcher.h"
 #include "platform/qt/StandardDescriptors.h"
 #include "platform/terminal/TerminalKind.h"
+#include "platform/window/QtWindowApplication.h"
 #include "recordings/LogRecorder.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <cstdio>
 #include <exception>
+#include <optional>
 #include <stdexcept>
 #include <unistd.h>
 
@@ -30,9 +34,6 @@ using namespace orvane;
 namespace
 {
 
-constexpr int kFailure = 1;
-constexpr int kUnusableArguments = 2;
-
 std::unique_ptr<FrontEnd> makeFrontEnd(FrontEndKind kind, const AppOptions& options,
                                        QtEventLoop& loop)
 {
@@ -40,7 +41,7 @@ std::unique_ptr<FrontEnd> makeFrontEnd(FrontEndKind kind, const AppOptions& opti
     case FrontEndKind::Terminal:
         return makeTerminalFrontEnd(options, loop);
     case FrontEndKind::Window:
-        throw std::runtime_error("this front end is not built in: use --ui text or --ui json");
+        return makeWindowFrontEnd(options, loop);
     case FrontEndKind::Text:
     case FrontEndKind::Json:
         break;
@@ -90,6 +91,10 @@ int run(const AppOptions& options)
 {
     const FrontEndKind kind =
         options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
+    // The event loop of a program with a window needs a larger kind of application object.
+    std::optional<QtWindowApplication> windowApplication;
+    if (kind == FrontEndKind::Window)
+        windowApplication.emplace();
     QtEventLoop loop;
     if (options.demo) {
         const PrivatePortsDirectory directory;
@@ -117,6 +122,8 @@ int main(int argc, char** argv)
 {
     prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
+    if (!arguments.empty() && arguments.front() == kExportCommand)
+        return runExport(std::span(arguments).subspan(1));
     const std::vector<std::string> scenarios = scenarioNames();
     const AppOptions options = parseAppOptions(arguments, scenarios);
     if (options.error) {
@@ -132,21 +139,11 @@ int main(int argc, char** argv)
         return 0;
     }
 
-    StandardErrorConsole console;
-    DirectoryResources resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES));
-    Services& services = Services::current();
-    services.setLog(options.log.get());
-    services.setConsole(&console);
-    services.setResources(&resources);
-    services.setVersion(ORVANE_VERSION);
-    int status = kFailure;
+    const ProgramServices services(options.log.get());
     try {
-        status = run(options);
+        return run(options);
     } catch (const std::exception& failure) {
         complain(failure.what());
+        return kFailure;
     }
-    services.setLog(nullptr);
-    services.setConsole(nullptr);
-    services.setResources(nullptr);
-    return status;
 }

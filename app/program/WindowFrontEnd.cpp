@@ -1,0 +1,38 @@
+#include "app/program/WindowFrontEnd.h"
+
+#include "platform/qt/QtEventLoop.h"
+#include "platform/window/QtScreen.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+namespace
+{
+
+class WindowFrontEnd final : public FrontEnd
+{
+public:
+    explicit WindowFrontEnd(QtScreen::Settings settings) : _screen(std::move(settings)) {}
+
+private:
+    QtScreen _screen;
+};
+
+} // namespace
+
+std::unique_ptr<FrontEnd> makeWindowFrontEnd(const AppOptions& options, QtEventLoop& loop)
+{
+    QtScreen::Settings settings;
+    settings.isSimulated = options.demo.has_value();
+    settings.isFullScreen = options.isFullScreen;
+    settings.waitingHint = settings.isSimulated
+                               ? "The simulated phone is starting."
+                               : "Start telephonyd on this machine, or try a simulated phone: "
+                                 "orvane --demo";
+    settings.onClose = [&loop] { loop.quit(); };
+    return std::make_unique<WindowFrontEnd>(std::move(settings));
+}
+
+} // namespace orvane
