@@ -28,6 +28,10 @@ public:
 std::unique_ptr<FrontEnd> makeOutputFrontEnd(FrontEndKind kind, const AppOptions& options,
                                              QtEventLoop& loop);
 
+// Exit statuses.
+inline constexpr int kFailure = 1;
+inline constexpr int kUnusableArguments = 2;
+
 // Prints one line on standard error as this program's.
 void complain(const std::string& text);
 

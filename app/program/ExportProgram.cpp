@@ -1,0 +1,129 @@
+#include "app/program/ExportProgram.h"
+
+#include "app/ExportOptions.h"
+#include "app/program/FrontEnd.h"
+#include "app/program/ProgramServices.h"
+#include "platform/OutputDescriptor.h"
+#include "platform/ProgressLine.h"
+#include "recordings/CsvRowWriter.h"
+#include "recordings/JsonRowWriter.h"
+#include "recordings/PathListWriter.h"
+
+#include <cstdio>
+#include <exception>
+#include <optional>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace orvane
+{
+
+namespace
+{
+
+// Standard output, written to in large pieces.
+class Output
+{
+public:
+    // False where nobody reads on, or nothing can be written.
+    bool write(std::string_view lines)
+    {
+        _pending += lines;
+        return _pending.size() < kPiece || flush();
+    }
+    bool flush()
+    {
+        const auto state = _descriptor.write(_pending);
+        _pending.clear();
+        return state == OutputDescriptor::State::Open;
+    }
+    // The exit status; tells what is wrong.
+    [[nodiscard]] int end()
+    {
+        flush();
+        if (_descriptor.state() != OutputDescriptor::State::Failed)
+            return 0;
+        complain(std::string("standard output cannot be written: ") + _descriptor.failure() +
+                 "; send it somewhere else");
+        return kFailure;
+    }
+
+private:
+    static constexpr std::size_t kPiece = 65536;
+
+    OutputDescriptor _descriptor{STDOUT_FILENO};
+    std::string _pending;
+};
+
+std::unique_ptr<RowWriter> makeWriter(ExportFormat format, RowWriter::Output output)
+{
+    switch (format) {
+    case ExportFormat::Csv:
+        return std::make_unique<CsvRowWriter>(std::move(output));
+    case ExportFormat::PathList:
+        return std::make_unique<PathListWriter>(std::move(output));
+    case ExportFormat::JsonLines:
+        break;
+    }
+    return std::make_unique<JsonRowWriter>(std::move(output));
+}
+
+// Standard error is a terminal, and standard output does not write on the same one.
+bool canShowProgress()
+{
+    struct stat error {
+    };
+    struct stat output {
+    };
+    if (!isatty(STDERR_FILENO) || fstat(STDERR_FILENO, &error) != 0)
+        return false;
+    return !isatty(STDOUT_FILENO) || fstat(STDOUT_FILENO, &output) != 0 ||
+           output.st_rdev != error.st_rdev;
+}
+
+// Returns the exit status.
+int exportRecording(const ExportOptions& options)
+{
+    Output output;
+    const auto writer = makeWriter(
+        options.format, [&output](std::string_view lines) { return output.write(lines); });
+    std::optional<ProgressLine> progress;
+    if (canShowProgress())
+        progress.emplace("Reading " + options.request.file, [](std::string_view text) {
+            std::fwrite(text.data(), 1, text.size(), stderr);
+        });
+    RecordingExport recordingExport(options.request, *writer, [&progress](double done) {
+        if (progress)
+            progress->show(done);
+    });
+    const auto problem = recordingExport.run();
+    progress.reset();
+    if (problem)
+        complain(*problem);
+    const int status = output.end();
+    return problem ? kFailure : status;
+}
+
+} // namespace
+
+int runExport(std::span<const std::string> arguments)
+{
+    const ExportOptions options = parseExportOptions(arguments);
+    if (options.error) {
+        complain(*options.error);
+        return kUnusableArguments;
+    }
+    if (options.wantsHelp) {
+        std::fputs(exportHelp().c_str(), stdout);
+        return 0;
+    }
+    const ProgramServices services(options.log.get());
+    try {
+        return exportRecording(options);
+    } catch (const std::exception& failure) {
+        complain(failure.what());
+        return kFailure;
+    }
+}
+
+} // namespace orvane

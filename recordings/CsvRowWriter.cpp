@@ -1,0 +1,112 @@
+#include "recordings/CsvRowWriter.h"
+
+#include "platform/Utf8.h"
+
+#include <cstring>
+
+namespace orvane
+{
+
+namespace
+{
+
+// A period in the spool: its time, the changes (index of the row, kThere and its text, or kGone),
+// kEnd.
+constexpr std::uint32_t kEnd = UINT32_MAX;
+constexpr std::uint32_t kGone = 0;
+constexpr std::uint32_t kThere = 1;
+
+} // namespace
+
+bool CsvRowWriter::takePeriod(const std::string& time, const RowTable& table)
+{
+    _units.resize(table.rows().size());
+    _spool.putText(time);
+    for (std::size_t i = 0; i < table.rows().size(); ++i) {
+        const RowTable::Row& row = table.rows()[i];
+        if (!row.hasChanged)
+            continue;
+        _spool.putNumber(static_cast<std::uint32_t>(i));
+        if (table.isPresent(row)) {
+            const std::string text = shownText(row.text);
+            _units[i].take(text);
+            _spool.putNumber(kThere);
+            _spool.putText(text);
+        } else {
+            _spool.putNumber(kGone);
+        }
+    }
+    _spool.putNumber(kEnd);
+    return _spool.error() == 0;
+}
+
+std::optional<std::string> CsvRowWriter::finish(const RowTable& table)
+{
+    _units.resize(table.rows().size());
+    const std::vector<std::size_t> order = table.order();
+    _spool.rewind();
+    if (_spool.error() == 0 && _output(header(table, order)))
+        writeLines(order);
+    if (_spool.error() == 0)
+        return std::nullopt;
+    return std::string("the rows cannot be kept in the directory for temporary files (") +
+           std::strerror(_spool.error()) + "): set TMPDIR to one with room";
+}
+
+std::string CsvRowWriter::header(const RowTable& table, const std::vector<std::size_t>& order) const
+{
+    std::string line = "time";
+    for (const std::size_t row : order) {
+        std::string name = shownText(table.rows()[row].path);
+        if (const auto unit = _units[row].unit(); unit && !unit->empty())
+            ((name += " [") += *unit) += ']';
+        line += ',';
+        appendCsvField(line, name);
+    }
+    return line += '\n';
+}
+
+void CsvRowWriter::writeLines(const std::vector<std::size_t>& order)
+{
+    std::vector<std::string> texts(_units.size()); // empty where absent
+    std::string line;
+    while (_spool.text(line)) {
+        for (auto row = _spool.number(); row && *row < texts.size(); row = _spool.number()) {
+            std::string& text = texts[*row];
+            if (_spool.number() == kThere)
+                _spool.text(text);
+            else
+                text.clear();
+        }
+        for (const std::size_t row : order) {
+            line += ',';
+            appendCsvField(line, field(row, texts[row]));
+        }
+        line += '\n';
+        if (_spool.error() != 0 || !_output(line))
+            return;
+    }
+}
+
+std::string_view CsvRowWriter::field(std::size_t row, const std::string& text) const
+{
+    const auto parts = _units[row].unit() ? numberWithUnit(text) : std::nullopt;
+    return parts ? parts->number : std::string_view(text);
+}
+
+void appendCsvField(std::string& to, std::string_view text)
+{
+    if (text.find_first_of(",\"\r\n") == std::string_view::npos) {
+        to += text;
+        return;
+    }
+    to += '"';
+    for (const char character : text) {
+        if (character == '"')
+            to += '"';
+        to += character;
+    }
+    to += '"';
+}
+
+} // namespace orvane

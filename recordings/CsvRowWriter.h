@@ -1,0 +1,40 @@
+#pragma once
+
+#include "recordings/NumberWithUnit.h"
+#include "recordings/RowSpool.h"
+#include "recordings/RowWriter.h"
+
+#include <vector>
+
+namespace orvane
+{
+
+// One line a period behind a header: the time, then a column a row, empty where it is absent. Where
+// all texts of a column are numbers of one unit it holds the numbers, and its header "PATH [UNIT]"
+// (or PATH where they have none); otherwise the texts as shown on one line. Fields are quoted as
+// RFC 4180 says; lines end with a line feed.
+//
+// As the header comes first and is known last, the changes of the rows are put aside on disk.
+class CsvRowWriter final : public RowWriter
+{
+public:
+    explicit CsvRowWriter(Output output) : _output(std::move(output)) {}
+
+    bool takePeriod(const std::string& time, const RowTable& table) override;
+    std::optional<std::string> finish(const RowTable& table) override;
+
+private:
+    [[nodiscard]] std::string header(const RowTable& table,
+                                     const std::vector<std::size_t>& order) const;
+    [[nodiscard]] std::string_view field(std::size_t row, const std::string& text) const;
+    void writeLines(const std::vector<std::size_t>& order);
+
+    Output _output;
+    RowSpool _spool;
+    std::vector<CommonUnit> _units; // by row
+};
+
+// Appends the text as a field: in quotation marks where it holds one, a comma or a line's end.
+void appendCsvField(std::string& to, std::string_view text);
+
+} // namespace orvane

@@ -1,0 +1,25 @@
+#include "recordings/JsonRowWriter.h"
+
+#include "ui/output/JsonPane.h"
+
+namespace orvane
+{
+
+bool JsonRowWriter::takePeriod(const std::string& time, const RowTable& table)
+{
+    _line = "{\"time\":";
+    appendJsonString(_line, time);
+    for (const std::size_t i : table.order()) {
+        const RowTable::Row& row = table.rows()[i];
+        if (!table.isPresent(row))
+            continue;
+        _line += ',';
+        appendJsonString(_line, row.path);
+        _line += ':';
+        appendJsonString(_line, row.text);
+    }
+    _line += "}\n";
+    return _output(_line);
+}
+
+} // namespace orvane

@@ -1,0 +1,18 @@
+#include "recordings/PathListWriter.h"
+
+#include "platform/Utf8.h"
+
+namespace orvane
+{
+
+std::optional<std::string> PathListWriter::finish(const RowTable& table)
+{
+    for (const std::size_t i : table.order()) {
+        const RowTable::Row& row = table.rows()[i];
+        if (row.lastPeriod != 0 && !_output(shownText(row.path) + "\n"))
+            break;
+    }
+    return std::nullopt;
+}
+
+} // namespace orvane

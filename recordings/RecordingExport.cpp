@@ -1,0 +1,94 @@
+#include "recordings/RecordingExport.h"
+
+#include "LogGenerator/DlfTime.h"
+#include "platform/Console.h"
+#include "recordings/LogSurvey.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+RecordingExport::RecordingExport(ExportRequest request, RowWriter& writer, Progress progress)
+    : _request(std::move(request)), _writer(writer), _progress(std::move(progress)),
+      _table(_request.paths)
+{
+}
+
+std::optional<std::string> RecordingExport::run()
+{
+    const OpenedRecording recording = openRecording(_request.file);
+    if (recording.error)
+        return recording.error;
+    if (recording.snapshot)
+        takeEntries(*recording.snapshot);
+    else if (auto problem = takeLog(recording.log))
+        return problem;
+    return finish();
+}
+
+std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSource>& log)
+{
+    std::optional<std::string> technology = _request.technology;
+    if (!technology) {
+        LogSurvey survey(log);
+        while (survey.takeSlice()) {
+        }
+        technology = survey.technology();
+        if (!technology)
+            return survey.complaint(_request.file);
+    }
+    RefreshPeriods periods(log, *technology, _request.period);
+    const DlfReader& reader = periods.play().reader();
+    while (_isReadOn && takeSlice(periods))
+        _progress(static_cast<double>(reader.position()) / static_cast<double>(log->size()));
+    _progress(1);
+    if (const std::string remark = unplacedRemark(reader); _isReadOn && !remark.empty())
+        consoleLine("%s", remark.c_str());
+    return std::nullopt;
+}
+
+// False at the end.
+bool RecordingExport::takeSlice(RefreshPeriods& periods)
+{
+    const auto reached = periods.takeSlice();
+    if (reached == RefreshPeriods::Reached::Period)
+        take(periods.play().clock().isoText(periods.time()), periods.play().display());
+    return reached != RefreshPeriods::Reached::End;
+}
+
+void RecordingExport::takeEntries(const Snapshot& snapshot)
+{
+    for (const Snapshot::Entry& entry : snapshot.entries) {
+        if (!entry.display || !_isReadOn)
+            continue;
+        std::string time;
+        if (entry.secondsOfDate)
+            time = LogClock(dlfTimestamp(static_cast<double>(*entry.secondsOfDate)))
+                       .isoText(LogTime(0));
+        take(time, entry.display);
+    }
+}
+
+void RecordingExport::take(const std::string& time, const PropertyValue& display)
+{
+    _table.take(display);
+    _isReadOn = _writer.takePeriod(time, _table);
+}
+
+std::optional<std::string> RecordingExport::finish()
+{
+    const std::vector<std::string> missing = _table.missingPaths();
+    if (_isReadOn && missing.size() == _request.paths.size() && !missing.empty())
+        return "nothing in \"" + _request.file + "\" has the path \"" + missing.front() +
+               "\": see orvane export --list for those that occur";
+    if (auto problem = _writer.finish(_table))
+        return problem;
+    for (const std::string& path : missing)
+        if (_isReadOn)
+            consoleLine("Nothing in \"%s\" has the path \"%s\".", _request.file.c_str(),
+                        path.c_str());
+    return std::nullopt;
+}
+
+} // namespace orvane

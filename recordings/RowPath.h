@@ -1,0 +1,34 @@
+#pragma once
+
+#include "platform/PropertyValue.h"
+
+#include <functional>
+#include <string>
+#include <string_view>
+
+namespace orvane
+{
+
+// Takes a row: its path in the display tree, and its text. Of rows with one path the later counts.
+using RowVisitor = std::function<void(std::string_view path, const std::string& text)>;
+
+// What a person names rows by: the path of a row, or of a group, which stands for all the rows in
+// it, "/" for every row. "*" stands for any name at its place, for the elements of a list as a
+// rule.
+class RowPath
+{
+public:
+    // Slashes that are missing at the start, doubled or trailing do not matter.
+    explicit RowPath(std::string_view text);
+
+    [[nodiscard]] const std::string& text() const { return _text; }
+    // Whether it has a "*".
+    [[nodiscard]] bool isPattern() const;
+    // Visits the rows of the display that it stands for, in the order shown.
+    void forEachRow(const PropertyValue& display, const RowVisitor& visit) const;
+
+private:
+    std::string _text;
+};
+
+} // namespace orvane

@@ -1,0 +1,62 @@
+#pragma once
+
+#include "recordings/RowPath.h"
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+namespace orvane
+{
+
+// The rows of a recording that were asked for: which there are, and what they show at the end of
+// the period that was taken last.
+class RowTable
+{
+public:
+    struct Row {
+        std::string path;
+        std::string text;
+        std::uint64_t lastPeriod = 0; // the last one that it was there in; 0 for none so far
+        bool hasChanged = false;      // came, went or shows another text than in the period before
+    };
+
+    // Without paths, every row.
+    explicit RowTable(const std::vector<std::string>& paths);
+
+    // Takes the display at the end of the next period.
+    void take(const PropertyValue& display);
+
+    // In the order in which they were found. An index stays a row's own.
+    [[nodiscard]] const std::vector<Row>& rows() const { return _rows; }
+    [[nodiscard]] bool isPresent(const Row& row) const { return row.lastPeriod == _period; }
+    // Indices of the rows in the order of the paths that were asked for, those of a pattern or a
+    // group as they are shown. A path without "*" is a row of its own also where it never occurred.
+    [[nodiscard]] std::vector<std::size_t> order() const;
+    // The paths that were asked for and did not occur.
+    [[nodiscard]] std::vector<std::string> missingPaths() const;
+
+private:
+    static constexpr std::size_t kNoRow = SIZE_MAX;
+    struct Asked {
+        RowPath path;
+        std::size_t row = kNoRow; // of its own, unless it is a pattern
+        bool hasOccurred = false;
+    };
+
+    void note(Asked& asked, std::string_view path, const std::string& text);
+    [[nodiscard]] std::size_t rowAt(const Asked& asked, std::string_view path);
+    std::size_t add(std::string_view path);
+
+    std::vector<Asked> _asked;
+    std::vector<Row> _rows;
+    std::unordered_map<std::string, std::size_t> _indices; // by path
+    std::vector<std::size_t> _followers;                   // the row met next, the last time
+    std::vector<std::size_t> _order;
+    std::size_t _previous = kNoRow; // the row that was met last in this period
+    std::uint64_t _period = 0;
+};
+
+} // namespace orvane
