@@ -1,12 +1,9 @@
 #include "app/AppOptions.h"
 #include "app/ExportOptions.h"
-#include "app/ExportOptions.h"
 #include "app/OrvaneApp.h"
 #include "app/program/Display.h"
 #include "app/program/ExportProgram.h"
-#include "app/program/ExportProgram.h"
 #include "app/program/FrontEnd.h"
-#include "app/program/ProgramServices.h"
 #include "app/program/ProgramServices.h"
 #include "app/program/SimulatedPhone.h"
 #include "app/program/TerminalFrontEnd.h"
@@ -125,8 +122,6 @@ int main(int argc, char** argv)
 {
     prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-    if (!arguments.empty() && arguments.front() == kExportCommand)
-        return runExport(std::span(arguments).subspan(1));
     if (!arguments.empty() && arguments.front() == kExportCommand)
         return runExport(std::span(arguments).subspan(1));
     const std::vector<std::string> scenarios = scenarioNames();
