@@ -33,7 +33,7 @@ AlertWidget::AlertWidget(QWidget* parent, std::function<void()> dismiss)
       _message(makeLabel(&card(), Font::system(15))), _button(new FlatButton(&card()))
 {
     auto* column = new QVBoxLayout(&card());
-    column->setContentsMargins(20, 20, 20, 8);
+    column->setContentsMargins(20, 24, 20, 10);
     column->setSpacing(8);
     column->addWidget(_title);
     column->addWidget(_message);

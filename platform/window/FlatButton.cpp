@@ -81,8 +81,8 @@ void FlatButton::paintEvent(QPaintEvent*)
 
 void FlatButton::focusInEvent(QFocusEvent* event)
 {
-    // For those who use the keyboard; a press shows itself.
-    _hasRing = event->reason() != Qt::MouseFocusReason;
+    // For those who come with the keyboard.
+    _hasRing = event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason;
     QAbstractButton::focusInEvent(event);
 }
 

@@ -63,7 +63,7 @@ void Overlay::paintEvent(QPaintEvent*)
     painter.fillRect(rect(), theme.shade);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(Qt::NoPen);
-    painter.setBrush(theme.card);
+    painter.setBrush(theme.background);
     painter.drawRoundedRect(_card->geometry(), kRadius, kRadius);
 }
 

@@ -1,6 +1,7 @@
 #include "platform/window/PlaybackBar.h"
 
 #include "platform/toolkit/Playback.h"
+#include "platform/toolkit/Screen.h"
 #include "platform/window/FlatButton.h"
 #include "platform/window/Fonts.h"
 #include "platform/window/TextLine.h"
@@ -49,8 +50,8 @@ QString controlStyle(const Theme& theme)
 
 } // namespace
 
-PlaybackBar::PlaybackBar(QWidget* parent)
-    : QWidget(parent), _remark(new TextLine(this)), _reading(makeReading()),
+PlaybackBar::PlaybackBar(QWidget* parent, const Screen& screen)
+    : QWidget(parent), _screen(screen), _remark(new TextLine(this)), _reading(makeReading()),
       _controls(makeControls())
 {
     hide();
@@ -58,7 +59,7 @@ PlaybackBar::PlaybackBar(QWidget* parent)
     _remark->setQuiet(true);
     _remark->setFixedHeight(26);
     auto* column = new QVBoxLayout(this);
-    column->setContentsMargins(8, 1, 8, 0);
+    column->setContentsMargins(4, 1, 4, 0);
     column->setSpacing(0);
     column->addWidget(_remark);
     column->addWidget(_reading);
@@ -106,7 +107,7 @@ QWidget* PlaybackBar::makeControls()
     connect(_time, &QLineEdit::returnPressed, this, [this] { jumpToTyped(); });
 
     auto* upper = new QHBoxLayout;
-    upper->setContentsMargins(6, 0, 0, 0);
+    upper->setContentsMargins(10, 0, 6, 0);
     upper->setSpacing(10);
     upper->addWidget(_slider, 1);
     upper->addWidget(_time);
@@ -147,56 +148,59 @@ FlatButton* PlaybackBar::makeButton(QWidget* parent, Sign sign, const QString& n
     button->setSign(sign);
     button->setName(name);
     connect(button, &QAbstractButton::clicked, this, [this, button, action] {
-        if (!_playback)
+        Playback* playback = _screen.playback();
+        if (!playback)
             return;
-        if (button == _play && _playback->isPlaying())
-            _playback->pause();
+        if (button == _play && playback->isPlaying())
+            playback->pause();
         else
-            (_playback->*action)();
+            (playback->*action)();
     });
     return button;
 }
 
-void PlaybackBar::sync(Playback* playback)
+void PlaybackBar::sync()
 {
-    _playback = playback;
-    setVisible(_playback != nullptr);
-    if (!_playback)
+    const Playback* playback = _screen.playback();
+    setVisible(playback != nullptr);
+    if (!playback)
         return;
-    const QString remark = QString::fromStdString(_playback->remark());
+    const QString remark = QString::fromStdString(playback->remark());
     _remark->setText(remark);
     _remark->setToolTip(remark);
     _remark->setVisible(!remark.isEmpty());
-    const double progress = _playback->progress();
+    const double progress = playback->progress();
     _reading->setVisible(progress < 1);
     _controls->setVisible(progress >= 1);
     if (progress < 1)
         return _progress->setValue(static_cast<int>(progress * kProgressSteps));
 
-    _play->setSign(_playback->isPlaying() ? Sign::Pause : Sign::Play);
-    _play->setName(_playback->isPlaying() ? tr("Pause") : tr("Play"));
-    _speed->setText(QString::number(_playback->speed()) + QChar(0xD7));
+    _play->setSign(playback->isPlaying() ? Sign::Pause : Sign::Play);
+    _play->setName(playback->isPlaying() ? tr("Pause") : tr("Play"));
+    _speed->setText(QString::number(playback->speed()) + QChar(0xD7));
     _speed->setToolTip(tr("Seconds of the recording a second"));
     showTime();
     if (_slider->isSliderDown())
         return;
     const QSignalBlocker block(_slider);
-    const double duration = _playback->duration();
-    const double part = duration > 0 ? _playback->position() / duration : 0;
+    const double duration = playback->duration();
+    const double part = duration > 0 ? playback->position() / duration : 0;
     _slider->setValue(static_cast<int>(std::lround(std::clamp(part, 0.0, 1.0) * kSliderSteps)));
 }
 
 void PlaybackBar::showTime()
 {
     // Not while somebody types another.
-    const QString time = QString::fromStdString(_playback->positionText());
+    const Playback* playback = _screen.playback();
+    const QString time = QString::fromStdString(playback ? playback->positionText() : "");
     if (!_time->hasFocus() && _time->text() != time)
         _time->setText(time);
 }
 
 void PlaybackBar::jumpToTyped()
 {
-    const bool isUsable = _playback && _playback->jumpToText(_time->text().toStdString());
+    Playback* playback = _screen.playback();
+    const bool isUsable = playback && playback->jumpToText(_time->text().toStdString());
     _time->setProperty("isWrong", !isUsable);
     applyTheme();
     if (isUsable)
@@ -205,8 +209,8 @@ void PlaybackBar::jumpToTyped()
 
 void PlaybackBar::jumpToSlider(int value)
 {
-    if (_playback)
-        _playback->jumpTo(_playback->duration() * value / kSliderSteps);
+    if (Playback* playback = _screen.playback())
+        playback->jumpTo(playback->duration() * value / kSliderSteps);
 }
 
 bool PlaybackBar::eventFilter(QObject*, QEvent* event)
@@ -216,8 +220,7 @@ bool PlaybackBar::eventFilter(QObject*, QEvent* event)
         _time->clear();
     if (event->type() == QEvent::FocusOut) {
         _time->setProperty("isWrong", false);
-        if (_playback)
-            _time->setText(QString::fromStdString(_playback->positionText()));
+        showTime();
         applyTheme();
     }
     return false;

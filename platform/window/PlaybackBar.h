@@ -13,6 +13,7 @@ namespace orvane
 
 class FlatButton;
 class Playback;
+class Screen;
 class TextLine;
 
 // The controls of a recording: while it is read, how far that is and a button that stops it; then
@@ -20,10 +21,11 @@ class TextLine;
 class PlaybackBar final : public QWidget
 {
 public:
-    explicit PlaybackBar(QWidget* parent);
+    // For the recording of the screen, which must outlive it.
+    PlaybackBar(QWidget* parent, const Screen& screen);
 
-    // Null for none. Not owned; used until another call.
-    void sync(Playback* playback);
+    // Shows the recording as it is now; touches only what has changed.
+    void sync();
 
     [[nodiscard]] QSlider& slider() const { return *_slider; }
     [[nodiscard]] QLineEdit& timeField() const { return *_time; }
@@ -48,16 +50,17 @@ private:
     void showTime();
     void applyTheme();
 
-    Playback* _playback = nullptr;
+    const Screen& _screen;
     TextLine* _remark; // children
-    QWidget* _reading;
     QProgressBar* _progress = nullptr;
     FlatButton* _stop = nullptr;
-    QWidget* _controls;
     QSlider* _slider = nullptr;
     QLineEdit* _time = nullptr;
     FlatButton* _play = nullptr;
     TextLine* _speed = nullptr;
+    // Made last, of those above.
+    QWidget* _reading;
+    QWidget* _controls;
 };
 
 } // namespace orvane

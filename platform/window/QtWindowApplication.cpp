@@ -1,6 +1,7 @@
 #include "platform/window/QtWindowApplication.h"
 
 #include "platform/SystemLog.h"
+#include "platform/window/Accessibility.h"
 
 #include <QApplication>
 
@@ -50,6 +51,7 @@ QtWindowApplication::QtWindowApplication() : _parts(std::make_unique<Parts>())
     QGuiApplication::setDesktopFileName(QStringLiteral("orvane"));
     // The program decides when it ends.
     QGuiApplication::setQuitOnLastWindowClosed(false);
+    installAccessibility();
 }
 
 QtWindowApplication::~QtWindowApplication() = default;

@@ -100,7 +100,8 @@ void RowWidget::paintEvent(QPaintEvent*)
         drawFocusRing(painter, rect(), 6, theme.accent);
 }
 
-void RowWidget::drawStrip(QPainter& painter, const DrawnStrip& strip, const QColor& background) const
+void RowWidget::drawStrip(QPainter& painter, const DrawnStrip& strip,
+                          const QColor& background) const
 {
     const QRectF shown = strip.frame.intersected(QRectF(0, 0, width(), height() - 1));
     painter.save();

@@ -78,9 +78,10 @@ void SheetWidget::applyTheme()
         QStringLiteral("QLineEdit { background: %1; color: %2; border: 1px solid %3;"
                        " border-radius: 8px; padding: 0 12px; }"
                        "QLineEdit:focus { border: 2px solid %4; padding: 0 11px; }"
-                       "QLabel { color: %2; }")
-            .arg(theme.background.name(), theme.text.name(), theme.line.name(),
-                 theme.accent.name());
+                       "QLabel { color: %2; }"
+                       "QLabel#captionLabel { color: %5; }")
+            .arg(theme.background.name(), theme.text.name(), theme.line.name(), theme.accent.name(),
+                 theme.quietText.name());
     if (card().styleSheet() != style)
         card().setStyleSheet(style);
 }

@@ -9,9 +9,8 @@ namespace orvane
 
 // The colours of the window, light or dark as the desktop's own palette is.
 struct Theme {
-    QColor background; // behind rows
+    QColor background; // behind rows and on cards
     QColor bar;        // behind the title, the toolbar and the playback controls
-    QColor card;       // behind the save screen and the alert
     QColor shade;      // over what a card covers
     QColor text;
     QColor quietText;

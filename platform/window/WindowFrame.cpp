@@ -43,7 +43,7 @@ WindowFrame::WindowFrame(Screen& screen, Settings settings)
     : _screen(screen), _settings(std::move(settings)),
       _titleBar(new TitleBar(this, _settings.mark, [this] { goBack(); })),
       _deck(new PaneDeck(this, _settings.waitingHint, _settings.isAnimated, [this] { goBack(); })),
-      _playback(new PlaybackBar(this)),
+      _playback(new PlaybackBar(this, screen)),
       _toolbar(new ToolbarWidget(this, [this](std::size_t index) { pressToolbarItem(index); })),
       _sheet(new SheetWidget(this)),
       _alert(new AlertWidget(this, [this] { _screen.dismissAlert(); }))
@@ -90,7 +90,7 @@ void WindowFrame::sync(const std::function<UiInterface*(const View*)>& findInter
     _toolbar->setVisible(stack && !stack->isToolbarHidden());
     if (stack && stack->topViewController())
         _toolbar->sync(stack->topViewController()->toolbarItems());
-    _playback->sync(_screen.playback());
+    _playback->sync();
     layout()->activate();
     _deck->sync(stack);
     UiInterface* modal = stack ? findInterface(frontModalView(*stack)) : nullptr;

@@ -1,0 +1,270 @@
+#include "platform/PropertyList.h"
+#include "platform/window/AlertWidget.h"
+#include "platform/window/FlatButton.h"
+#include "platform/window/SheetWidget.h"
+#include "platform/window/ToolbarWidget.h"
+#include "platform/window/UiInterface.h"
+#include "ui/SnapshotFile.h"
+#include "window/WindowTest.h"
+
+#include <QInputMethodEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QTest>
+
+#include <filesystem>
+
+namespace orvane
+{
+
+namespace
+{
+
+class SaveScreenTest : public WindowTest
+{
+protected:
+    SaveScreenTest()
+    {
+        for (const char* description : {"Current", "Snapshot (2026-11-21 10:00:00 +0000)"}) {
+            const PropertyValue entry = PropertyValue::newDictionary();
+            entry.asDictionary()->set("Description", description);
+            saveContents.asArray()->append(entry);
+        }
+        show(rootNode({valueNode("Technology", "LTE")}));
+    }
+
+    void open()
+    {
+        showSaveView();
+        turnEvents();
+    }
+    void makeLogFolder() const { std::filesystem::create_directories(files().located(kLogFolder)); }
+    [[nodiscard]] std::vector<std::string> savedFiles() const
+    {
+        std::vector<std::string> paths;
+        for (const auto& entry : std::filesystem::directory_iterator(files().located(kLogFolder)))
+            paths.push_back(entry.path().string());
+        return paths;
+    }
+    template <typename Widget>
+    [[nodiscard]] Widget* part(const char* name) const
+    {
+        const UiInterface* interface = frame().sheet().interface();
+        return interface ? dynamic_cast<Widget*>(
+                               interface->widget().findChild<QWidget*>(QLatin1String(name)))
+                         : nullptr;
+    }
+    [[nodiscard]] QLineEdit& field() const { return *part<QLineEdit>("saveDescription"); }
+    void click(const char* button)
+    {
+        QTest::mouseClick(part<FlatButton>(button), Qt::LeftButton);
+        queue.runPending();
+        turnEvents();
+    }
+    void type(const QString& text) { QTest::keyClicks(&field(), text); }
+    [[nodiscard]] bool isOpen() const { return frame().sheet().isVisible(); }
+};
+
+TEST_F(SaveScreenTest, OpensFromTheToolbar)
+{
+    auto* button = dynamic_cast<FlatButton*>(frame().toolbar().itemWidget(3));
+    ASSERT_TRUE(button);
+    EXPECT_EQ(button->text(), "Save");
+    QTest::mouseClick(button, Qt::LeftButton);
+    turnEvents();
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, OpensWithControlS)
+{
+    QTest::keyClick(&table(), Qt::Key_S, Qt::ControlModifier);
+    turnEvents();
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, ListsWhatIsSavedWithCheckMarks)
+{
+    open();
+    auto* entries = part<TableWidget>("saveContentTable");
+    ASSERT_TRUE(entries);
+    ASSERT_EQ(entries->rowCount(), 2U);
+    EXPECT_EQ(entries->rowWidget(0)->accessibleName(), "Current");
+    EXPECT_EQ(entries->rowWidget(0)->content().accessory, CellAccessory::Checkmark);
+    EXPECT_EQ(entries->rowWidget(0)->content().labels.front().alignment & Qt::AlignHorizontal_Mask,
+              Qt::AlignLeft);
+    EXPECT_EQ(field().placeholderText(), "Description");
+}
+
+TEST_F(SaveScreenTest, SavedFileHoldsTheTypedDescription)
+{
+    makeLogFolder();
+    open();
+    field().setFocus();
+    type("by the river");
+    EXPECT_EQ(saveScreen()->saveDescription()->text(), "by the river");
+    click("saveButton");
+    EXPECT_FALSE(isOpen());
+    ASSERT_EQ(savedFiles().size(), 1U);
+    const auto content = readFile(savedFiles().front());
+    ASSERT_TRUE(content);
+    const PropertyValue snapshot = readPropertyList(*content).value;
+    ASSERT_TRUE(snapshot.asDictionary());
+    EXPECT_EQ(*(*snapshot.asDictionary())["Description"].asString(), "by the river");
+    EXPECT_EQ((*snapshot.asDictionary())["Data"].asArray()->size(), 2U);
+}
+
+TEST_F(SaveScreenTest, WithoutAFolderTheAlertStaysAndTheScreenGoes)
+{
+    open();
+    click("saveButton");
+    EXPECT_FALSE(isOpen());
+    ASSERT_TRUE(frame().alert().isVisible());
+    QStringList texts;
+    for (const QLabel* label : frame().alert().findChildren<QLabel*>())
+        texts += label->text();
+    EXPECT_TRUE(texts.contains("File Error"));
+    EXPECT_TRUE(texts.contains("Unable to write file to disk"));
+    EXPECT_EQ(frame().alert().button().text(), "Close");
+    QTest::mouseClick(&frame().alert().button(), Qt::LeftButton);
+    turnEvents();
+    EXPECT_FALSE(frame().alert().isVisible());
+}
+
+TEST_F(SaveScreenTest, EscapeAnswersTheAlertAndThenCancels)
+{
+    open();
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    QTest::keyClick(&frame().alert().button(), Qt::Key_Escape);
+    turnEvents();
+    EXPECT_FALSE(frame().alert().isVisible());
+    EXPECT_TRUE(isOpen());
+    QTest::keyClick(&frame(), Qt::Key_Escape);
+    queue.runPending();
+    turnEvents();
+    EXPECT_FALSE(isOpen());
+    EXPECT_FALSE(saveScreen());
+}
+
+TEST_F(SaveScreenTest, EnterPressesTheAlertsButton)
+{
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    EXPECT_EQ(frame().focusWidget(), &frame().alert().button());
+    QTest::keyClick(&frame().alert().button(), Qt::Key_Space);
+    turnEvents();
+    EXPECT_FALSE(frame().alert().isVisible());
+    EXPECT_EQ(frame().focusWidget(), &table()) << "the keyboard is the pane's again";
+}
+
+TEST_F(SaveScreenTest, CancelWritesNothing)
+{
+    makeLogFolder();
+    open();
+    click("cancelButton");
+    EXPECT_FALSE(isOpen());
+    EXPECT_TRUE(savedFiles().empty());
+}
+
+TEST_F(SaveScreenTest, InputMethodTypesTheDescription)
+{
+    open();
+    field().setFocus();
+    QInputMethodEvent composing(QStringLiteral("mün"), {});
+    QCoreApplication::sendEvent(&field(), &composing);
+    EXPECT_EQ(saveScreen()->saveDescription()->text(), "");
+    QInputMethodEvent done;
+    done.setCommitString(QStringLiteral("münchen 中"));
+    QCoreApplication::sendEvent(&field(), &done);
+    EXPECT_EQ(saveScreen()->saveDescription()->text(), "münchen 中");
+}
+
+TEST_F(SaveScreenTest, RefreshDisturbsNoTyping)
+{
+    open();
+    field().setFocus();
+    type("abc");
+    field().setCursorPosition(1);
+    QInputMethodEvent composing(QStringLiteral("x"), {});
+    QCoreApplication::sendEvent(&field(), &composing);
+    refresh(rootNode({valueNode("Technology", "UMTS")}));
+    setStatus("Updated", false);
+    EXPECT_EQ(field().text(), "abc");
+    EXPECT_EQ(frame().focusWidget(), &field());
+    QInputMethodEvent done;
+    done.setCommitString(QStringLiteral("x"));
+    QCoreApplication::sendEvent(&field(), &done);
+    EXPECT_EQ(field().text(), "axbc") << "composed where the cursor was";
+}
+
+TEST_F(SaveScreenTest, ReturnGivesTheKeyboardBack)
+{
+    open();
+    field().setFocus();
+    turnEvents();
+    EXPECT_TRUE(saveScreen()->saveDescription()->isFirstResponder());
+    QTest::keyClick(&field(), Qt::Key_Return);
+    turnEvents();
+    EXPECT_FALSE(saveScreen()->saveDescription()->isFirstResponder());
+    EXPECT_NE(frame().focusWidget(), &field());
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, PressBesideEverythingGivesTheKeyboardBack)
+{
+    open();
+    field().setFocus();
+    turnEvents();
+    auto* caption = part<QLabel>("captionLabel");
+    ASSERT_TRUE(caption);
+    QTest::mouseClick(caption, Qt::LeftButton);
+    turnEvents();
+    EXPECT_NE(frame().focusWidget(), &field());
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, PanesBeneathAreOutOfReach)
+{
+    open();
+    field().setFocus();
+    for (int i = 0; i < 8; ++i) {
+        QTest::keyClick(frame().focusWidget(), Qt::Key_Tab);
+        EXPECT_TRUE(frame().sheet().isAncestorOf(frame().focusWidget()));
+    }
+    QTest::keyClick(&frame(), Qt::Key_S, Qt::ControlModifier);
+    turnEvents();
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, OpensAnewAfterItWasClosed)
+{
+    open();
+    type("first");
+    click("cancelButton");
+    open();
+    EXPECT_TRUE(isOpen());
+    EXPECT_EQ(field().text(), "");
+}
+
+TEST_F(SaveScreenTest, MissingInterfaceFileIsTold)
+{
+    EXPECT_FALSE(screen.loadInterface("Nothing"));
+    ASSERT_EQ(services.log.errors().size(), 1U);
+    EXPECT_EQ(services.log.errors().front(), "There is no interface file \"Nothing.ui\"\n");
+}
+
+TEST_F(SaveScreenTest, MalformedInterfaceFileIsToldAndOpensNothing)
+{
+    Services::current().setResources(&services.memoryResources);
+    services.memoryResources.put("OrvaneSaveViewController.ui", "<ui><widget class=\"QWidget\"");
+    open();
+    EXPECT_FALSE(isOpen());
+    bool isTold = false;
+    for (const std::string& line : services.log.errors())
+        isTold |= line.starts_with("The interface file \"OrvaneSaveViewController.ui\"");
+    EXPECT_TRUE(isTold);
+}
+
+} // namespace
+
+} // namespace orvane
