@@ -47,7 +47,7 @@ public:
         _next = at + 1;
         if (at != _entries.size())
             return _entries[at].second;
-        _entries.emplace_back(std::string(key), V());
+        _entries.emplace_back(key, V());
         if (!_index.empty())
             _index.emplace(_entries.back().first, at);
         else if (_entries.size() >= kIndexedSize)

@@ -246,7 +246,7 @@ void PropertyDictionary::set(std::string_view key, PropertyValue value)
     _entries[key] = std::move(value);
 }
 
-void PropertyDictionary::setText(std::string_view key, std::string text)
+void PropertyDictionary::setText(std::string_view key, std::string&& text)
 {
     PropertyValue& value = _entries[key];
     if (std::string* present = value.asString())

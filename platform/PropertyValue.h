@@ -136,7 +136,7 @@ public:
     // programming error and throws std::invalid_argument.
     void set(std::string_view key, PropertyValue value);
     // The same for a text, which goes where the key's text is if it has one.
-    void setText(std::string_view key, std::string text);
+    void setText(std::string_view key, std::string&& text);
     void remove(std::string_view key) { _entries.remove(key); }
     void clear() { _entries.clear(); }
     // Makes room for that many entries in one go.
