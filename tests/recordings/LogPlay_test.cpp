@@ -1,0 +1,187 @@
+#include "recordings/LogPlay.h"
+
+#include "recordings/support/LiveView.h"
+#include "support/Recording.h"
+
+#include <gmock/gmock.h>
+
+#include <stdexcept>
+
+namespace orvane
+{
+namespace
+{
+
+using namespace std::chrono_literals;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+constexpr const char* kLte = kTSLogChannelTechnology_Varnel_LTE;
+
+class LogPlayTest : public ::testing::Test
+{
+protected:
+    LogPlayTest() { services.useShippedResources(); }
+
+    static void takeAll(LogPlay& play)
+    {
+        while (!play.isAtEnd()) {
+            play.lookAhead();
+            play.takeNext();
+        }
+    }
+
+    TestServices services;
+};
+
+TEST_F(LogPlayTest, EveryItemShowsWhatALiveViewWouldShow)
+{
+    for (const RecordedDrive& drive : kDrives) {
+        const LiveView live(recordedFile(drive.file), drive.technology);
+        LogPlay play(recordedLog(drive.file), drive.technology);
+        play.lookAhead();
+        for (const LiveView::Moment& moment : live.moments) {
+            ASSERT_TRUE(play.hasNext());
+            ASSERT_EQ(play.nextTime(), moment.time);
+            play.takeNext();
+            ASSERT_EQ(play.time(), moment.time);
+            ASSERT_EQ(play.display().description(), moment.display) << drive.file;
+        }
+        EXPECT_TRUE(play.isAtEnd());
+        EXPECT_EQ(play.itemsTaken(), live.moments.size());
+    }
+}
+
+TEST_F(LogPlayTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
+{
+    const auto log = LogBuilder()
+                         .measurement(0, 1) // no timestamp
+                         .measurement(kLogStart, 2)
+                         .measurement(kLogStart + 3 * kLogSecond, 3)
+                         .measurement(kLogStart + kLogSecond, 4)
+                         .measurement(0, 5)
+                         .measurement(kLogStart - 9 * kLogSecond, 6)
+                         .measurement(kLogStart + 4 * kLogSecond, 7)
+                         .source();
+    LogPlay play(log, kLte);
+    std::vector<LogTime> times;
+    play.lookAhead();
+    while (play.hasNext()) {
+        play.takeNext();
+        times.push_back(play.time());
+    }
+    EXPECT_THAT(times, ElementsAre(0s, 0s, 3s, 3s, 3s, 3s, 4s));
+    EXPECT_EQ(play.clock().isoText(play.time()), "2017-07-11T04:34:12.000Z");
+}
+
+TEST_F(LogPlayTest, NothingIsShownBeforeTheFirstItem)
+{
+    LogPlay play(LogBuilder().measurement(kLogStart, 1).source(), kLte);
+    EXPECT_FALSE(play.display());
+    EXPECT_FALSE(play.hasNext());
+    EXPECT_FALSE(play.isAtEnd());
+    play.takeNext(); // none was found yet
+    EXPECT_EQ(play.itemsTaken(), 0U);
+    takeAll(play);
+    EXPECT_TRUE(play.display());
+}
+
+TEST_F(LogPlayTest, ALogWithoutItemsIsAtItsEnd)
+{
+    LogPlay play(sourceOf({}), kLte);
+    EXPECT_TRUE(play.isAtEnd());
+    LogPlay foreign(sourceOf(Bytes(100, 0xED)), kLte);
+    takeAll(foreign);
+    EXPECT_EQ(foreign.itemsTaken(), 0U);
+    EXPECT_EQ(foreign.reader().unplacedBytes(), 100U);
+}
+
+TEST_F(LogPlayTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
+{
+    LogBuilder builder;
+    builder.measurement(kLogStart, 1);
+    builder.bytes.push_back(0xFF);                      // made by the server:
+    builder.item(1, kLogStart + kLogStep, Bytes(5, 1)); // a cell array that is none
+    builder.measurement(kLogStart + 2 * kLogStep, 2);
+    builder.bytes.push_back(0xFF);
+    builder.item(2, kLogStart + 3 * kLogStep, Bytes(5, 1)); // data connections that are none
+    builder.measurement(kLogStart + 4 * kLogStep, 3);
+    LogPlay play(builder.source(), kTSLogChannelTechnology_IFX);
+    play.setTellsErrors(true);
+    services.log.lines.clear();
+    takeAll(play); // every item is a message that this generator cannot read
+    EXPECT_EQ(play.itemsTaken(), 5U);
+    EXPECT_EQ(services.log.errors().size(), 5U);
+    EXPECT_THAT(services.log.errors().front(), testing::StartsWith("Dropping a message of 77 "));
+}
+
+TEST_F(LogPlayTest, OnlyErrorsAboutMessagesAreToldAndOnlyWhereTheyShall)
+{
+    services.log.lines.clear();
+    {
+        LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+        takeAll(play);
+    }
+    EXPECT_THAT(services.log.lines, IsEmpty());
+    LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+    play.setTellsErrors(true);
+    takeAll(play);
+    EXPECT_EQ(services.log.errors().size(), 24U);
+    EXPECT_EQ(services.log.lines.size(), 24U);
+    EXPECT_THAT(services.console.lines, IsEmpty());
+}
+
+TEST_F(LogPlayTest, ServingCellChangesAreCounted)
+{
+    LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+    takeAll(play);
+    EXPECT_EQ(play.servingCellChanges(), 24U); // the first one and 23 more
+}
+
+TEST_F(LogPlayTest, ServingCellsOfOneMomentCountAsTheLastOfThem)
+{
+    LogPlay play(LogBuilder()
+                     .servingCell(kLogStart, 1)
+                     .servingCell(kLogStart + kLogSecond, 2)
+                     .servingCell(kLogStart + kLogSecond, 1)
+                     .servingCell(kLogStart + 2 * kLogSecond, 3)
+                     .source(),
+                 kLte);
+    takeAll(play);
+    EXPECT_EQ(play.servingCellChanges(), 2U);
+}
+
+TEST_F(LogPlayTest, ARestoredPlayGoesOnFromAnyItemAsBefore)
+{
+    for (const RecordedDrive& drive : kDrives) {
+        const LiveView live(recordedFile(drive.file), drive.technology);
+        const auto log = recordedLog(drive.file);
+        LogPlay play(log, drive.technology);
+        LogPlay other(log, drive.technology);
+        play.lookAhead();
+        for (std::size_t i = 0; i < live.moments.size(); i += 1 + i % 5) {
+            while (play.itemsTaken() < i)
+                play.takeNext();
+            const LogPlay::Checkpoint checkpoint = play.checkpoint();
+            EXPECT_GT(checkpoint.bytes(), sizeof checkpoint);
+            other.restore(checkpoint);
+            ASSERT_EQ(other.itemsTaken(), i);
+            other.takeNext();
+            ASSERT_EQ(other.time(), live.moments[i].time);
+            ASSERT_EQ(other.display().description(), live.moments[i].display);
+        }
+        takeAll(play);
+        takeAll(other);
+        EXPECT_EQ(other.itemsTaken(), live.moments.size());
+        EXPECT_EQ(other.servingCellChanges(), play.servingCellChanges());
+        EXPECT_EQ(other.reader().unplacedBytes(), play.reader().unplacedBytes());
+    }
+}
+
+TEST_F(LogPlayTest, AnUnknownTechnologyIsRefused)
+{
+    EXPECT_THROW(LogPlay(sourceOf({}), "lte"), std::invalid_argument);
+}
+
+} // namespace
+} // namespace orvane
