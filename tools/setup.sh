@@ -7,7 +7,8 @@
 build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev qt6-tools-dev
     libqt6opengl6-dev)
 # shellcheck disable=SC2034
-check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev)
+check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev
+    libvterm-dev)
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -41,6 +42,7 @@ purpose_of() {
     libgtest-dev) echo "GoogleTest with its CMake package" ;;
     libgmock-dev) echo "GoogleMock with its CMake package" ;;
     libbenchmark-dev) echo "Google Benchmark with its CMake package" ;;
+    libvterm-dev) echo "libvterm with its headers, a terminal for tests" ;;
     gcovr) echo "gcovr" ;;
     esac
 }

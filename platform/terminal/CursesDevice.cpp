@@ -13,6 +13,7 @@
 #include <poll.h>
 #include <stdexcept>
 #include <sys/ioctl.h>
+#include <termios.h>
 #include <unistd.h>
 #include <vector>
 
@@ -58,7 +59,8 @@ SCREEN* startCurses()
 }
 
 // Ctrl-S must not stop the program for good, and no other key has a meaning of the terminal's own,
-// apart from those that send signals.
+// apart from those that end programs. Ctrl-Z is none of them: while ncurses writes it drops that
+// signal, which on a slow line would be most of the time.
 void takeModes()
 {
     cbreak();
@@ -70,6 +72,7 @@ void takeModes()
     if (::tcgetattr(STDIN_FILENO, &modes) == 0) {
         modes.c_iflag &= ~static_cast<tcflag_t>(IXON);
         modes.c_lflag &= ~static_cast<tcflag_t>(IEXTEN);
+        modes.c_cc[VSUSP] = _POSIX_VDISABLE;
         ::tcsetattr(STDIN_FILENO, TCSANOW, &modes);
     }
     def_prog_mode();
@@ -193,9 +196,10 @@ void CursesDevice::suspend()
     plain.sa_handler = SIG_DFL;
     struct sigaction earlier {
     };
-    // Not SIGSTOP: where nobody could let the process go on, the system ignores this one.
+    // All processes of the job, as Ctrl-Z does. Not SIGSTOP: where nobody could let them go on, the
+    // system ignores this one.
     ::sigaction(SIGTSTP, &plain, &earlier);
-    ::raise(SIGTSTP);
+    ::kill(0, SIGTSTP);
     ::sigaction(SIGTSTP, &earlier, nullptr);
     _state->guard.rememberModes();
     def_shell_mode();

@@ -24,7 +24,8 @@ constexpr auto kMarkTime = 5s;
 constexpr const char* kSimulated = "simulated phone";
 constexpr const char* kShortSimulated = "simulated"; // leaves more room for the path
 constexpr int kNarrow = 60;
-constexpr char32_t kRedraw = 'L' & 0x1F; // Ctrl-L
+constexpr char32_t kRedraw = 'L' & 0x1F;  // Ctrl-L
+constexpr char32_t kSuspend = 'Z' & 0x1F; // Ctrl-Z
 
 NavigationController* navigationOf(const Screen& screen)
 {
@@ -203,7 +204,9 @@ void TerminalScreen::inputIsReady()
 
 void TerminalScreen::take(const Key& key)
 {
-    if (!front().take(key) && &front() == &_stack)
+    if (key.kind == Key::Kind::Character && key.character == kSuspend)
+        _device.suspend();
+    else if (!front().take(key) && &front() == &_stack)
         takeCommand(key);
 }
 

@@ -35,7 +35,7 @@ public:
     void inputIsReady();
     // It has another size.
     void sizeHasChanged();
-    // Ctrl-Z was pressed; returns when the process goes on.
+    // The process is to stop, as by Ctrl-Z; returns when it goes on.
     void suspend();
     // The process goes on after it was stopped by somebody else.
     void wasContinued();

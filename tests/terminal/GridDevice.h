@@ -36,7 +36,7 @@ public:
         _lines = nextLines;
         _columns = nextColumns;
     }
-    void suspend() override {}
+    void suspend() override { ++suspensions; }
     void retake() override { ++retakes; }
 
     [[nodiscard]] std::string text(int line) const { return shown.text(line); }
@@ -65,6 +65,7 @@ public:
     int nextLines = 0;
     int nextColumns = 0;
     int retakes = 0;
+    int suspensions = 0;
 
 private:
     int _lines;

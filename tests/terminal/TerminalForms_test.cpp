@@ -145,6 +145,16 @@ TEST_F(TerminalFormsTest, EnterEndsTypingAndTheNextOneSaves)
     EXPECT_EQ(device.lineOf("File Error"), -1);
 }
 
+TEST_F(TerminalFormsTest, ControlZSuspendsWhateverIsInFront)
+{
+    press(keyOfCharacter('Z' & 0x1F));
+    EXPECT_EQ(device.suspensions, 1);
+    type("s");
+    press(keyOfCharacter('Z' & 0x1F));
+    EXPECT_EQ(device.suspensions, 2);
+    EXPECT_EQ(saveView->saveDescription()->text(), "");
+}
+
 TEST_F(TerminalFormsTest, TabGoesRoundAndEscapeCancels)
 {
     type("s");
