@@ -18,6 +18,7 @@ public:
 
     // Goes on for a slice of some milliseconds; false at the end of the log.
     bool takeSlice();
+    [[nodiscard]] std::uint64_t bytesRead() const { return _reader.position(); }
     // How much has been read, 0 to 1.
     [[nodiscard]] double progress() const;
 

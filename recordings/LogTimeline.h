@@ -22,6 +22,7 @@ public:
     // Reads on for some milliseconds; false once the log has been read. What decoders find wrong
     // with it is told in the process's log now, and never again.
     bool readSlice();
+    [[nodiscard]] std::uint64_t bytesRead() const { return _play.reader().position(); }
     // How much has been read, 0 to 1.
     [[nodiscard]] double progress() const;
     // What was read by now is the log.

@@ -60,14 +60,9 @@ void RecordingPlayer::read()
     if (_failure || isReady())
         return;
     if (_survey) {
-        if (!_survey->takeSlice()) {
-            if (const auto technology = _survey->technology())
-                beginReading(*technology);
-            else
-                _failure = _survey->complaint(_settings.name);
-            _survey.reset();
-        }
-    } else if (!_timeline->readSlice()) {
+        if (!_survey->takeSlice())
+            endSurvey();
+    } else if (!_timeline->readSlice() || _timeline->bytesRead() >= _bytesToRead) {
         endReading();
         return;
     }
@@ -76,19 +71,35 @@ void RecordingPlayer::read()
     tell();
 }
 
+void RecordingPlayer::endSurvey()
+{
+    if (const auto technology = _survey->technology())
+        beginReading(*technology);
+    else
+        _failure = _survey->complaint(_settings.name);
+    _survey.reset();
+}
+
 void RecordingPlayer::beginReading(const std::string& technology)
 {
     _timeline = std::make_unique<LogTimeline>(_log, technology);
 }
 
-void RecordingPlayer::endReading() { moveTo(_settings.refreshPeriod); }
+void RecordingPlayer::endReading()
+{
+    _timeline->stopReading();
+    moveTo(_settings.refreshPeriod);
+}
 
 void RecordingPlayer::stopReading()
 {
-    if (!_timeline || isReady())
-        return;
-    _timeline->stopReading();
-    endReading();
+    if (_survey) {
+        _bytesToRead = _survey->bytesRead();
+        endSurvey();
+        tell();
+    } else if (_timeline && !isReady()) {
+        endReading();
+    }
 }
 
 double RecordingPlayer::progress() const

@@ -69,6 +69,7 @@ public:
 private:
     void readLater();
     void read();
+    void endSurvey();
     void beginReading(const std::string& technology);
     void endReading();
     void startTimer();
@@ -85,6 +86,7 @@ private:
     std::optional<std::string> _failure;
     std::optional<LogSurvey> _survey;       // while the technology is sought
     std::unique_ptr<LogTimeline> _timeline; // from then on
+    std::uint64_t _bytesToRead = UINT64_MAX;
     NodePointer _nodes;
     PathDictionary _nodesByPath;
     std::unique_ptr<Timer> _timer; // while playing

@@ -1,0 +1,111 @@
+#include "recordings/LogSurvey.h"
+
+#include "LogGenerator/VersionReport.h"
+#include "recordings/support/LogFiles.h"
+#include "support/Recording.h"
+
+#include <gmock/gmock.h>
+
+namespace orvane
+{
+namespace
+{
+
+using testing::HasSubstr;
+
+class LogSurveyTest : public ::testing::Test
+{
+protected:
+    LogSurveyTest() { services.useShippedResources(); }
+
+    static LogSurvey read(std::shared_ptr<ByteSource> log)
+    {
+        LogSurvey survey(std::move(log));
+        while (survey.takeSlice()) {
+        }
+        return survey;
+    }
+
+    TestServices services;
+};
+
+TEST_F(LogSurveyTest, EveryRecordingTellsItsTechnology)
+{
+    for (const RecordedDrive& drive : kDrives)
+        EXPECT_EQ(read(recordedLog(drive.file)).technology(), drive.technology) << drive.file;
+}
+
+TEST_F(LogSurveyTest, ALogIsReadInSlices)
+{
+    LogSurvey survey(recordedLog("umts-city.dlf"));
+    EXPECT_EQ(survey.progress(), 0);
+    int slices = 0;
+    double progress = 0;
+    while (survey.takeSlice()) {
+        EXPECT_GT(survey.progress(), progress);
+        progress = survey.progress();
+        ++slices;
+    }
+    EXPECT_EQ(survey.progress(), 1);
+    EXPECT_GE(slices, 2);
+    EXPECT_FALSE(survey.takeSlice());
+}
+
+TEST_F(LogSurveyTest, FilesOfForeignBytesAreNoLogs)
+{
+    // Among them, by chance, is something that could be an item of LTE.
+    LogBuilder builder;
+    builder.foreign(50);
+    builder.bytes.insert(builder.bytes.end(), 5000, 0x20);
+    builder.servingCell(kLogStart, 1);
+    builder.servingCell(kLogStart, 1);
+    const LogSurvey survey = read(builder.source());
+    EXPECT_FALSE(survey.technology());
+    EXPECT_EQ(survey.complaint("x.jpg"),
+              "\"x.jpg\" is neither a diagnostic log (.dlf) nor a snapshot (.orvane): name another "
+              "file or, for a badly damaged log, its technology with --technology, one of lte, "
+              "umts, utran, cdma, cellmonitor");
+    EXPECT_FALSE(read(sourceOf({})).technology());
+}
+
+TEST_F(LogSurveyTest, ADamagedLogThatBeginsWithAReportIsALog)
+{
+    LogBuilder builder;
+    builder.bytes = makeVersionReport().value_or(Bytes());
+    builder.servingCell(kLogStart, 1);
+    builder.servingCell(kLogStart, 1);
+    builder.servingCell(kLogStart, 1);
+    builder.bytes.insert(builder.bytes.end(), 5000, 0x20);
+    EXPECT_EQ(read(builder.source()).technology(), kTSLogChannelTechnology_Varnel_LTE);
+}
+
+TEST_F(LogSurveyTest, ALogOfUnknownCodesAsksForItsTechnology)
+{
+    LogBuilder builder;
+    builder.bytes = makeVersionReport().value_or(Bytes());
+    builder.item(0x1234, kLogStart, Bytes(10, 1));
+    const LogSurvey survey = read(builder.source());
+    EXPECT_FALSE(survey.technology());
+    EXPECT_THAT(survey.complaint("a.dlf"), HasSubstr("name it with --technology"));
+}
+
+TEST_F(LogSurveyTest, TheFirstPlacesOfForeignBytesAreNamed)
+{
+    LogBuilder builder;
+    for (int i = 0; i < 5; ++i) {
+        for (int k = 0; k < 3; ++k)
+            builder.measurement(kLogStart + static_cast<std::uint64_t>(i) * kLogSecond, 1);
+        builder.foreign(10);
+    }
+    builder.measurement(kLogStart + 9 * kLogSecond, 1);
+    DlfReader reader(builder.source());
+    EXPECT_EQ(unplacedRemark(reader), "");
+    while (reader.next()) {
+    }
+    EXPECT_EQ(unplacedRemark(reader),
+              "430 bytes could not be placed: 86 at byte 152, 86 at byte 390, 86 at byte 628 and "
+              "at 2 more places");
+}
+
+} // namespace
+} // namespace orvane
