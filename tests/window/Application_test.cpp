@@ -1,0 +1,177 @@
+#include "app/OrvaneApp.h"
+
+#include "LogGenerator/support/PacketBuilder.h"
+#include "platform/FramePorts.h"
+#include "platform/FrameTelephonyServer.h"
+#include "platform/fake/FakePreferencesStore.h"
+#include "platform/fake/LoopbackTransport.h"
+#include "platform/fake/ScriptedTelephonyServer.h"
+#include "platform/window/BusyIndicator.h"
+#include "platform/window/EmptyView.h"
+#include "platform/window/FlatButton.h"
+#include "platform/window/SheetWidget.h"
+#include "platform/window/TextLine.h"
+#include "platform/window/TitleBar.h"
+#include "platform/window/ToolbarWidget.h"
+#include "window/WindowTest.h"
+
+#include <QLineEdit>
+#include <QTest>
+
+#include <filesystem>
+
+namespace orvane
+{
+
+namespace
+{
+
+using namespace std::chrono_literals;
+
+// The application in its window, on a telephony server that answers by a script.
+class ApplicationTest : public ::testing::Test
+{
+protected:
+    ApplicationTest()
+    {
+        services.useShippedResources();
+        for (const char* folder : {kInstallMarker, kLogFolder})
+            std::filesystem::create_directories(files.located(folder));
+        screen.frame().resize(360, 640);
+    }
+    ~ApplicationTest() override { app.applicationWillTerminate(); }
+
+    void launch()
+    {
+        app.applicationDidFinishLaunching();
+        queue.runPending();
+        turnEvents();
+    }
+    void refreshWithServingCell()
+    {
+        ASSERT_TRUE(server.sendLogMessage(PacketBuilder(0xB0C2, 38).put16(14, 9).bytes()));
+        turn();
+    }
+    void turn(std::chrono::nanoseconds time = 2s)
+    {
+        queue.advance(time);
+        turnEvents();
+    }
+    [[nodiscard]] WindowFrame& frame() const { return screen.frame(); }
+    [[nodiscard]] TableWidget& table() const { return frame().deck().top()->table(); }
+    [[nodiscard]] QString status() const
+    {
+        return dynamic_cast<TextLine&>(*frame().toolbar().itemWidget(1)).text();
+    }
+    [[nodiscard]] bool isBusy() const
+    {
+        return dynamic_cast<BusyIndicator&>(*frame().toolbar().itemWidget(0)).isTurning();
+    }
+    // The index of the row of that key; the number of rows where there is none.
+    [[nodiscard]] std::size_t rowOf(const QString& key) const
+    {
+        std::size_t row = 0;
+        while (table().rowWidget(row) && table().rowWidget(row)->content().key() != key)
+            ++row;
+        return row;
+    }
+    void openRow(const QString& key)
+    {
+        RowWidget* row = table().rowWidget(rowOf(key));
+        ASSERT_TRUE(row) << key.toStdString();
+        QTest::mouseClick(&table(), Qt::LeftButton, {}, row->geometry().center());
+        turnEvents();
+    }
+
+    TestServices services;
+    TemporaryDirectory root;
+    FileSystem files{root.path()};
+    ManualMainQueue queue;
+    LoopbackTransport transport{queue};
+    FramePorts ports{transport, queue};
+    FrameTelephonyServer client{transport, ports, queue};
+    ScriptedTelephonyServer server{transport};
+    FakePreferencesStore preferences;
+    QtScreen screen{[] {
+        QtScreen::Settings settings;
+        settings.isAnimated = false;
+        return settings;
+    }()};
+    OrvaneApp app{
+        ModelEnvironment{queue, ports, client, 2s,
+                         [] { return std::optional<std::string>("UUID"); }},
+        files, preferences
+    };
+};
+
+TEST_F(ApplicationTest, FromTheFirstConnectionToAValue)
+{
+    app.applicationDidFinishLaunching();
+    turnEvents();
+    EXPECT_EQ(status(), "Connecting...");
+    EXPECT_TRUE(isBusy());
+    EXPECT_TRUE(frame().deck().top()->emptyView().isVisible());
+    queue.runPending();
+    refreshWithServingCell();
+    EXPECT_EQ(status(), "Updated 2026-11-21 at 10:00:00");
+    EXPECT_FALSE(isBusy());
+    EXPECT_FALSE(frame().deck().top()->emptyView().isVisible());
+    openRow("Serving Cell Info");
+    EXPECT_EQ(frame().titleBar().title(), "Serving Cell Info");
+    const std::size_t identity = rowOf("Physical Cell ID");
+    ASSERT_TRUE(table().rowWidget(identity));
+    EXPECT_EQ(status(), "Updated 2026-11-21 at 10:00:00");
+}
+
+TEST_F(ApplicationTest, KilledServerAndItsReturnShowInStatusAndBusyIndicator)
+{
+    launch();
+    refreshWithServingCell();
+    ASSERT_FALSE(isBusy());
+    server.die();
+    turn(6s);
+    EXPECT_EQ(status(), "Connecting...");
+    EXPECT_TRUE(isBusy());
+    EXPECT_GT(table().rowCount(), 0U) << "rows stay as they were";
+    ASSERT_TRUE(server.restart());
+    turn(6s);
+    refreshWithServingCell();
+    EXPECT_EQ(status(), "Updated 2026-11-21 at 10:00:00");
+    EXPECT_FALSE(isBusy());
+}
+
+TEST_F(ApplicationTest, SavesAFileWhileRefreshesGoOn)
+{
+    launch();
+    refreshWithServingCell();
+    QTest::mouseClick(frame().toolbar().itemWidget(3), Qt::LeftButton);
+    turnEvents();
+    ASSERT_TRUE(frame().sheet().isVisible());
+    auto* field = frame().findChild<QLineEdit*>("saveDescription");
+    QTest::keyClicks(field, "on the ");
+    refreshWithServingCell();
+    QTest::keyClicks(field, "bridge");
+    EXPECT_EQ(field->text(), "on the bridge");
+    QTest::mouseClick(frame().findChild<QAbstractButton*>("saveButton"), Qt::LeftButton);
+    turn(0s);
+    EXPECT_FALSE(frame().sheet().isVisible());
+    const std::string path =
+        files.located(std::string(kLogFolder) + "/OrvaneSnapshot-1795255200.orvane");
+    const auto content = readFile(path);
+    ASSERT_TRUE(content);
+    const std::string text(content->begin(), content->end());
+    EXPECT_NE(text.find("<string>on the bridge</string>"), std::string::npos);
+}
+
+TEST_F(ApplicationTest, ProgramsEndTakesTheWindowOffTheScreen)
+{
+    launch();
+    EXPECT_TRUE(frame().isVisible());
+    app.applicationWillTerminate();
+    turnEvents();
+    EXPECT_FALSE(frame().isVisible());
+}
+
+} // namespace
+
+} // namespace orvane
