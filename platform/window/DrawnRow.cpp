@@ -74,6 +74,9 @@ DrawnRow DrawnRow::of(TableViewCell& cell)
     const View& view = cell.contentView();
     const QPointF origin(view.frame().x, view.frame().y);
     collectLabels(view, origin, content.labels);
+    // A text that is too long ends before the accessory.
+    for (DrawnLabel& label : content.labels)
+        label.frame.setRight(std::min(label.frame.right(), origin.x() + view.frame().width));
     for (const auto& subview : view.subviews())
         if (const auto* strip = dynamic_cast<const ScrollView*>(subview.get()))
             content.strips.push_back(stripOf(*strip, origin));

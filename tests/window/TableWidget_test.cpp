@@ -55,6 +55,15 @@ TEST_F(TableWidgetTest, GroupLeadsOnAndAValueDoesNot)
     EXPECT_EQ(row(1)->content().accessory, CellAccessory::None);
 }
 
+TEST_F(TableWidgetTest, LongNameOfAGroupEndsBeforeTheDisclosureMark)
+{
+    show(rootNode({groupNode(std::string(100, 'x'), {})}));
+    const DrawnLabel& key = row(0)->content().labels.front();
+    EXPECT_EQ(key.text.size(), 100);
+    EXPECT_EQ(key.frame.left(), 10);
+    EXPECT_EQ(key.frame.right(), 360 - TableViewCell::kAccessoryWidth);
+}
+
 TEST_F(TableWidgetTest, RowsUnderOneAnotherTouch)
 {
     show(manyRows(3));
