@@ -70,6 +70,8 @@ public:
     [[nodiscard]] std::optional<DlfItem> next(std::uint64_t mostUnplacedBytes);
     [[nodiscard]] bool isAtEnd() const { return _cursor >= _source->size(); }
 
+    // The file's length in bytes, as far as is known by now.
+    [[nodiscard]] std::uint64_t size() const { return _source->size(); }
     // How far reading has come, in bytes from the file's start.
     [[nodiscard]] std::uint64_t position() const { return _cursor; }
     // What has been passed so far, in bytes. The three add up to the file's length at its end.

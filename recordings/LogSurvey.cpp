@@ -60,11 +60,9 @@ std::string LogSurvey::complaint(const std::string& path) const
            technologyNames();
 }
 
-std::string unplacedRemark(const DlfReader& reader)
+std::string remarkOn(const DlfReader& reader, std::uint64_t size)
 {
-    if (reader.unplacedBytes() == 0)
-        return "";
-    std::string text = std::to_string(reader.unplacedBytes()) + " bytes could not be placed: ";
+    std::string text;
     const auto& ranges = reader.unplacedRanges();
     const std::size_t named = std::min(ranges.size(), kNamedRanges);
     for (std::size_t i = 0; i < named; ++i)
@@ -72,6 +70,11 @@ std::string unplacedRemark(const DlfReader& reader)
                 std::to_string(ranges[i].position);
     if (reader.unplacedRangeCount() > named)
         text += " and at " + std::to_string(reader.unplacedRangeCount() - named) + " more places";
+    if (!text.empty())
+        text = std::to_string(reader.unplacedBytes()) + " bytes could not be placed: " + text;
+    if (reader.size() < size)
+        text += (text.empty() ? "" : "; ") + std::to_string(size - reader.size()) +
+                " bytes could not be read: the file ends at byte " + std::to_string(reader.size());
     return text;
 }
 

@@ -14,6 +14,9 @@ namespace orvane
 class LogSurvey
 {
 public:
+    // Of the time that it takes to read a log and decode it, about what the survey takes.
+    static constexpr double kShareOfTime = 0.05;
+
     explicit LogSurvey(std::shared_ptr<ByteSource> log);
 
     // Goes on for a slice of some milliseconds; false at the end of the log.
@@ -36,8 +39,8 @@ private:
     bool _beginsWithReport = false;
 };
 
-// What a person should know about a log that has been read: how many bytes could not be placed, and
-// where. Empty where all could.
-std::string unplacedRemark(const DlfReader& reader);
+// What a person should know about a log that has been read, which was `size` bytes long at first:
+// how many bytes could not be placed or read, and where. Empty where all could.
+std::string remarkOn(const DlfReader& reader, std::uint64_t size);
 
 } // namespace orvane

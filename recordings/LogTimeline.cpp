@@ -18,7 +18,7 @@ constexpr LogTime kStep = std::chrono::microseconds(1250);
 } // namespace
 
 LogTimeline::LogTimeline(std::shared_ptr<ByteSource> log, const std::string& technology)
-    : _log(log), _bytesAtFirst(log->size()), _play(std::move(log), technology)
+    : _bytesAtFirst(log->size()), _play(std::move(log), technology)
 {
     _play.setTellsErrors(true);
 }
@@ -113,14 +113,7 @@ void LogTimeline::moveToNextServingCell()
 
 std::string LogTimeline::remark() const
 {
-    if (!_end)
-        return "";
-    std::string text = unplacedRemark(_end->place.reader);
-    const std::uint64_t size = std::min(_log->size(), _bytesAtFirst);
-    if (size < _bytesAtFirst)
-        text += (text.empty() ? "" : "; ") + std::to_string(_bytesAtFirst - size) +
-                " bytes could not be read: the file ends at byte " + std::to_string(size);
-    return text;
+    return _end ? remarkOn(_end->place.reader, _bytesAtFirst) : "";
 }
 
 } // namespace orvane

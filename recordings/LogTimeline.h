@@ -50,7 +50,6 @@ private:
     [[nodiscard]] bool canTakeNext() const;
     void skipTo(const LogPlay::Checkpoint* checkpoint);
 
-    std::shared_ptr<ByteSource> _log;
     std::uint64_t _bytesAtFirst;
     LogPlay _play;
     Checkpoints _checkpoints;

@@ -1,6 +1,5 @@
 #include "recordings/RecordingExport.h"
 
-#include "LogGenerator/DlfTime.h"
 #include "platform/Console.h"
 #include "recordings/LogSurvey.h"
 
@@ -39,11 +38,10 @@ std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSo
             return survey.complaint(_request.file);
     }
     RefreshPeriods periods(log, *technology, _request.period);
-    const DlfReader& reader = periods.play().reader();
     while (_isReadOn && takeSlice(periods))
-        _progress(static_cast<double>(reader.position()) / static_cast<double>(log->size()));
+        _progress(periods.progress());
     _progress(1);
-    if (const std::string remark = unplacedRemark(reader); _isReadOn && !remark.empty())
+    if (const std::string remark = periods.remark(); _isReadOn && !remark.empty())
         consoleLine("%s", remark.c_str());
     return std::nullopt;
 }
@@ -62,11 +60,7 @@ void RecordingExport::takeEntries(const Snapshot& snapshot)
     for (const Snapshot::Entry& entry : snapshot.entries) {
         if (!entry.display || !_isReadOn)
             continue;
-        std::string time;
-        if (entry.secondsOfDate)
-            time = LogClock(dlfTimestamp(static_cast<double>(*entry.secondsOfDate)))
-                       .isoText(LogTime(0));
-        take(time, entry.display);
+        take(entry.isoDate().value_or(""), entry.display);
     }
 }
 

@@ -20,9 +20,6 @@ constexpr int kSpeeds[] = {1, 2, 5, 10, 20, 50, 100, 200, 500, 1000};
 // What a person sees of a display that changes more often.
 constexpr nanoseconds kShortestTurn = std::chrono::milliseconds(50);
 
-// Of the time that reading takes, about what finding the technology does.
-constexpr double kSurveyShare = 0.05;
-
 double secondsOf(LogTime time) { return std::chrono::duration<double>(time).count(); }
 
 LogTime timeOf(double seconds)
@@ -36,7 +33,7 @@ LogTime timeOf(double seconds)
 } // namespace
 
 RecordingPlayer::RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
-                                 PlayerSettings settings, OnChange onChange)
+                                 RecordingSettings settings, OnChange onChange)
     : _queue(queue), _now(std::move(now)), _log(std::move(log)), _settings(std::move(settings)),
       _onChange(std::move(onChange))
 {
@@ -105,8 +102,10 @@ void RecordingPlayer::stopReading()
 double RecordingPlayer::progress() const
 {
     if (_timeline)
-        return isReady() ? 1 : kSurveyShare + (1 - kSurveyShare) * _timeline->progress();
-    return _survey ? kSurveyShare * _survey->progress() : 1;
+        return isReady() ? 1
+                         : LogSurvey::kShareOfTime +
+                               (1 - LogSurvey::kShareOfTime) * _timeline->progress();
+    return _survey ? LogSurvey::kShareOfTime * _survey->progress() : 1;
 }
 
 NodePointer RecordingPlayer::topLevelNodes()

@@ -4,6 +4,7 @@
 #include "platform/toolkit/Playback.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/LogTimeline.h"
+#include "recordings/RecordingSettings.h"
 #include "ui/OrvaneModelNode.h"
 
 #include <chrono>
@@ -14,13 +15,6 @@
 
 namespace orvane
 {
-
-// What a log is played with.
-struct PlayerSettings {
-    std::string name;                      // what the person calls the log: for messages
-    std::optional<std::string> technology; // the constant; nothing where its codes are to tell
-    std::chrono::nanoseconds refreshPeriod = std::chrono::seconds(2); // more than 0
-};
 
 // Plays a diagnostic log as if it were a live view that refreshes every refresh period, from the
 // queue of the main thread. First the log is read, a slice a turn of the queue; then it stands at
@@ -36,7 +30,7 @@ public:
 
     // The queue must outlive the player.
     RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
-                    PlayerSettings settings, OnChange onChange);
+                    RecordingSettings settings, OnChange onChange);
 
     // One line that says why the log cannot be played, and what to do. Reading has ended then.
     [[nodiscard]] const std::optional<std::string>& failure() const { return _failure; }
@@ -81,7 +75,7 @@ private:
     MainQueue& _queue;
     Now _now;
     std::shared_ptr<ByteSource> _log;
-    PlayerSettings _settings;
+    RecordingSettings _settings;
     OnChange _onChange;
     std::optional<std::string> _failure;
     std::optional<LogSurvey> _survey;       // while the technology is sought

@@ -1,6 +1,7 @@
 #include "recordings/RefreshPeriods.h"
 
 #include "recordings/LogSlice.h"
+#include "recordings/LogSurvey.h"
 
 #include <utility>
 
@@ -9,7 +10,7 @@ namespace orvane
 
 RefreshPeriods::RefreshPeriods(std::shared_ptr<ByteSource> log, const std::string& technology,
                                LogTime period)
-    : _play(std::move(log), technology), _period(period)
+    : _bytesAtFirst(log->size()), _play(std::move(log), technology), _period(period)
 {
     _play.setTellsErrors(true);
 }
@@ -33,5 +34,13 @@ RefreshPeriods::Reached RefreshPeriods::takeSlice()
     }
     return Reached::Nothing;
 }
+
+double RefreshPeriods::progress() const
+{
+    const auto size = static_cast<double>(_bytesAtFirst);
+    return size > 0 ? static_cast<double>(_play.reader().position()) / size : 1;
+}
+
+std::string RefreshPeriods::remark() const { return remarkOn(_play.reader(), _bytesAtFirst); }
 
 } // namespace orvane

@@ -27,7 +27,14 @@ public:
     [[nodiscard]] LogTime time() const { return _play.time(); }
     [[nodiscard]] const LogPlay& play() const { return _play; }
 
+    // How much of the log has been read, 0 to 1.
+    [[nodiscard]] double progress() const;
+    // What a person should know about what has been read: bytes that could not be placed, and
+    // where.
+    [[nodiscard]] std::string remark() const;
+
 private:
+    std::uint64_t _bytesAtFirst;
     LogPlay _play;
     LogTime _period;
     bool _isOpen = false; // items of the period that is under way have been taken

@@ -62,6 +62,16 @@ Snapshot::Entry entryOf(const PropertyValue& value)
 
 } // namespace
 
+std::optional<std::string> Snapshot::Entry::isoDate() const
+{
+    // "2026-11-21 10:00:00 +0000", or it would have no seconds.
+    if (!secondsOfDate)
+        return std::nullopt;
+    std::string text = date.substr(0, date.rfind(' '));
+    text[text.find(' ')] = 'T';
+    return text + ".000Z";
+}
+
 std::optional<Snapshot> snapshotFrom(const PropertyValue& value)
 {
     const PropertyArray* data = value[kDataKey].asArray();

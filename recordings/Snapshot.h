@@ -21,6 +21,9 @@ struct Snapshot {
         std::optional<std::int64_t> secondsOfDate; // since 1970, where the date can be read
         PropertyValue display;                     // absent where the entry has none
         std::shared_ptr<ByteSource> log;           // a diagnostic log; null where it has none
+
+        // "2026-11-21T10:00:00.000Z"; nothing where the date cannot be read.
+        [[nodiscard]] std::optional<std::string> isoDate() const;
     };
 
     std::string timestamp;

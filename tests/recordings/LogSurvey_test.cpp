@@ -99,12 +99,16 @@ TEST_F(LogSurveyTest, TheFirstPlacesOfForeignBytesAreNamed)
     }
     builder.measurement(kLogStart + 9 * kLogSecond, 1);
     DlfReader reader(builder.source());
-    EXPECT_EQ(unplacedRemark(reader), "");
+    const std::uint64_t size = builder.bytes.size();
+    EXPECT_EQ(remarkOn(reader, size), "");
     while (reader.next()) {
     }
-    EXPECT_EQ(unplacedRemark(reader),
+    EXPECT_EQ(remarkOn(reader, size),
               "430 bytes could not be placed: 86 at byte 152, 86 at byte 390, 86 at byte 628 and "
               "at 2 more places");
+    EXPECT_THAT(remarkOn(reader, size + 7),
+                testing::EndsWith("; 7 bytes could not be read: the file ends at byte " +
+                                  std::to_string(size)));
 }
 
 } // namespace

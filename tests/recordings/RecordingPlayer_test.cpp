@@ -30,7 +30,7 @@ class RecordingPlayerTest : public ::testing::Test
 protected:
     RecordingPlayerTest() { services.useShippedResources(); }
 
-    void open(std::shared_ptr<ByteSource> log, PlayerSettings settings = {"a.dlf", {}})
+    void open(std::shared_ptr<ByteSource> log, RecordingSettings settings = {"a.dlf", {}})
     {
         player = std::make_unique<RecordingPlayer>(
             queue, [this] { return queue.now(); }, std::move(log), std::move(settings),

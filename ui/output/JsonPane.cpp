@@ -95,6 +95,13 @@ std::string JsonPane::statusOutput(const std::string& status, bool isLoading,
     members += isLoading ? ",\"loading\":true" : ",\"loading\":false";
     members += ",\"tree\":";
     appendJsonNode(members, tree);
+    if (hasTimes()) {
+        members += ",\"time\":";
+        if (time())
+            appendJsonString(members, *time());
+        else
+            members += "null";
+    }
     return line(std::move(members));
 }
 

@@ -23,6 +23,18 @@ void OutputPane::setStatus(std::optional<std::string> status, bool isLoading)
     _write(statusOutput(*_status, _isLoading, _node.get()));
 }
 
+void OutputPane::setTime(std::optional<std::string> time)
+{
+    _time = std::move(time);
+    _hasTimes = true;
+}
+
+void OutputPane::showNote(const std::string& text)
+{
+    if (const std::string output = noteOutput(text); !output.empty())
+        _write(output);
+}
+
 void OutputPane::showSaved(const SnapshotResult& result)
 {
     _write(result.isWritten ? savedOutput(result.path)

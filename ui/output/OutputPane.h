@@ -28,7 +28,11 @@ public:
     // Another tree, or none: printed with the status that comes next.
     void reloadWithNode(NodePointer node);
     void setStatus(std::optional<std::string> status, bool isLoading);
+    // Of recordings: the time of what is printed from now on, nothing where it has none.
+    void setTime(std::optional<std::string> time);
 
+    // What is said about the whole of what is printed, for people only.
+    void showNote(const std::string& text);
     void showSaved(const SnapshotResult& result);
     void showError(const std::string& text);
 
@@ -39,11 +43,18 @@ protected:
     [[nodiscard]] virtual std::string alertOutput(const std::string& title,
                                                   const std::string& message) const = 0;
     [[nodiscard]] virtual std::string errorOutput(const std::string& text) const = 0;
+    [[nodiscard]] virtual std::string noteOutput(const std::string&) const { return ""; }
+
+    // Whether times have been set at all.
+    [[nodiscard]] bool hasTimes() const { return _hasTimes; }
+    [[nodiscard]] const std::optional<std::string>& time() const { return _time; }
 
 private:
     Write _write;
     NodePointer _node;
     std::optional<std::string> _status;
+    std::optional<std::string> _time;
+    bool _hasTimes = false;
     bool _isLoading = true;
     bool _isReloaded = false;
 };

@@ -49,4 +49,9 @@ std::string TextPane::errorOutput(const std::string& text) const
     return block("Error: " + shownText(text) + "\n");
 }
 
+std::string TextPane::noteOutput(const std::string& text) const
+{
+    return block(shownText(text) + "\n");
+}
+
 } // namespace orvane

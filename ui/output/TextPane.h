@@ -23,6 +23,7 @@ protected:
     [[nodiscard]] std::string alertOutput(const std::string& title,
                                           const std::string& message) const override;
     [[nodiscard]] std::string errorOutput(const std::string& text) const override;
+    [[nodiscard]] std::string noteOutput(const std::string& text) const override;
 
 private:
     bool _isSimulated;
