@@ -184,7 +184,7 @@ void RecordingPlayer::pause()
 
 void RecordingPlayer::faster()
 {
-    if (_speed + 1 >= std::size(kSpeeds))
+    if (!isReady() || _speed + 1 >= std::size(kSpeeds))
         return;
     ++_speed;
     if (isPlaying())
@@ -194,7 +194,7 @@ void RecordingPlayer::faster()
 
 void RecordingPlayer::slower()
 {
-    if (_speed == 0)
+    if (!isReady() || _speed == 0)
         return;
     --_speed;
     if (isPlaying())
