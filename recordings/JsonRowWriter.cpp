@@ -7,13 +7,17 @@ namespace orvane
 
 bool JsonRowWriter::takePeriod(const std::string& time, const RowTable& table)
 {
-    _line = "{\"time\":";
-    appendJsonString(_line, time);
+    _line = '{';
+    if (!time.empty()) {
+        _line += "\"time\":";
+        appendJsonString(_line, time);
+    }
     for (const std::size_t i : table.order()) {
         const RowTable::Row& row = table.rows()[i];
         if (!table.isPresent(row))
             continue;
-        _line += ',';
+        if (_line.size() > 1)
+            _line += ',';
         appendJsonString(_line, row.path);
         _line += ':';
         appendJsonString(_line, row.text);

@@ -7,7 +7,8 @@
 namespace orvane
 {
 
-// One JSON object a line: {"time":TIME,PATH:TEXT,...}, with the rows that are there.
+// One JSON object a line: {"time":TIME,PATH:TEXT,...}, with the rows that are there, and without a
+// time where it is not known.
 class JsonRowWriter final : public RowWriter
 {
 public:

@@ -57,11 +57,9 @@ bool RecordingExport::takeSlice(RefreshPeriods& periods)
 
 void RecordingExport::takeEntries(const Snapshot& snapshot)
 {
-    for (const Snapshot::Entry& entry : snapshot.entries) {
-        if (!entry.display || !_isReadOn)
-            continue;
-        take(entry.isoDate().value_or(""), entry.display);
-    }
+    for (const Snapshot::Entry& entry : snapshot.entries)
+        if (entry.display && _isReadOn)
+            take(entry.isoDate().value_or(""), entry.display);
 }
 
 void RecordingExport::take(const std::string& time, const PropertyValue& display)

@@ -31,7 +31,10 @@ public:
 
     // In the order in which they were found. An index stays a row's own.
     [[nodiscard]] const std::vector<Row>& rows() const { return _rows; }
-    [[nodiscard]] bool isPresent(const Row& row) const { return row.lastPeriod == _period; }
+    [[nodiscard]] bool isPresent(const Row& row) const
+    {
+        return _period != 0 && row.lastPeriod == _period;
+    }
     // Indices of the rows in the order of the paths that were asked for, those of a pattern or a
     // group as they are shown. A path without "*" is a row of its own also where it never occurred.
     [[nodiscard]] std::vector<std::size_t> order() const;

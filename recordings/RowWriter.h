@@ -18,8 +18,8 @@ public:
     using Output = std::function<bool(std::string_view lines)>;
 
     virtual ~RowWriter() = default;
-    // The table has taken a period; `time` is the recording's, "2026-11-21T10:00:00.000Z". False
-    // where nobody reads on.
+    // The table has taken a period; `time` is the recording's, "2026-11-21T10:00:00.000Z", empty
+    // where it is not known. False where nobody reads on.
     virtual bool takePeriod(const std::string& time, const RowTable& table) = 0;
     // No further period comes. One line for the user where something went wrong.
     virtual std::optional<std::string> finish(const RowTable&) { return std::nullopt; }
