@@ -87,10 +87,8 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
     return frontEnd->exitStatus();
 }
 
-int run(const AppOptions& options)
+int run(const AppOptions& options, FrontEndKind kind)
 {
-    const FrontEndKind kind =
-        options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
     // The event loop of a program with a window needs a larger kind of application object.
     std::optional<QtWindowApplication> windowApplication;
     if (kind == FrontEndKind::Window)
@@ -139,9 +137,13 @@ int main(int argc, char** argv)
         return 0;
     }
 
-    const ProgramServices services(options.log.get());
+    const FrontEndKind kind =
+        options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
+    // Standard output carries data, or the terminal's screen, unless there is a window.
+    const ProgramServices services(options.log.get(),
+                                   kind == FrontEndKind::Window ? stdout : stderr);
     try {
-        return run(options);
+        return run(options, kind);
     } catch (const std::exception& failure) {
         complain(failure.what());
         return kFailure;

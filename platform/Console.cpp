@@ -10,11 +10,11 @@
 namespace orvane
 {
 
-void StandardErrorConsole::writeLine(std::string_view line)
+void StreamConsole::writeLine(std::string_view line)
 {
     std::string text(line);
     text += '\n';
-    std::fwrite(text.data(), 1, text.size(), stderr);
+    std::fwrite(text.data(), 1, text.size(), _stream);
 }
 
 void consoleLine(const char* format, ...)

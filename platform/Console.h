@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdio>
 #include <string_view>
 
 namespace orvane
@@ -15,10 +16,15 @@ public:
     virtual void writeLine(std::string_view line) = 0;
 };
 
-class StandardErrorConsole final : public Console
+class StreamConsole final : public Console
 {
 public:
+    // Standard output or standard error; not owned.
+    explicit StreamConsole(std::FILE* stream) : _stream(stream) {}
     void writeLine(std::string_view line) override;
+
+private:
+    std::FILE* _stream;
 };
 
 // Writes to the process's console (Services::console), formatted as printf does.

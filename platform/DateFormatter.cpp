@@ -1,6 +1,5 @@
 #include "platform/DateFormatter.h"
 
-#include <cmath>
 #include <cstdio>
 #include <string_view>
 

@@ -3,6 +3,7 @@
 #include "platform/Clock.h"
 
 #include <string>
+#include <utility>
 
 namespace orvane
 {

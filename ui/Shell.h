@@ -13,7 +13,7 @@ public:
     virtual ~Shell() = default;
     // Whether saving is offered.
     [[nodiscard]] virtual bool allowSaveButton() const = 0;
-    // Opens the save screen, closes it. Nothing where it is, or is not, open.
+    // Opens the save screen: nothing while it is open. Closes it: nothing while it is not.
     virtual void showSaveView() = 0;
     virtual void closeSaveView() = 0;
 

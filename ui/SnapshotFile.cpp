@@ -66,7 +66,7 @@ SnapshotResult writeSnapshotFile(const FileSystem& files, const PropertyValue& s
     });
     // The time of saving, not `timeStamp`: they differ by as long as the screen was open. This is
     // meant.
-    const auto now = static_cast<long>(Services::current().clock().secondsSince1970());
+    const auto now = wholeSeconds(Services::current().clock().secondsSince1970());
     const std::string path = files.located(std::string(kLogFolder) + "/OrvaneSnapshot-" +
                                            std::to_string(now) + ".orvane");
     const bool isWritten = write(path, snapshot);

@@ -1,5 +1,6 @@
 #include "app/program/Display.h"
 
+#include <cerrno>
 #include <cstddef>
 #include <cstdlib>
 #include <cstring>
@@ -28,13 +29,14 @@ bool isAnswering(const std::string& path)
     if (path.size() >= sizeof address.sun_path)
         return false;
     std::memcpy(address.sun_path, path.data(), path.size());
-    const int descriptor = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    const int descriptor = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
     if (descriptor < 0)
         return false;
     const auto length =
         static_cast<socklen_t>(offsetof(sockaddr_un, sun_path) + path.size() + (path[0] ? 1 : 0));
     const bool connects =
-        connect(descriptor, reinterpret_cast<const sockaddr*>(&address), length) == 0;
+        connect(descriptor, reinterpret_cast<const sockaddr*>(&address), length) == 0 ||
+        errno == EAGAIN; // somebody listens and is busy
     close(descriptor);
     return connects;
 }

@@ -17,7 +17,7 @@ public:
     virtual ~FrontEnd() = default;
     // Makes the application's root pane, where it is one of the front end's own; null else.
     [[nodiscard]] virtual OrvaneApp::MakeRootPane rootPaneMaker() { return nullptr; }
-    // The application is about to start, and outlives what it is told from now on.
+    // The application is about to start. It must not be used once the event loop has ended.
     virtual void begin(OrvaneApp&) {}
     // What the program ends with; what is wrong has been told then.
     [[nodiscard]] virtual int exitStatus() { return 0; }

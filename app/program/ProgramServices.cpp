@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-ProgramServices::ProgramServices(SystemLog* log)
-    : _resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES))
+ProgramServices::ProgramServices(SystemLog* log, std::FILE* console)
+    : _console(console), _resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES))
 {
     Services& services = Services::current();
     services.setLog(log);

@@ -12,14 +12,14 @@ class SystemLog;
 class ProgramServices
 {
 public:
-    // The log may be null.
-    explicit ProgramServices(SystemLog* log);
+    // The log may be null. Lines for a person at the console go to that stream.
+    ProgramServices(SystemLog* log, std::FILE* console);
     ~ProgramServices();
     ProgramServices(const ProgramServices&) = delete;
     ProgramServices& operator=(const ProgramServices&) = delete;
 
 private:
-    StandardErrorConsole _console;
+    StreamConsole _console;
     DirectoryResources _resources;
 };
 

@@ -2,6 +2,7 @@
 
 #include "platform/PreferencesStore.h"
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -15,6 +16,8 @@ public:
     void setValue(const std::string& domain, const std::string& key,
                   const PropertyValue& value) override
     {
+        if (onSet)
+            onSet();
         notes.push_back("set " + domain + " " + key + " " +
                         (value.asBoolean() == true ? "true" : "false"));
     }
@@ -28,6 +31,7 @@ public:
     }
 
     std::vector<std::string> notes;
+    std::function<void()> onSet; // called before a value is noted
 };
 
 } // namespace orvane

@@ -14,7 +14,6 @@ namespace orvane
 {
 
 class TableView;
-class TextField;
 
 // A front end without a screen, with fixed font metrics, in which tests press, type and read
 // frames. Every code point is 8 points wide, in bold 9; a line is 3 points higher than the font's

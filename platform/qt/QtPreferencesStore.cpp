@@ -32,19 +32,31 @@ QVariant variantOf(const PropertyValue& value)
 
 } // namespace
 
+QtPreferencesStore::QtPreferencesStore() = default;
+
+QtPreferencesStore::~QtPreferencesStore() = default;
+
+QSettings& QtPreferencesStore::settings(const std::string& domain)
+{
+    auto& open = _open[domain];
+    if (!open)
+        open = std::make_unique<QSettings>(fileOf(domain), QSettings::IniFormat);
+    return *open;
+}
+
 void QtPreferencesStore::setValue(const std::string& domain, const std::string& key,
                                   const PropertyValue& value)
 {
-    QSettings settings(fileOf(domain), QSettings::IniFormat);
-    settings.setValue(QString::fromStdString(key), variantOf(value));
+    settings(domain).setValue(QString::fromStdString(key), variantOf(value));
 }
 
 void QtPreferencesStore::synchronize(const std::string& domain)
 {
-    QSettings settings(fileOf(domain), QSettings::IniFormat);
-    settings.sync();
-    if (settings.status() != QSettings::NoError)
-        logError("The preferences in %s cannot be written", fileOf(domain).toUtf8().constData());
+    QSettings& open = settings(domain);
+    open.sync();
+    if (open.status() != QSettings::NoError)
+        logError("The preferences in %s cannot be written", qUtf8Printable(open.fileName()));
+    _open.erase(domain);
 }
 
 void QtPreferencesStore::postChangeNotice(const std::string& domain, const std::string& key)

@@ -2,6 +2,12 @@
 
 #include "platform/PreferencesStore.h"
 
+#include <map>
+#include <memory>
+#include <string>
+
+class QSettings;
+
 namespace orvane
 {
 
@@ -12,10 +18,19 @@ namespace orvane
 class QtPreferencesStore final : public PreferencesStore
 {
 public:
+    QtPreferencesStore();
+    ~QtPreferencesStore() override;
+
     void setValue(const std::string& domain, const std::string& key,
                   const PropertyValue& value) override;
     void synchronize(const std::string& domain) override;
     void postChangeNotice(const std::string& domain, const std::string& key) override;
+
+private:
+    QSettings& settings(const std::string& domain);
+
+    // What was set and is not written yet, by domain.
+    std::map<std::string, std::unique_ptr<QSettings>> _open;
 };
 
 } // namespace orvane

@@ -5,6 +5,8 @@ namespace orvane
 
 void ActivityIndicator::setHidesWhenStopped(bool hides)
 {
+    if (_hidesWhenStopped == hides)
+        return;
     _hidesWhenStopped = hides;
     changed();
 }

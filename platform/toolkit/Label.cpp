@@ -7,34 +7,49 @@
 namespace orvane
 {
 
+namespace
+{
+
+// Whether the value was another one before.
+template <typename Value>
+bool replace(Value& old, Value value)
+{
+    if (old == value)
+        return false;
+    old = std::move(value);
+    return true;
+}
+
+} // namespace
+
 void Label::setText(std::optional<std::string> text)
 {
-    _text = std::move(text).value_or("");
-    changed();
+    if (replace(_text, std::move(text).value_or("")))
+        changed();
 }
 
 void Label::setFont(Font font)
 {
-    _font = std::move(font);
-    changed();
+    if (replace(_font, std::move(font)))
+        changed();
 }
 
 void Label::setAlignment(TextAlignment alignment)
 {
-    _alignment = alignment;
-    changed();
+    if (replace(_alignment, alignment))
+        changed();
 }
 
 void Label::setTextColour(Colour colour)
 {
-    _textColour = colour;
-    changed();
+    if (replace(_textColour, colour))
+        changed();
 }
 
 void Label::setBackgroundColour(Colour colour)
 {
-    _backgroundColour = colour;
-    changed();
+    if (replace(_backgroundColour, colour))
+        changed();
 }
 
 void Label::sizeToFit()

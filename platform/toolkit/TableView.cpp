@@ -9,7 +9,7 @@ namespace orvane
 namespace
 {
 
-// More cells than any screen shows are kept by nobody.
+// What is kept of a table that is scrolled through from end to end.
 constexpr std::size_t kLargestPool = 1024;
 
 } // namespace
@@ -65,7 +65,9 @@ std::shared_ptr<TableViewCell> TableView::dequeueReusableCell(const std::string&
         return pooled.row == _rowBeingMade && fits(pooled);
     });
     if (found == _pool.rend())
-        found = std::find_if(_pool.rbegin(), _pool.rend(), fits);
+        found = std::find_if(_pool.rbegin(), _pool.rend(), [&](const PooledCell& pooled) {
+            return pooled.row >= _rowCount && fits(pooled);
+        });
     if (found == _pool.rend())
         return nullptr;
     auto cell = std::move(found->cell);

@@ -43,8 +43,8 @@ public:
 // A plain table of one section. Cells are made for the rows that the front end says are visible;
 // cells of rows that left go to a pool for reuse.
 //
-// The pool hands back the cell that the same row had, if it is there, else the cell last put in: in
-// an unchanged table every row keeps its cell.
+// The pool hands back the cell that the same row had, if it is there, else the cell last put in of
+// those whose row is gone: in an unchanged table every row keeps its cell, however it is scrolled.
 class TableView : public View
 {
 public:

@@ -32,6 +32,8 @@ void TableViewController::viewWillAppear(bool animated)
     ViewController::viewWillAppear(animated);
     if (!std::exchange(_hasAppeared, true))
         tableView().reloadData();
+    if (const auto row = tableView().selectedRow())
+        tableView().deselectRow({0, *row}, animated);
 }
 
 std::shared_ptr<View> TableViewController::loadView()

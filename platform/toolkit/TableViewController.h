@@ -16,7 +16,7 @@ public:
 
     [[nodiscard]] TableView& tableView();
 
-    // The first time, fills the table.
+    // The first time, fills the table; later, deselects the row that led to what was in front.
     void viewWillAppear(bool animated) override;
 
 protected:

@@ -32,7 +32,7 @@ public:
     // The user has pressed Return.
     void pressReturn();
 
-    // Whether the keyboard is its.
+    // Whether it has the keyboard.
     [[nodiscard]] bool isFirstResponder() const { return _isFirstResponder; }
     void becomeFirstResponder();
     bool resignFirstResponder() override;

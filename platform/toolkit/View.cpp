@@ -30,13 +30,13 @@ void View::setHidden(bool isHidden)
     changed();
 }
 
-void View::addSubview(const std::shared_ptr<View>& view)
+void View::addSubview(std::shared_ptr<View> view)
 {
     if (!view)
         return;
     view->removeFromSuperview();
     view->_superview = this;
-    _subviews.push_back(view);
+    _subviews.push_back(std::move(view));
     changed();
 }
 

@@ -30,7 +30,7 @@ public:
     void setHidden(bool isHidden);
 
     // Takes it out of where it was before. A null view is not added.
-    void addSubview(const std::shared_ptr<View>& view);
+    void addSubview(std::shared_ptr<View> view);
     void removeFromSuperview();
     // Null for a view that is in no other, or whose superview has gone.
     [[nodiscard]] View* superview() const { return _superview; }

@@ -8,8 +8,8 @@
 namespace orvane
 {
 
-// What the application fills the screen with. Shown from makeKeyAndVisible() until it is hidden or
-// destroyed.
+// What the application fills the screen with. Shown from makeKeyAndVisible() until orderOut() or
+// its end.
 class Window : public View
 {
 public:

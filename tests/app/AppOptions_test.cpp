@@ -80,11 +80,33 @@ TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
     }
 }
 
+TEST(AppOptionsTest, EveryFrontEndHasItsName)
+{
+    for (const auto& [name, kind] : {
+             std::pair("window", FrontEndKind::Window),
+             std::pair("terminal", FrontEndKind::Terminal),
+             std::pair("text", FrontEndKind::Text),
+             std::pair("json", FrontEndKind::Json),
+         })
+        EXPECT_EQ(parsed({"--ui", name}).frontEnd, kind) << name;
+    EXPECT_FALSE(parsed({}).isFullScreen);
+    EXPECT_TRUE(parsed({"--fullscreen"}).isFullScreen);
+}
+
+TEST(AppOptionsTest, ByDefaultAWindowElseTheTerminalElseText)
+{
+    EXPECT_EQ(defaultFrontEnd(true, true), FrontEndKind::Window);
+    EXPECT_EQ(defaultFrontEnd(true, false), FrontEndKind::Window);
+    EXPECT_EQ(defaultFrontEnd(false, true), FrontEndKind::Terminal);
+    EXPECT_EQ(defaultFrontEnd(false, false), FrontEndKind::Text);
+}
+
 TEST(AppOptionsTest, HelpNamesEveryOptionAndScenario)
 {
     const std::string help = appHelp(kScenarios);
-    for (const char* word : {"--demo", "--ui", "--ports", "--root", "--refresh", "--log",
-                             "--log-level", "--help", "--version", "lte, umts", "Exit status"})
+    for (const char* word :
+         {"--demo", "--ui", "--fullscreen", "--ports", "--root", "--refresh", "--record", "--force",
+          "--log", "--log-level", "--help", "--version", "lte, umts", "Exit status"})
         EXPECT_THAT(help, HasSubstr(word));
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
     EXPECT_TRUE(parsed({"--version"}).wantsVersion);

@@ -268,11 +268,51 @@ TEST_F(OrvaneAppTest, BeforeTheLaunchThereIsNothingToUpdate)
     EXPECT_THAT(takeNotes(), IsEmpty());
 }
 
+TEST_F(OrvaneAppTest, WhileNotConnectedAReloadLeavesTheTimeOfTheLastUpdate)
+{
+    launch();
+    refresh();
+    services.clock.now += 60;
+    sendServingCell();
+    server.die();
+    takeNotes();
+    queue.advance(2s);
+    EXPECT_THAT(takeNotes(),
+                ElementsAre("Connecting... busy", "reload Orvane", "Connecting... busy"));
+    ASSERT_TRUE(server.restart());
+    queue.advance(5s);
+    EXPECT_EQ(top().statusText(), "Updated 2026-11-21 at 10:00:00");
+}
+
+TEST_F(OrvaneAppTest, WhatTheSaveScreenSavesIsOfTheTimeWhenItOpened)
+{
+    makeMarker();
+    makeLogFolder();
+    launch();
+    refresh();
+    app.showSaveView();
+    ASSERT_TRUE(server.sendLogMessage(PacketBuilder(0xB0C2, 38).put16(14, 77).bytes()));
+    queue.advance(2s);
+    app.saveView()->savePressed();
+    const PropertyValue snapshot =
+        readPropertyList(*readFile(root.path() + kLogFolder + "/OrvaneSnapshot-1795255200.orvane"))
+            .value;
+    ASSERT_EQ(snapshot["Data"].asArray()->size(), 2U);
+    EXPECT_EQ((*snapshot["Data"].asArray())[0]["Display"]["Serving Cell Info"]["Physical Cell ID"],
+              PropertyValue("9"));
+}
+
 TEST_F(OrvaneAppTest, ItsEndStopsTheNumericSignalStrengthAndLeavesTheScreen)
 {
     launch();
     EXPECT_THAT(preferences.notes, IsEmpty());
     app.showSaveView();
+    // The preference comes first: everything else is still there.
+    preferences.onSet = [this] {
+        EXPECT_NE(app.saveView(), nullptr);
+        EXPECT_NE(screen.keyWindow(), nullptr);
+        EXPECT_NE(transport.openConnections(kTelephonyServerPort), 0U);
+    };
     app.applicationWillTerminate();
     EXPECT_THAT(preferences.notes,
                 ElementsAre("set home-screen HSShowGSMRSSI false", "synchronize home-screen",

@@ -140,6 +140,25 @@ TEST_F(OrvanePaneControllerTest, AValuesCellReusedForAGroupShowsTheKeyAlone)
     EXPECT_EQ(cell(0)->value()->text(), "");
 }
 
+TEST_F(OrvanePaneControllerTest, ScrollingAMixedPaneBlanksNoValue)
+{
+    const auto display = PropertyValue::newDictionary();
+    for (int index = 0; index < 20; ++index)
+        display.asDictionary()->set("group " + std::to_string(index), PropertyValue::newArray());
+    for (int index = 0; index < 20; ++index)
+        display.asDictionary()->set("value " + std::to_string(index), "v");
+    TableView& table = root->tableView();
+    for (std::size_t first : {0U, 15U, 30U, 15U, 0U, 30U}) {
+        show(display);
+        table.setVisibleRows(first, 10);
+        for (std::size_t row = std::max<std::size_t>(first, 20); row < first + 10; ++row) {
+            const auto shown = std::dynamic_pointer_cast<OrvaneCell>(table.cellForRow(row));
+            ASSERT_TRUE(shown->value()) << row;
+            EXPECT_EQ(shown->value()->text(), "v");
+        }
+    }
+}
+
 TEST_F(OrvanePaneControllerTest, ARefreshKeepsTheCellsOfAnUnchangedPane)
 {
     const auto display = group({
@@ -232,6 +251,7 @@ TEST_F(OrvanePaneControllerTest, AGroupIsPushedWithItsPathAndItsParentsStatus)
     screen.pressBack();
     screen.pressBack();
     EXPECT_EQ(&top(), root.get());
+    EXPECT_EQ(screen.table()->selectedRow(), std::nullopt);
 }
 
 TEST_F(OrvanePaneControllerTest, AValueRowIsOnlyDeselected)

@@ -150,6 +150,32 @@ TEST_F(OrvaneSaveViewControllerTest, AFailureShowsTheAlertAndCloses)
                                                    "/OrvaneSnapshot-1795255200.orvane"));
 }
 
+TEST_F(OrvaneSaveViewControllerTest, TheButtonsOfTheInterfaceSaveAndCancel)
+{
+    makeLogFolder();
+    open(PropertyValue::newArray());
+    const auto press = [this](const std::string& title) {
+        for (const auto& view : controller->view()->subviews())
+            if (const auto* button = dynamic_cast<Button*>(view.get());
+                button && button->title() == title)
+                button->press();
+        shell.queue.runPending();
+    };
+    press("Cancel");
+    EXPECT_THAT(shell.notes, ElementsAre("close"));
+    EXPECT_TRUE(std::filesystem::is_empty(folder()));
+    press("Save");
+    EXPECT_THAT(shell.notes, ElementsAre("close", "close"));
+    EXPECT_FALSE(std::filesystem::is_empty(folder()));
+}
+
+TEST_F(OrvaneSaveViewControllerTest, RowsCannotBeUnchecked)
+{
+    open(PropertyValue::arrayOf({entry("one")}));
+    controller->saveContentTable()->selectRow(0);
+    EXPECT_EQ(row(0)->accessory(), CellAccessory::Checkmark);
+}
+
 TEST_F(OrvaneSaveViewControllerTest, CancelClosesAndWritesNothing)
 {
     makeLogFolder();

@@ -54,6 +54,16 @@ TEST_F(SnapshotFileTest, HoldsTheThreeKeysAndTheEntriesUnchanged)
     }));
 }
 
+TEST_F(SnapshotFileTest, IsWrittenDirectlyNotThroughATemporaryFile)
+{
+    makeFolder();
+    const std::string target = root.path() + "/target";
+    std::filesystem::create_symlink(target,
+                                    root.path() + kFolder + "/OrvaneSnapshot-1795255200.orvane");
+    EXPECT_TRUE(writeSnapshotFile(files, PropertyValue::newArray(), 0, "").isWritten);
+    EXPECT_EQ(read(target)["Description"], PropertyValue(""));
+}
+
 TEST_F(SnapshotFileTest, IsNamedByTheTimeOfSavingNotByTheTimestamp)
 {
     makeFolder();

@@ -38,6 +38,7 @@ TEST(ScreenTest, EveryChangeAsksForAnUpdateAndNothingElseDoes)
         return screen.updateCount() - before;
     };
     EXPECT_EQ(updatesOf([&] { label.setText("x"); }), 1);
+    EXPECT_EQ(updatesOf([&] { label.setText("x"); }), 0);
     EXPECT_EQ(updatesOf([&] { label.sizeToFit(); }), 1);
     EXPECT_EQ(updatesOf([&] { label.sizeToFit(); }), 0);
     EXPECT_EQ(updatesOf([&] { label.setHidden(true); }), 1);

@@ -104,20 +104,47 @@ TEST_F(TableViewTest, AfterAReloadEveryRowHasTheCellThatItHad)
     EXPECT_EQ(rows.madeCells, 5);
 }
 
-TEST_F(TableViewTest, ARowWithoutACellOfItsOwnGetsTheOneLastPutIn)
+TEST_F(TableViewTest, ScrolledThroughAndBackEveryRowHasTheCellThatItHad)
 {
+    std::vector<TableViewCell*> cells;
+    for (std::size_t row = 0; row < 5; ++row) {
+        table.setVisibleRows(row, 1);
+        cells.push_back(table.cellForRow(row).get());
+    }
+    table.reloadData();
+    for (std::size_t row = 5; row-- > 0;) {
+        table.setVisibleRows(row, 1);
+        EXPECT_EQ(table.cellForRow(row).get(), cells[row]) << row;
+    }
+    EXPECT_EQ(rows.madeCells, 5);
+}
+
+TEST_F(TableViewTest, ARowWithoutACellOfItsOwnGetsTheOneLastPutInOfRowsThatAreGone)
+{
+    table.setVisibleRows(3, 2);
+    TableViewCell* const last = table.cellForRow(4).get();
+    rows.texts = {"a", "b"};
+    table.reloadData();
     table.setVisibleRows(0, 2);
-    TableViewCell* const second = table.cellForRow(1).get();
-    // Both go to the pool, the second one last.
-    table.setVisibleRows(3, 1);
-    EXPECT_EQ(table.cellForRow(3).get(), second);
+    EXPECT_EQ(table.cellForRow(0).get(), last);
     EXPECT_EQ(rows.madeCells, 2);
+}
+
+TEST_F(TableViewTest, OfALongTableNotEveryCellIsKept)
+{
+    rows.texts.assign(5000, "x");
+    table.reloadData();
+    for (std::size_t row = 0; row < 5000; row += 100)
+        table.setVisibleRows(row, 100);
+    table.setVisibleRows(0, 100);
+    EXPECT_EQ(rows.madeCells, 5100);
 }
 
 TEST_F(TableViewTest, CellsOfAnotherIdentifierAreNotHandedBack)
 {
     table.setVisibleRows(0, 1);
-    table.setVisibleRows(0, 0);
+    rows.texts.clear();
+    table.reloadData();
     EXPECT_EQ(table.dequeueReusableCell("other"), nullptr);
     EXPECT_NE(table.dequeueReusableCell("cell"), nullptr);
     EXPECT_EQ(table.dequeueReusableCell("cell"), nullptr);
