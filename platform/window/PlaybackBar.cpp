@@ -61,7 +61,10 @@ PlaybackBar::PlaybackBar(QWidget* parent, const Screen& screen)
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(4, 1, 4, 0);
     column->setSpacing(0);
-    column->addWidget(_remark);
+    auto* remarkRow = new QHBoxLayout;
+    remarkRow->setContentsMargins(8, 0, 8, 0);
+    remarkRow->addWidget(_remark);
+    column->addLayout(remarkRow);
     column->addWidget(_reading);
     column->addWidget(_controls);
     applyTheme();

@@ -1,6 +1,7 @@
 #include "platform/window/QtScreen.h"
 
 #include "platform/window/Fonts.h"
+#include "platform/window/SheetWidget.h"
 #include "platform/window/UiInterface.h"
 #include "platform/window/WindowFrame.h"
 
@@ -68,9 +69,8 @@ QtScreen::QtScreen(Settings settings)
 
 QtScreen::~QtScreen()
 {
-    // What its going changes needs no update any more.
-    _isUpdateQueued = true;
-    _frame->sync([](const View*) { return nullptr; });
+    // Its widgets are the interface's own.
+    _frame->sheet().sync(nullptr);
 }
 
 Rect QtScreen::bounds() const

@@ -2,6 +2,7 @@
 
 #include "platform/SystemLog.h"
 #include "platform/window/Accessibility.h"
+#include "platform/window/DesktopColours.h"
 
 #include <QApplication>
 
@@ -39,6 +40,7 @@ struct QtWindowApplication::Parts {
     char* arguments[2] = {name, nullptr};
     QtMessageHandler earlierHandler = qInstallMessageHandler(logMessage);
     QApplication application{argumentCount, arguments};
+    DesktopColours colours;
 
     ~Parts() { qInstallMessageHandler(earlierHandler); }
 };

@@ -1,3 +1,4 @@
+#include "platform/window/DesktopColours.h"
 #include "platform/window/EmptyView.h"
 #include "platform/window/FlatButton.h"
 #include "platform/window/Theme.h"
@@ -101,6 +102,21 @@ TEST_F(ChromeTest, LightAndDarkFollowTheDesktop)
     }
     turnEvents();
     EXPECT_GT(pictureOf(frame()).pixelColor(emptyPlace).lightness(), 200);
+}
+
+TEST_F(ChromeTest, DesktopsWishForDarkAndLightIsFollowed)
+{
+    show(rootNode({valueNode("Technology", "LTE")}));
+    const QPoint emptyPlace(180, 400);
+    DesktopColours::apply(DesktopColours::Scheme::Dark);
+    turnEvents();
+    EXPECT_LT(pictureOf(frame()).pixelColor(emptyPlace).lightness(), 60);
+    for (const auto scheme :
+         {DesktopColours::Scheme::Light, DesktopColours::Scheme::NoPreference}) {
+        DesktopColours::apply(scheme);
+        turnEvents();
+        EXPECT_GT(pictureOf(frame()).pixelColor(emptyPlace).lightness(), 200);
+    }
 }
 
 TEST_F(ChromeTest, TextsStandOutInLightAndDark)
