@@ -2,6 +2,7 @@
 
 #include "platform/terminal/LineWidth.h"
 #include "platform/terminal/Toolbar.h"
+#include "platform/toolkit/Playback.h"
 #include "platform/toolkit/TableViewController.h"
 
 #include <algorithm>
@@ -108,6 +109,8 @@ std::vector<std::string> StackPage::emptyText() const
     const TableRows* shown = rows();
     if (shown && shown->total() > 0)
         return {"No row has \"" + shown->filter() + "\""};
+    if (_playback)
+        return {_playback->progress() < 1 ? "Reading the file" : "No data yet"};
     if (_isBusy)
         return {"Waiting for the telephony server", _waitingHint};
     return {"No data yet"};

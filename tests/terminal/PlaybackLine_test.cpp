@@ -130,6 +130,19 @@ TEST_F(PlaybackLineTest, WhileTheFileIsReadItsProgressAndHowToStopAreShown)
     EXPECT_THAT(playback.calls, ElementsAre("stopReading")) << "it cannot be played yet";
 }
 
+TEST_F(PlaybackLineTest, NoServerIsWaitedFor)
+{
+    refresh({});
+    root->setStatus("", true);
+    queue.runPending();
+    EXPECT_GE(device.lineOf("No data yet"), 0);
+    playback.read = 0.5;
+    screen->setNeedsUpdate();
+    queue.runPending();
+    EXPECT_LT(device.lineOf("Reading the file"), 20);
+    EXPECT_EQ(device.lineOf("Waiting"), -1);
+}
+
 TEST_F(PlaybackLineTest, TheRemarkHasALineOfItsOwn)
 {
     playback.note = "198 bytes could not be placed";
