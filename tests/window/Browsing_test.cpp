@@ -2,7 +2,6 @@
 #include "platform/window/TitleBar.h"
 #include "window/WindowTest.h"
 
-#include <QPointingDevice>
 #include <QScrollBar>
 #include <QTest>
 
@@ -110,12 +109,11 @@ TEST_F(BrowsingTest, MousesBackButtonGoesBack)
 TEST_F(BrowsingTest, SwipeFromTheLeftEdgeGoesBack)
 {
     open();
-    QPointingDevice* device = QTest::createTouchDevice();
-    QTest::touchEvent(&table(), device).press(0, {5, 200});
+    QTest::touchEvent(&table(), touchScreen()).press(0, {5, 200});
     for (int x = 15; x <= 165; x += 15)
-        QTest::touchEvent(&table(), device).move(0, {x, 204});
+        QTest::touchEvent(&table(), touchScreen()).move(0, {x, 204});
     EXPECT_EQ(topPane().x(), 160) << "it follows the finger";
-    QTest::touchEvent(&table(), device).release(0, {165, 204});
+    QTest::touchEvent(&table(), touchScreen()).release(0, {165, 204});
     turnEvents();
     EXPECT_EQ(title(), "Orvane");
     EXPECT_EQ(topPane().x(), 0);
@@ -124,11 +122,10 @@ TEST_F(BrowsingTest, SwipeFromTheLeftEdgeGoesBack)
 TEST_F(BrowsingTest, SwipeThatIsTooShortStays)
 {
     open();
-    QPointingDevice* device = QTest::createTouchDevice();
-    QTest::touchEvent(&table(), device).press(0, {5, 200});
+    QTest::touchEvent(&table(), touchScreen()).press(0, {5, 200});
     for (int x = 15; x <= 75; x += 15)
-        QTest::touchEvent(&table(), device).move(0, {x, 204});
-    QTest::touchEvent(&table(), device).release(0, {75, 204});
+        QTest::touchEvent(&table(), touchScreen()).move(0, {x, 204});
+    QTest::touchEvent(&table(), touchScreen()).release(0, {75, 204});
     turnEvents();
     EXPECT_EQ(title(), "Serving Cell Info");
     EXPECT_EQ(topPane().x(), 0);
@@ -136,10 +133,9 @@ TEST_F(BrowsingTest, SwipeThatIsTooShortStays)
 
 TEST_F(BrowsingTest, SwipeAtTheRootDoesNothing)
 {
-    QPointingDevice* device = QTest::createTouchDevice();
-    QTest::touchEvent(&table(), device).press(0, {5, 200});
-    QTest::touchEvent(&table(), device).move(0, {100, 200});
-    QTest::touchEvent(&table(), device).release(0, {200, 200});
+    QTest::touchEvent(&table(), touchScreen()).press(0, {5, 200});
+    QTest::touchEvent(&table(), touchScreen()).move(0, {100, 200});
+    QTest::touchEvent(&table(), touchScreen()).release(0, {200, 200});
     turnEvents();
     EXPECT_EQ(title(), "Orvane");
     EXPECT_EQ(topPane().x(), 0);

@@ -2,7 +2,6 @@
 
 #include "window/WindowTest.h"
 
-#include <QPointingDevice>
 #include <QScrollBar>
 #include <QScroller>
 #include <QTest>
@@ -28,13 +27,16 @@ protected:
         return rootNode(std::move(children));
     }
 
-    void touch(QPoint position) { QTest::touchEvent(&table(), device).press(0, position); }
+    void touch(QPoint position) { QTest::touchEvent(&table(), touchScreen()).press(0, position); }
     void moveTo(QPoint position)
     {
         QTest::qWait(10); // a finger has a speed
-        QTest::touchEvent(&table(), device).move(0, position);
+        QTest::touchEvent(&table(), touchScreen()).move(0, position);
     }
-    void release(QPoint position) { QTest::touchEvent(&table(), device).release(0, position); }
+    void release(QPoint position)
+    {
+        QTest::touchEvent(&table(), touchScreen()).release(0, position);
+    }
     void drag(QPoint from, QPoint to)
     {
         constexpr int kSteps = 8;
@@ -60,7 +62,6 @@ protected:
         QCoreApplication::sendEvent(&table(), &event);
     }
 
-    QPointingDevice* device = QTest::createTouchDevice();
     quint64 time = 0; // of the mouse's last event, in milliseconds
 };
 
@@ -129,7 +130,7 @@ TEST_F(TableTouchTest, PanUpwardsOnALongValueLeavesItWhereItIs)
 TEST_F(TableTouchTest, CancelledTouchPressesNothing)
 {
     touch(middleOf(4));
-    QTouchEvent cancel(QEvent::TouchCancel, device);
+    QTouchEvent cancel(QEvent::TouchCancel, touchScreen());
     QCoreApplication::sendEvent(&table(), &cancel);
     turnEvents();
     EXPECT_EQ(title(), "Orvane");

@@ -5,6 +5,7 @@
 
 #include <QApplication>
 #include <QDeadlineTimer>
+#include <QPointingDevice>
 #include <QTest>
 
 #include <chrono>
@@ -38,8 +39,15 @@ public:
     {
         qputenv("QT_QPA_PLATFORM", "offscreen");
         _application = std::make_unique<QtWindowApplication>();
+        touchDevice.reset(QTest::createTouchDevice());
     }
-    void TearDown() override { _application.reset(); }
+    void TearDown() override
+    {
+        touchDevice.reset();
+        _application.reset();
+    }
+
+    static inline std::unique_ptr<QPointingDevice> touchDevice;
 
 private:
     std::unique_ptr<QtWindowApplication> _application;
@@ -50,6 +58,8 @@ private:
     testing::AddGlobalTestEnvironment(new WindowEnvironment);
 
 } // namespace
+
+QPointingDevice* touchScreen() { return WindowEnvironment::touchDevice.get(); }
 
 void turnEvents()
 {

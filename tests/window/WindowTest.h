@@ -17,6 +17,7 @@
 #include <gtest/gtest.h>
 
 #include <QImage>
+#include <QPointingDevice>
 #include <QWidget>
 
 #include <functional>
@@ -26,6 +27,9 @@
 
 namespace orvane
 {
+
+// For QTest's touches.
+QPointingDevice* touchScreen();
 
 // Serves whatever there is to serve now.
 void turnEvents();
