@@ -1,5 +1,6 @@
 #include "app/AppOptions.h"
 
+#include "LogGenerator/LogTechnology.h"
 #include "platform/CommandLine.h"
 #include "platform/LogOption.h"
 
@@ -18,6 +19,7 @@ constexpr CommandLineOption kOptions[] = {
     {"version",       Value::None    },
     {"demo",          Value::Optional},
     {"ui",            Value::Required},
+    {"technology",    Value::Required},
     {"ports",         Value::Required},
     {"root",          Value::Required},
     {"refresh",       Value::Required},
@@ -28,6 +30,7 @@ constexpr CommandLineOption kOptions[] = {
     {kLogLevelOption, Value::Required},
 };
 
+constexpr const char* kOpenCommand = "open";
 constexpr const char* kDefaultScenario = "lte";
 constexpr double kShortestRefresh = 0.01;
 constexpr double kLongestRefresh = 86400;
@@ -64,12 +67,33 @@ void takeFrontEnd(AppOptions& options, CommandLine& line)
         line.fail("--ui takes window, terminal, text or json, not \"" + *name + "\"");
 }
 
-void takeWords(CommandLine& line, std::span<const std::string> scenarios)
+void takeOpen(AppOptions& options, CommandLine& line)
+{
+    if (line.words().size() != 2 || line.words().back().empty()) {
+        line.fail("open needs the name of one recording: orvane open FILE");
+        return;
+    }
+    options.open = line.words().back();
+    if (const auto name = line.value("technology")) {
+        options.technology = technologyNamed(*name);
+        if (!options.technology)
+            line.fail("there is no technology \"" + *name + "\": --technology takes " +
+                      technologyNames());
+    }
+    for (const char* live : {"demo", "ports", "root", "record", "force"})
+        if (line.has(live))
+            line.fail(std::string("--") + live +
+                      " is for the live view: a recording is opened without it");
+}
+
+void takeWords(AppOptions& options, CommandLine& line, std::span<const std::string> scenarios)
 {
     if (line.words().empty())
         return;
     const std::string& word = line.words().front();
-    if (std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end())
+    if (word == kOpenCommand)
+        takeOpen(options, line);
+    else if (std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end())
         line.fail("\"" + word + "\" is no command: for the simulated phone write --demo=" + word);
     else
         line.fail("\"" + word + "\" is no command: see orvane --help");
@@ -110,7 +134,9 @@ AppOptions parseAppOptions(std::span<const std::string> arguments,
         options.wantsVersion = line.has("version");
         if (options.wantsHelp || options.wantsVersion)
             return options;
-        takeWords(line, scenarios);
+        takeWords(options, line, scenarios);
+        if (line.has("technology") && !options.open)
+            line.fail("--technology is for recordings: orvane open FILE --technology NAME");
         takeFrontEnd(options, line);
         options.isFullScreen = line.has("fullscreen");
         takeDemo(options, line, scenarios);
@@ -140,8 +166,11 @@ FrontEndKind defaultFrontEnd(bool hasDisplay, bool hasTerminal)
 std::string appHelp(std::span<const std::string> scenarios)
 {
     return "Usage: orvane [OPTION...]\n"
+           "       orvane open FILE [OPTION...]\n"
+           "       orvane export FILE [OPTION...] [PATH...]    (see orvane export --help)\n"
            "Shows what the modem knows about the radio network, from this machine's telephony "
-           "server.\n"
+           "server\n"
+           "or from FILE, a recorded diagnostic log (.dlf) or a saved snapshot (.orvane).\n"
            "\n"
            "  --demo[=SCENARIO]         attach to a simulated phone: " +
            joined(scenarios) +
@@ -158,6 +187,10 @@ std::string appHelp(std::span<const std::string> scenarios)
            "                            /tmp/telephony-UID)\n"
            "  --root DIR                take the log folder and the install marker below DIR\n"
            "  --refresh SECONDS         the refresh period (default 2.0)\n"
+           "  --technology NAME         what FILE is a recording of: " +
+           technologyNames() +
+           "\n"
+           "                            (default: by the log codes in it)\n"
            "  --record FILE             write every message of the modem to FILE, a diagnostic "
            "log\n"
            "  --force                   overwrite FILE where it is there already\n" +

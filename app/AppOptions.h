@@ -23,8 +23,10 @@ struct AppOptions {
     std::string ports;               // empty where not given
     std::optional<std::string> root; // nothing where not given
     std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
-    std::optional<std::string> record; // the file to record to
-    bool overwritesRecord = false;     // also where it is there already
+    std::optional<std::string> open;       // a recording, instead of the live view
+    std::optional<std::string> technology; // its technology constant; nothing where not given
+    std::optional<std::string> record;     // the file to record to
+    bool overwritesRecord = false;         // also where it is there already
     std::unique_ptr<SystemLog> log;
 
     // One line that says what is wrong and what to do; then nothing else counts.

@@ -4,6 +4,7 @@
 #include "app/program/Display.h"
 #include "app/program/ExportProgram.h"
 #include "app/program/FrontEnd.h"
+#include "app/program/OpenProgram.h"
 #include "app/program/ProgramServices.h"
 #include "app/program/SimulatedPhone.h"
 #include "app/program/TerminalFrontEnd.h"
@@ -94,6 +95,10 @@ int run(const AppOptions& options, FrontEndKind kind)
     if (kind == FrontEndKind::Window)
         windowApplication.emplace();
     QtEventLoop loop;
+    if (options.open)
+        return kind == FrontEndKind::Text || kind == FrontEndKind::Json
+                   ? printRecording(options, kind, loop)
+                   : browseRecording(options, makeFrontEnd(kind, options, loop), loop);
     if (options.demo) {
         const PrivatePortsDirectory directory;
         const std::string root = options.root ? *options.root : simulatedPhoneRoot();

@@ -3,16 +3,14 @@
 #include "app/ExportOptions.h"
 #include "app/program/FrontEnd.h"
 #include "app/program/ProgramServices.h"
+#include "app/program/TerminalProgress.h"
 #include "platform/OutputDescriptor.h"
-#include "platform/ProgressLine.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"
 
 #include <cstdio>
 #include <exception>
-#include <optional>
-#include <sys/stat.h>
 #include <unistd.h>
 
 namespace orvane
@@ -68,30 +66,13 @@ std::unique_ptr<RowWriter> makeWriter(ExportFormat format, RowWriter::Output out
     return std::make_unique<JsonRowWriter>(std::move(output));
 }
 
-// Standard error is a terminal, and standard output does not write on the same one.
-bool canShowProgress()
-{
-    struct stat error {
-    };
-    struct stat output {
-    };
-    if (!isatty(STDERR_FILENO) || fstat(STDERR_FILENO, &error) != 0)
-        return false;
-    return !isatty(STDOUT_FILENO) || fstat(STDOUT_FILENO, &output) != 0 ||
-           output.st_rdev != error.st_rdev;
-}
-
 // Returns the exit status.
 int exportRecording(const ExportOptions& options)
 {
     Output output;
     const auto writer = makeWriter(
         options.format, [&output](std::string_view lines) { return output.write(lines); });
-    std::optional<ProgressLine> progress;
-    if (canShowProgress())
-        progress.emplace("Reading " + options.request.file, [](std::string_view text) {
-            std::fwrite(text.data(), 1, text.size(), stderr);
-        });
+    auto progress = progressOnTerminal("Reading " + options.request.file);
     RecordingExport recordingExport(options.request, *writer, [&progress](double done) {
         if (progress)
             progress->show(done);
@@ -117,7 +98,7 @@ int runExport(std::span<const std::string> arguments)
         std::fputs(exportHelp().c_str(), stdout);
         return 0;
     }
-    const ProgramServices services(options.log.get());
+    const ProgramServices services(options.log.get(), stderr);
     try {
         return exportRecording(options);
     } catch (const std::exception& failure) {

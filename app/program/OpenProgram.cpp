@@ -1,0 +1,101 @@
+#include "app/program/OpenProgram.h"
+
+#include "app/program/PrintedOutput.h"
+#include "app/program/TerminalProgress.h"
+#include "platform/qt/LineReader.h"
+#include "platform/qt/QtEventLoop.h"
+#include "platform/qt/QtMainQueue.h"
+#include "platform/qt/SignalWatcher.h"
+#include "recordings/RecordingApp.h"
+#include "recordings/RecordingPrinter.h"
+
+#include <chrono>
+#include <stdexcept>
+#include <unistd.h>
+
+namespace orvane
+{
+
+namespace
+{
+
+OpenedRecording opened(const AppOptions& options)
+{
+    OpenedRecording recording = openRecording(*options.open);
+    if (recording.error)
+        throw std::runtime_error(*recording.error);
+    return recording;
+}
+
+RecordingSettings settingsOf(const AppOptions& options)
+{
+    return {*options.open, options.technology, options.refreshInterval};
+}
+
+// Commands of a front end that prints: there is nothing to save.
+void takeLine(std::string_view line, OutputPane& output, QtEventLoop& loop)
+{
+    if (line.ends_with('\r'))
+        line.remove_suffix(1);
+    if (line == "quit")
+        loop.quit();
+    else if (!line.empty())
+        output.showError("the only command while a recording is printed is quit");
+}
+
+} // namespace
+
+int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop)
+{
+    QtMainQueue queue;
+    PrintedOutput output(kind, false, loop);
+    auto progress = progressOnTerminal("Reading " + *options.open);
+    std::unique_ptr<RecordingPrinter> printer;
+    printer = std::make_unique<RecordingPrinter>(queue, opened(options), settingsOf(options),
+                                                 output.pane(), [&] {
+                                                     if (progress)
+                                                         progress->show(printer->progress());
+                                                     if (printer->hasEnded())
+                                                         loop.quit();
+                                                 });
+    const LineReader lines(
+        STDIN_FILENO, [&](std::string_view line, bool) { takeLine(line, output.pane(), loop); });
+    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    loop.run();
+    progress.reset();
+    if (printer->failure()) {
+        complain(*printer->failure());
+        return kFailure;
+    }
+    if (const std::string remark = printer->remark(); printer->hasEnded() && !remark.empty())
+        complain(*options.open + ": " + remark);
+    return output.exitStatus();
+}
+
+int browseRecording(const AppOptions& options, std::unique_ptr<FrontEnd> frontEnd,
+                    QtEventLoop& loop)
+{
+    QtMainQueue queue;
+    const FileSystem files;
+    std::optional<std::string> failure;
+    const auto fail = [&](const std::string& text) {
+        failure = text;
+        loop.quit();
+    };
+    const auto now = [] {
+        return std::chrono::nanoseconds(std::chrono::steady_clock::now().time_since_epoch());
+    };
+    RecordingApp app({queue, now, files, fail}, opened(options), settingsOf(options));
+    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    app.applicationDidFinishLaunching();
+    loop.run();
+    app.applicationWillTerminate();
+    const int status = frontEnd->exitStatus();
+    // A terminal's screen must go before anything is told.
+    frontEnd.reset();
+    if (failure)
+        complain(*failure);
+    return failure ? kFailure : status;
+}
+
+} // namespace orvane

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "app/program/FrontEnd.h"
+
+#include <memory>
+
+namespace orvane
+{
+
+// `orvane open FILE` in the front ends that print: the whole recording, once. Returns the exit
+// status. The options are those of a recording.
+int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop);
+
+// The same in the front ends that a person browses in, until they leave.
+int browseRecording(const AppOptions& options, std::unique_ptr<FrontEnd> frontEnd,
+                    QtEventLoop& loop);
+
+} // namespace orvane

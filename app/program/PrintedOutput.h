@@ -1,0 +1,34 @@
+#pragma once
+
+#include "app/AppOptions.h"
+#include "platform/OutputDescriptor.h"
+#include "ui/output/OutputPane.h"
+
+#include <memory>
+
+namespace orvane
+{
+
+class QtEventLoop;
+
+// Standard output, printed on as text or JSON, waiting while its reader is behind. Where nobody
+// reads any more, or nothing can be written, the loop ends.
+class PrintedOutput
+{
+public:
+    // The loop is referred to and must outlive it.
+    PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& loop);
+
+    [[nodiscard]] OutputPane& pane() { return *_pane; }
+    // What the program ends with; tells what is wrong.
+    [[nodiscard]] int exitStatus() const;
+
+private:
+    void print(std::string_view text);
+
+    QtEventLoop& _loop;
+    OutputDescriptor _output;
+    std::unique_ptr<OutputPane> _pane;
+};
+
+} // namespace orvane
