@@ -69,7 +69,7 @@ TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
         {{"--log", "paper"},          "--log takes"                },
         {{"--log-level", "loud"},     "--log-level takes"          },
         {{"--demo", "lte"},           "write --demo=lte"           },
-        {{"open"},                    "orvane --help"              },
+        {{"watch"},                   "orvane --help"              },
         {{"--frobnicate"},            "--frobnicate"               },
     };
     for (const auto& mistake : kMistakes) {
@@ -104,9 +104,9 @@ TEST(AppOptionsTest, ByDefaultAWindowElseTheTerminalElseText)
 TEST(AppOptionsTest, HelpNamesEveryOptionAndScenario)
 {
     const std::string help = appHelp(kScenarios);
-    for (const char* word :
-         {"--demo", "--ui", "--fullscreen", "--ports", "--root", "--refresh", "--record", "--force",
-          "--log", "--log-level", "--help", "--version", "lte, umts", "Exit status"})
+    for (const char* word : {"--demo", "--ui", "--fullscreen", "--ports", "--root", "--refresh",
+                             "--record", "--force", "--log", "--log-level", "--technology",
+                             "--help", "--version", "lte, umts", "Exit status"})
         EXPECT_THAT(help, HasSubstr(word));
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
     EXPECT_TRUE(parsed({"--version"}).wantsVersion);
