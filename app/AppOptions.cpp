@@ -1,6 +1,8 @@
 #include "app/AppOptions.h"
 
 #include "LogGenerator/LogTechnology.h"
+#include "LogGenerator/TechnologyOption.h"
+#include "app/ExportOptions.h"
 #include "platform/CommandLine.h"
 #include "platform/LogOption.h"
 
@@ -74,12 +76,7 @@ void takeOpen(AppOptions& options, CommandLine& line)
         return;
     }
     options.open = line.words().back();
-    if (const auto name = line.value("technology")) {
-        options.technology = technologyNamed(*name);
-        if (!options.technology)
-            line.fail("there is no technology \"" + *name + "\": --technology takes " +
-                      technologyNames());
-    }
+    options.technology = technologyFromOption(line);
     for (const char* live : {"demo", "ports", "root", "record", "force"})
         if (line.has(live))
             line.fail(std::string("--") + live +
@@ -93,6 +90,8 @@ void takeWords(AppOptions& options, CommandLine& line, std::span<const std::stri
     const std::string& word = line.words().front();
     if (word == kOpenCommand)
         takeOpen(options, line);
+    else if (word == kExportCommand)
+        line.fail("export must be the first word: orvane export FILE [OPTION...] [PATH...]");
     else if (std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end())
         line.fail("\"" + word + "\" is no command: for the simulated phone write --demo=" + word);
     else

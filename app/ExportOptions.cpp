@@ -1,6 +1,7 @@
 #include "app/ExportOptions.h"
 
 #include "LogGenerator/LogTechnology.h"
+#include "LogGenerator/TechnologyOption.h"
 #include "platform/CommandLine.h"
 #include "platform/LogOption.h"
 
@@ -53,16 +54,6 @@ void takeFormat(ExportOptions& options, CommandLine& line)
     }
 }
 
-void takeTechnology(ExportRequest& request, CommandLine& line)
-{
-    const std::optional<std::string> name = line.value("technology");
-    if (!name)
-        return;
-    request.technology = technologyNamed(*name);
-    if (!request.technology)
-        line.fail("--technology takes one of " + technologyNames() + ", not \"" + *name + "\"");
-}
-
 } // namespace
 
 ExportOptions parseExportOptions(std::span<const std::string> arguments)
@@ -75,7 +66,7 @@ ExportOptions parseExportOptions(std::span<const std::string> arguments)
             return options;
         takeWords(options.request, line);
         takeFormat(options, line);
-        takeTechnology(options.request, line);
+        options.request.technology = technologyFromOption(line);
         if (const auto seconds = line.number("every", kShortestPeriod, kLongestPeriod))
             options.request.period =
                 std::chrono::duration_cast<LogTime>(std::chrono::duration<double>(*seconds));
@@ -87,7 +78,7 @@ ExportOptions parseExportOptions(std::span<const std::string> arguments)
 
 std::string exportHelp()
 {
-    return "Usage: orvane export [OPTION...] FILE [PATH...]\n"
+    return "Usage: orvane export FILE [OPTION...] [PATH...]\n"
            "Writes rows of a recording to standard output, one line a refresh period.\n"
            "\n"
            "FILE is a diagnostic log (.dlf) or a saved snapshot (.orvane), which gives a line for "

@@ -1,6 +1,5 @@
 #include "recordings/RecordingExport.h"
 
-#include "platform/Console.h"
 #include "recordings/LogSurvey.h"
 
 #include <utility>
@@ -42,7 +41,7 @@ std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSo
         _progress(periods.progress());
     _progress(1);
     if (const std::string remark = periods.remark(); _isReadOn && !remark.empty())
-        consoleLine("%s", remark.c_str());
+        _remarks.push_back(_request.file + ": " + remark);
     return std::nullopt;
 }
 
@@ -72,15 +71,19 @@ std::optional<std::string> RecordingExport::finish()
 {
     const std::vector<std::string> missing = _table.missingPaths();
     if (_isReadOn && missing.size() == _request.paths.size() && !missing.empty())
-        return "nothing in \"" + _request.file + "\" has the path \"" + missing.front() +
-               "\": see orvane export --list for those that occur";
+        return missingText(missing.front());
     if (auto problem = _writer.finish(_table))
         return problem;
     for (const std::string& path : missing)
         if (_isReadOn)
-            consoleLine("Nothing in \"%s\" has the path \"%s\".", _request.file.c_str(),
-                        path.c_str());
+            _remarks.push_back(missingText(path));
     return std::nullopt;
+}
+
+std::string RecordingExport::missingText(const std::string& path) const
+{
+    return _request.file + ": nothing has the path \"" + path +
+           "\": see orvane export --list for those that occur";
 }
 
 } // namespace orvane

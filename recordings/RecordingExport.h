@@ -22,7 +22,6 @@ struct ExportRequest {
 // Hands the rows of a recording to a writer: of a log what is shown at the end of each refresh
 // period, of a snapshot what each of its entries shows. Memory does not grow with the file.
 //
-// Bytes that could not be placed, and paths that do not occur, are told on the console.
 class RecordingExport
 {
 public:
@@ -34,6 +33,9 @@ public:
 
     // One line that says what is wrong and what to do where it fails.
     std::optional<std::string> run();
+    // Then: lines that tell what a person should know, as bytes that could not be placed, and paths
+    // that do not occur.
+    [[nodiscard]] const std::vector<std::string>& remarks() const { return _remarks; }
 
 private:
     std::optional<std::string> takeLog(const std::shared_ptr<ByteSource>& log);
@@ -41,12 +43,14 @@ private:
     void takeEntries(const Snapshot& snapshot);
     void take(const std::string& time, const PropertyValue& display);
     std::optional<std::string> finish();
+    [[nodiscard]] std::string missingText(const std::string& path) const;
 
     const ExportRequest _request;
     RowWriter& _writer;
     Progress _progress;
     RowTable _table;
     bool _isReadOn = true;
+    std::vector<std::string> _remarks;
 };
 
 } // namespace orvane

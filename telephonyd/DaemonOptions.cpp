@@ -1,6 +1,7 @@
 #include "telephonyd/DaemonOptions.h"
 
 #include "LogGenerator/LogTechnology.h"
+#include "LogGenerator/TechnologyOption.h"
 #include "platform/CommandLine.h"
 #include "platform/LogOption.h"
 
@@ -58,12 +59,7 @@ void takeReplay(DaemonOptions& options, CommandLine& line)
     options.replay = line.value("replay");
     if (options.replay->empty())
         line.fail("--replay needs the name of a recording");
-    if (const auto name = line.value("technology")) {
-        options.technology = technologyNamed(*name);
-        if (!options.technology)
-            line.fail("there is no technology \"" + *name + "\": --technology takes " +
-                      technologyNames());
-    }
+    options.technology = technologyFromOption(line);
     if (line.value("speed") == kFullSpeed)
         options.speed.reset();
     else if (const auto speed = line.value("speed")) {

@@ -2,9 +2,9 @@
 
 #include "app/ExportOptions.h"
 #include "app/program/FrontEnd.h"
+#include "app/program/PrintedOutput.h"
 #include "app/program/ProgramServices.h"
 #include "app/program/TerminalProgress.h"
-#include "platform/OutputDescriptor.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"
@@ -39,11 +39,7 @@ public:
     [[nodiscard]] int end()
     {
         flush();
-        if (_descriptor.state() != OutputDescriptor::State::Failed)
-            return 0;
-        complain(std::string("standard output cannot be written: ") + _descriptor.failure() +
-                 "; send it somewhere else");
-        return kFailure;
+        return exitStatusOf(_descriptor);
     }
 
 private:
@@ -81,6 +77,8 @@ int exportRecording(const ExportOptions& options)
     progress.reset();
     if (problem)
         complain(*problem);
+    for (const std::string& remark : recordingExport.remarks())
+        complain(remark);
     const int status = output.end();
     return problem ? kFailure : status;
 }

@@ -20,11 +20,11 @@ PrintedOutput::PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& l
         _pane = std::make_unique<TextPane>(write, isSimulated);
 }
 
-int PrintedOutput::exitStatus() const
+int exitStatusOf(const OutputDescriptor& output)
 {
-    if (_output.state() != OutputDescriptor::State::Failed)
+    if (output.state() != OutputDescriptor::State::Failed)
         return 0;
-    complain(std::string("standard output cannot be written: ") + _output.failure() +
+    complain(std::string("standard output cannot be written: ") + output.failure() +
              "; send it somewhere else");
     return kFailure;
 }

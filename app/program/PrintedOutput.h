@@ -11,6 +11,9 @@ namespace orvane
 
 class QtEventLoop;
 
+// What a program ends with that has written to this output; tells what is wrong.
+int exitStatusOf(const OutputDescriptor& output);
+
 // Standard output, printed on as text or JSON, waiting while its reader is behind. Where nobody
 // reads any more, or nothing can be written, the loop ends.
 class PrintedOutput
@@ -21,7 +24,7 @@ public:
 
     [[nodiscard]] OutputPane& pane() { return *_pane; }
     // What the program ends with; tells what is wrong.
-    [[nodiscard]] int exitStatus() const;
+    [[nodiscard]] int exitStatus() const { return exitStatusOf(_output); }
 
 private:
     void print(std::string_view text);

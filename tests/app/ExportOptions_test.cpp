@@ -1,5 +1,6 @@
 #include "app/ExportOptions.h"
 
+#include "app/AppOptions.h"
 #include "platform/TelephonyServer.h"
 
 #include <gmock/gmock.h>
@@ -66,6 +67,12 @@ TEST(ExportOptionsTest, UnusableArgumentsSayWhatToDo)
     EXPECT_THAT(errorOf({"f", "--ui", "json"}), HasSubstr("--ui"));
     for (const char* period : {"0", "-1", "soon", "1e9", "nan"})
         EXPECT_THAT(errorOf({"f", "--every", period}), HasSubstr("--every")) << period;
+}
+
+TEST(ExportOptionsTest, TheCommandIsTheFirstWordOfTheLine)
+{
+    const std::vector<std::string> arguments = {"--log", "none", "export", "f"};
+    EXPECT_THAT(parseAppOptions(arguments, {}).error.value_or(""), HasSubstr("the first word"));
 }
 
 } // namespace

@@ -137,7 +137,7 @@ TEST(ExportProgramTest, HelpSaysWhatItTakes)
 {
     ChildProcess help({ORVANE_PROGRAM, "export", "--help"});
     EXPECT_EQ(help.waitForEnd(), 0);
-    EXPECT_THAT(help.lines(), Contains("Usage: orvane export [OPTION...] FILE [PATH...]"));
+    EXPECT_THAT(help.lines(), Contains("Usage: orvane export FILE [OPTION...] [PATH...]"));
 }
 
 } // namespace orvane
