@@ -67,14 +67,10 @@ protected:
     }
     std::vector<std::string> environment(const std::vector<std::string>& more) const
     {
-        std::vector<std::string> all = {"TERM=xterm-256color",
-                                        "LANG=C.UTF-8",
-                                        "LC_ALL",
-                                        "LC_CTYPE",
-                                        "NO_COLOR",
-                                        "LINES",
-                                        "COLUMNS",
-                                        "HOME=" + directory.path()};
+        std::vector<std::string> all = {"TERM=xterm-256color", "LANG=C.UTF-8", "LC_ALL", "LC_CTYPE",
+                                        "NO_COLOR", "LINES", "COLUMNS", "HOME=" + directory.path(),
+                                        // The console's mouse driver leaks the terminal's name.
+                                        "NCURSES_GPM_TERMS=none"};
         all.insert(all.end(), more.begin(), more.end());
         return all;
     }
