@@ -15,25 +15,19 @@ constexpr int kGap = 2; // between hints
 
 int columnsOf(const Hint& hint) { return orvane::columnsOf(hint.key + " " + hint.what); }
 
-// The hints that fit, those at the end first.
-std::vector<Hint> fitting(const std::vector<Hint>& hints, int columns)
+// The hints that fit: the last two, and of the others the first ones.
+std::vector<Hint> fitting(std::vector<Hint> hints, int columns)
 {
     constexpr std::size_t kAlways = 2;
-    const std::size_t optional = hints.size() > kAlways ? hints.size() - kAlways : 0;
-    int left = columns - 2;
-    for (std::size_t i = optional; i < hints.size(); ++i)
-        left -= columnsOf(hints[i]) + kGap;
-    std::vector<Hint> result;
-    for (std::size_t i = 0; i < hints.size(); ++i) {
-        if (i < optional) {
-            const int taken = columnsOf(hints[i]) + kGap;
-            if (taken > left + kGap)
-                continue;
-            left -= taken;
-        }
-        result.push_back(hints[i]);
+    int taken = 0;
+    for (const Hint& hint : hints)
+        taken += columnsOf(hint) + (taken > 0 ? kGap : 0);
+    while (taken > columns && hints.size() > kAlways) {
+        const auto least = hints.end() - kAlways - 1;
+        taken -= columnsOf(*least) + kGap;
+        hints.erase(least);
     }
-    return result;
+    return hints;
 }
 
 } // namespace
@@ -85,7 +79,7 @@ void drawHints(Canvas& canvas, int line, const std::vector<Hint>& hints,
                const std::function<void(const Key&)>& press)
 {
     int column = 1;
-    for (const Hint& hint : fitting(hints, canvas.columns())) {
+    for (const Hint& hint : fitting(hints, canvas.columns() - 1)) {
         const int start = column;
         column = canvas.grid.put(line, column, hint.key, {Ink::StatusKey, false});
         column = canvas.grid.put(line, column, " " + hint.what, {Ink::Status, false});

@@ -1,4 +1,4 @@
-#include "platform/toolkit/Playback.h"
+#include "platform/fake/FakePlayback.h"
 
 #include "terminal/TerminalScreenTest.h"
 
@@ -15,54 +15,20 @@ using ::testing::StartsWith;
 
 using Kind = Key::Kind;
 
-// A recording of an hour that notes what is asked of it.
-class NotedPlayback final : public Playback
-{
-public:
-    [[nodiscard]] double progress() const override { return read; }
-    void stopReading() override { calls.emplace_back("stopReading"); }
-    [[nodiscard]] double position() const override { return at; }
-    [[nodiscard]] double duration() const override { return 3600; }
-    [[nodiscard]] std::string positionText() const override { return "2026-11-21 10:00:00 UTC"; }
-    [[nodiscard]] std::string remark() const override { return note; }
-    [[nodiscard]] bool isPlaying() const override { return plays; }
-    [[nodiscard]] double speed() const override { return 10; }
-    void play() override { calls.emplace_back("play"); }
-    void pause() override { calls.emplace_back("pause"); }
-    void faster() override { calls.emplace_back("faster"); }
-    void slower() override { calls.emplace_back("slower"); }
-    void step() override { calls.emplace_back("step"); }
-    void stepBack() override { calls.emplace_back("stepBack"); }
-    void jumpTo(double position) override
-    {
-        calls.push_back("jumpTo " + std::to_string(static_cast<int>(position)));
-    }
-    void jumpToEnd() override { calls.emplace_back("jumpToEnd"); }
-    void jumpToNextServingCell() override { calls.emplace_back("jumpToNextServingCell"); }
-    bool jumpToText(const std::string& text) override
-    {
-        calls.push_back("jumpToText " + text);
-        return text.starts_with('+');
-    }
-
-    std::vector<std::string> calls;
-    double read = 1;
-    double at = 900;
-    bool plays = false;
-    std::string note;
-};
-
 class PlaybackLineTest : public TerminalScreenTest
 {
 protected:
     PlaybackLineTest()
     {
+        playback.length = 3600;
+        playback.at = 900;
+        playback.rate = 10;
         screen->setPlayback(&playback);
         refresh(numberedRows(3));
     }
     ~PlaybackLineTest() override { screen->setPlayback(nullptr); }
 
-    NotedPlayback playback;
+    FakePlayback playback;
 };
 
 } // namespace
@@ -70,7 +36,7 @@ protected:
 TEST_F(PlaybackLineTest, StateSpeedPositionAndTimeAreShown)
 {
     EXPECT_THAT(device.text(21), StartsWith(" ‖ paused 10x  ━"));
-    EXPECT_THAT(device.text(21), EndsWith("─  15:00 / 1:00:00  2026-11-21 10:00:00 UTC"));
+    EXPECT_THAT(device.text(21), EndsWith("─  15:00 / 1:00:00  2026-11-21 10:15:00 UTC"));
     playback.plays = true;
     screen->setNeedsUpdate();
     queue.runPending();
@@ -80,7 +46,7 @@ TEST_F(PlaybackLineTest, StateSpeedPositionAndTimeAreShown)
 TEST_F(PlaybackLineTest, OnANarrowTerminalTheTimeStays)
 {
     resize(10, 40);
-    EXPECT_EQ(device.text(7), " ‖ paused 10x   2026-11-21 10:00:00 UTC");
+    EXPECT_EQ(device.text(7), " ‖ paused 10x   2026-11-21 10:15:00 UTC");
 }
 
 TEST_F(PlaybackLineTest, TheKeysDriveIt)
@@ -95,12 +61,14 @@ TEST_F(PlaybackLineTest, TheKeysDriveIt)
 
 TEST_F(PlaybackLineTest, ATimeIsTypedAndJumpedTo)
 {
+    playback.takesText = false;
     type("g10:0q");
     EXPECT_THAT(device.text(23), StartsWith(" Go to time: 10:0q"));
     press(Kind::Enter);
     EXPECT_THAT(device.text(23), HasSubstr("not a time"));
     for (int i = 0; i < 5; ++i)
         press(Kind::Backspace);
+    playback.takesText = true;
     type("+90");
     press(Kind::Enter);
     EXPECT_THAT(playback.calls, ElementsAre("jumpToText 10:0q", "jumpToText +90"));
