@@ -1,4 +1,4 @@
-#include "window/FakePlayback.h"
+#include "platform/fake/FakePlayback.h"
 #include "window/WindowTest.h"
 
 #include <QApplication>

@@ -1,8 +1,8 @@
+#include "platform/fake/FakePlayback.h"
 #include "platform/window/PlaybackBar.h"
 
 #include "platform/window/FlatButton.h"
 #include "platform/window/TextLine.h"
-#include "window/FakePlayback.h"
 #include "window/WindowTest.h"
 
 #include <gmock/gmock.h>
