@@ -19,7 +19,7 @@ using Step = std::chrono::duration<std::int64_t, std::ratio<1, 800>>;
 
 constexpr milliseconds kFrom1970To1980{315964800000}; // 1980-01-06 00:00:00 UTC
 constexpr std::uint64_t kMostSteps =
-    static_cast<std::uint64_t>(std::chrono::duration_cast<Step>(LogTime::max()).count());
+    static_cast<std::uint64_t>(std::chrono::duration_cast<Step>(LogTime::max() / 2).count());
 
 } // namespace
 

@@ -7,7 +7,8 @@
 namespace orvane
 {
 
-// Time of a recording since its first item. What lies 290 years or more ahead counts as that.
+// Time of a recording since its first item. What lies more than 146 years ahead counts as 146
+// years, so that sums of two are safe.
 using LogTime = std::chrono::nanoseconds;
 
 // The clock of a recording: what LogTime 0 is. Of a timestamp only the whole steps of 1.25 ms count

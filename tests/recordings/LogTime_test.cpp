@@ -38,7 +38,8 @@ TEST(LogTimeTest, EarlierTimestampsAndNoneAreTheFirstMoment)
 TEST(LogTimeTest, FarTimestampsCountAsTheFarthestTime)
 {
     const LogClock clock(0);
-    EXPECT_GT(clock.timeOf(UINT64_MAX), 290 * 365 * 24h);
+    EXPECT_GT(clock.timeOf(UINT64_MAX), 146 * 365 * 24h);
+    EXPECT_LE(clock.timeOf(UINT64_MAX), LogTime::max() / 2);
     EXPECT_EQ(clock.timeOf(UINT64_MAX), clock.timeOf(UINT64_MAX / 2));
 }
 
