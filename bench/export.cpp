@@ -74,7 +74,7 @@ void exportRows(benchmark::State& state, std::vector<std::string> paths)
             return true;
         });
         RecordingExport recordingExport({drive.path, std::nullopt, std::chrono::seconds(2), paths},
-                                        writer, [](double) {});
+                                        writer, [](double) { return true; });
         if (const auto problem = recordingExport.run())
             state.SkipWithError(problem->c_str());
     }

@@ -40,13 +40,17 @@ bool CsvRowWriter::takePeriod(const std::string& time, const RowTable& table)
     return _spool.error() == 0;
 }
 
-std::optional<std::string> CsvRowWriter::finish(const RowTable& table)
+void CsvRowWriter::finish(const RowTable& table)
 {
     _units.resize(table.rows().size());
     const std::vector<std::size_t> order = table.order();
     _spool.rewind();
     if (_spool.error() == 0 && _output(header(table, order)))
         writeLines(order);
+}
+
+std::optional<std::string> CsvRowWriter::problem() const
+{
     if (_spool.error() == 0)
         return std::nullopt;
     return std::string("the rows cannot be kept in the directory for temporary files (") +

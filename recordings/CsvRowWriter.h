@@ -21,7 +21,8 @@ public:
     explicit CsvRowWriter(Output output) : _output(std::move(output)) {}
 
     bool takePeriod(const std::string& time, const RowTable& table) override;
-    std::optional<std::string> finish(const RowTable& table) override;
+    void finish(const RowTable& table) override;
+    [[nodiscard]] std::optional<std::string> problem() const override;
 
 private:
     [[nodiscard]] std::string header(const RowTable& table,

@@ -5,14 +5,13 @@
 namespace orvane
 {
 
-std::optional<std::string> PathListWriter::finish(const RowTable& table)
+void PathListWriter::finish(const RowTable& table)
 {
     for (const std::size_t i : table.order()) {
         const RowTable::Row& row = table.rows()[i];
         if (row.lastPeriod != 0 && !_output(shownText(row.path) + "\n"))
-            break;
+            return;
     }
-    return std::nullopt;
 }
 
 } // namespace orvane

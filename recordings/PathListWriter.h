@@ -14,7 +14,7 @@ public:
     explicit PathListWriter(Output output) : _output(std::move(output)) {}
 
     bool takePeriod(const std::string&, const RowTable&) override { return true; }
-    std::optional<std::string> finish(const RowTable& table) override;
+    void finish(const RowTable& table) override;
 
 private:
     Output _output;

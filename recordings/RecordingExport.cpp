@@ -37,9 +37,9 @@ std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSo
             return survey.complaint(_request.file);
     }
     RefreshPeriods periods(log, *technology, _request.period);
-    while (_isReadOn && takeSlice(periods))
-        _progress(periods.progress());
-    _progress(1);
+    while (takeSlice(periods))
+        goOnIf(_progress(periods.progress()));
+    goOnIf(_progress(1));
     if (const std::string remark = periods.remark(); _isReadOn && !remark.empty())
         _remarks.push_back(_request.file + ": " + remark);
     return std::nullopt;
@@ -48,6 +48,8 @@ std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSo
 // False at the end.
 bool RecordingExport::takeSlice(RefreshPeriods& periods)
 {
+    if (!_isReadOn)
+        return false;
     const auto reached = periods.takeSlice();
     if (reached == RefreshPeriods::Reached::Period)
         take(periods.play().clock().isoText(periods.time()), periods.play().display());
@@ -64,20 +66,20 @@ void RecordingExport::takeEntries(const Snapshot& snapshot)
 void RecordingExport::take(const std::string& time, const PropertyValue& display)
 {
     _table.take(display);
-    _isReadOn = _writer.takePeriod(time, _table);
+    goOnIf(_writer.takePeriod(time, _table));
 }
 
 std::optional<std::string> RecordingExport::finish()
 {
-    const std::vector<std::string> missing = _table.missingPaths();
-    if (_isReadOn && missing.size() == _request.paths.size() && !missing.empty())
-        return missingText(missing.front());
-    if (auto problem = _writer.finish(_table))
-        return problem;
-    for (const std::string& path : missing)
-        if (_isReadOn)
+    if (_isReadOn) {
+        const std::vector<std::string> missing = _table.missingPaths();
+        if (!missing.empty() && missing.size() == _request.paths.size())
+            return missingText(missing.front());
+        for (const std::string& path : missing)
             _remarks.push_back(missingText(path));
-    return std::nullopt;
+        _writer.finish(_table);
+    }
+    return _writer.problem();
 }
 
 std::string RecordingExport::missingText(const std::string& path) const

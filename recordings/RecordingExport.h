@@ -25,8 +25,8 @@ struct ExportRequest {
 class RecordingExport
 {
 public:
-    // How much of the file has been read, 0 to 1.
-    using Progress = std::function<void(double)>;
+    // Takes how much of the file has been read, 0 to 1. False gives up on the rest.
+    using Progress = std::function<bool(double)>;
 
     // The writer is referred to.
     RecordingExport(ExportRequest request, RowWriter& writer, Progress progress);
@@ -42,6 +42,7 @@ private:
     bool takeSlice(RefreshPeriods& periods);
     void takeEntries(const Snapshot& snapshot);
     void take(const std::string& time, const PropertyValue& display);
+    void goOnIf(bool isReadOn) { _isReadOn = _isReadOn && isReadOn; }
     std::optional<std::string> finish();
     [[nodiscard]] std::string missingText(const std::string& path) const;
 

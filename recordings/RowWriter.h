@@ -21,8 +21,10 @@ public:
     // The table has taken a period; `time` is the recording's, "2026-11-21T10:00:00.000Z", empty
     // where it is not known. False where nobody reads on.
     virtual bool takePeriod(const std::string& time, const RowTable& table) = 0;
-    // No further period comes. One line for the user where something went wrong.
-    virtual std::optional<std::string> finish(const RowTable&) { return std::nullopt; }
+    // The last period has been taken.
+    virtual void finish(const RowTable&) {}
+    // One line for the user where something went wrong that is not the output's.
+    [[nodiscard]] virtual std::optional<std::string> problem() const { return std::nullopt; }
 };
 
 } // namespace orvane

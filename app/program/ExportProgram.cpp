@@ -9,6 +9,7 @@
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"
 
+#include <csignal>
 #include <cstdio>
 #include <exception>
 #include <unistd.h>
@@ -18,6 +19,17 @@ namespace orvane
 
 namespace
 {
+
+volatile std::sig_atomic_t isInterrupted = 0;
+
+// Lets SIGINT and SIGTERM end the export, also while it waits for the reader of its output.
+void endOnSignals()
+{
+    struct sigaction action = {};
+    action.sa_handler = [](int) { isInterrupted = 1; };
+    for (const int signal : {SIGINT, SIGTERM})
+        sigaction(signal, &action, nullptr);
+}
 
 // Standard output, written to in large pieces.
 class Output
@@ -33,12 +45,13 @@ public:
     {
         const auto state = _descriptor.write(_pending);
         _pending.clear();
-        return state == OutputDescriptor::State::Open;
+        return state == OutputDescriptor::State::Open && isInterrupted == 0;
     }
     // The exit status; tells what is wrong.
     [[nodiscard]] int end()
     {
-        flush();
+        if (isInterrupted == 0)
+            flush();
         return exitStatusOf(_descriptor);
     }
 
@@ -72,6 +85,7 @@ int exportRecording(const ExportOptions& options)
     RecordingExport recordingExport(options.request, *writer, [&progress](double done) {
         if (progress)
             progress->show(done);
+        return isInterrupted == 0;
     });
     const auto problem = recordingExport.run();
     progress.reset();
@@ -96,6 +110,7 @@ int runExport(std::span<const std::string> arguments)
         std::fputs(exportHelp().c_str(), stdout);
         return 0;
     }
+    endOnSignals();
     const ProgramServices services(options.log.get(), stderr);
     try {
         return exportRecording(options);

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <csignal>
 
 namespace orvane
 {
@@ -106,6 +107,17 @@ TEST(ExportProgramTest, AReaderThatLeavesEndsItNormally)
     program.closeOutput();
     EXPECT_EQ(program.waitForEnd(), 0);
     EXPECT_THAT(program.errors(), IsEmpty());
+}
+
+TEST(ExportProgramTest, SignalsEndItInOrderAlsoWhileNobodyReads)
+{
+    for (const int signal : {SIGINT, SIGTERM}) {
+        ChildProcess program(exportArguments({kDrive, "--every", "0.001"}));
+        ASSERT_TRUE(program.waitForFullOutput());
+        program.sendSignal(signal);
+        EXPECT_EQ(program.waitForEnd(), 0);
+        EXPECT_THAT(program.errors(), IsEmpty());
+    }
 }
 
 TEST(ExportProgramTest, AFullDiskUnderTheOutputIsAFailure)

@@ -35,8 +35,10 @@ protected:
     // What is wrong, or "".
     std::string run(RowWriter& writer)
     {
-        RecordingExport recordingExport(request, writer,
-                                        [this](double done) { progress.push_back(done); });
+        RecordingExport recordingExport(request, writer, [this](double done) {
+            progress.push_back(done);
+            return progress.size() < slicesWanted;
+        });
         const auto problem = recordingExport.run();
         remarks = recordingExport.remarks();
         return problem.value_or("");
@@ -67,6 +69,7 @@ protected:
     std::string written;
     int linesWanted = 1'000'000;
     std::vector<double> progress;
+    std::size_t slicesWanted = SIZE_MAX;
     std::vector<std::string> remarks;
 };
 
@@ -178,6 +181,17 @@ TEST_F(RecordingExportTest, StopsOnceNobodyReads)
     EXPECT_EQ(runJson(), "");
     EXPECT_EQ(std::count(written.begin(), written.end(), '\n'), 3);
     EXPECT_LT(progress.size(), 20U) << "the rest is not read";
+}
+
+TEST_F(RecordingExportTest, GivesUpWhereItIsAskedTo)
+{
+    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    slicesWanted = 3;
+    EXPECT_EQ(runCsv(), "");
+    EXPECT_EQ(written, "") << "no part of a table";
+    progress.clear();
+    EXPECT_EQ(runJson(), "");
+    EXPECT_EQ(std::count(written.begin(), written.end(), '\n'), 3);
 }
 
 TEST_F(RecordingExportTest, TellsItsProgress)

@@ -33,7 +33,11 @@ protected:
         table.take(PropertyValue::dictionaryOf(rows));
         return writer.takePeriod(std::to_string(++periods), table);
     }
-    void finish(RowWriter& writer) { EXPECT_EQ(writer.finish(table), std::nullopt); }
+    void finish(RowWriter& writer)
+    {
+        writer.finish(table);
+        EXPECT_EQ(writer.problem(), std::nullopt);
+    }
 
     RowTable table{{}};
     std::string written;
@@ -201,7 +205,8 @@ TEST_F(CsvTest, WithoutADirectoryForTemporaryFilesItSaysWhatToDo)
     EXPECT_FALSE(take(writer, {
                                   {"a", "x"}
     }));
-    EXPECT_THAT(writer.finish(table).value_or(""), HasSubstr("set TMPDIR to one with room"));
+    writer.finish(table);
+    EXPECT_THAT(writer.problem().value_or(""), HasSubstr("set TMPDIR to one with room"));
     EXPECT_EQ(written, "");
 }
 
