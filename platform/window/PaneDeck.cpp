@@ -21,10 +21,9 @@ constexpr double kParallax = 0.3; // the way of the pane beneath, as a part of t
 
 } // namespace
 
-PaneDeck::PaneDeck(QWidget* parent, QString waitingHint, bool isAnimated,
-                   std::function<void()> goBack)
+PaneDeck::PaneDeck(QWidget* parent, QString waitingHint, bool isAnimated, std::function<void()> pop)
     : QWidget(parent), _waitingHint(std::move(waitingHint)), _isAnimated(isAnimated),
-      _goBack(std::move(goBack))
+      _pop(std::move(pop))
 {
     _animation.setDuration(kSlideMs);
     _animation.setEasingCurve(QEasingCurve::OutCubic);
@@ -108,7 +107,7 @@ EdgeSwipe PaneDeck::edgeSwipe()
         if (!_isSwipe)
             return;
         if (isFarEnough)
-            _goBack();
+            _pop();
         else
             startSlide(_over, _under, _progress, 0, true);
     };

@@ -19,8 +19,8 @@ namespace orvane
 class PaneDeck final : public QWidget
 {
 public:
-    // `goBack` pops the stack.
-    PaneDeck(QWidget* parent, QString waitingHint, bool isAnimated, std::function<void()> goBack);
+    // `pop` pops the stack.
+    PaneDeck(QWidget* parent, QString waitingHint, bool isAnimated, std::function<void()> pop);
     ~PaneDeck() override;
 
     // The stack as it is now; null for none.
@@ -50,7 +50,7 @@ private:
 
     QString _waitingHint;
     bool _isAnimated;
-    std::function<void()> _goBack;
+    std::function<void()> _pop;
     Panes _panes;                         // those that have been seen, from the root upwards
     std::unique_ptr<PaneWidget> _leaving; // popped, and still sliding away
     PaneWidget* _top = nullptr;

@@ -94,12 +94,13 @@ bool TableTouch::takeMouse(const QMouseEvent& event, QEvent& accepted)
     if (isMove ? !_isDown : event.button() != Qt::LeftButton)
         return false;
     accepted.accept();
+    const Finger finger{event.position(), event.globalPosition(), timeOf(event)};
     if (isMove)
-        move(event.position(), timeOf(event));
+        move(finger);
     else if (event.type() == QEvent::MouseButtonRelease)
-        end(event.position(), timeOf(event));
+        end(finger);
     else
-        begin(event.position(), timeOf(event));
+        begin(finger);
     return true;
 }
 
@@ -108,38 +109,39 @@ void TableTouch::takeTouch(QTouchEvent& event)
     if (event.pointCount() == 0)
         return;
     // Further fingers are left out.
-    const QPointF position = event.point(0).position();
+    const QEventPoint& first = event.point(0);
+    const Finger finger{first.position(), first.globalPosition(), timeOf(event)};
     if (event.type() == QEvent::TouchBegin)
-        begin(position, timeOf(event));
+        begin(finger);
     else if (event.type() == QEvent::TouchEnd)
-        end(position, timeOf(event));
+        end(finger);
     else
-        move(position, timeOf(event));
+        move(finger);
 }
 
-void TableTouch::begin(const QPointF& position, qint64 time)
+void TableTouch::begin(const Finger& finger)
 {
     QScroller* scroller = QScroller::scroller(&_widget);
     // A finger that stops a table in motion presses nothing.
     const bool wasInMotion = scroller->state() == QScroller::Scrolling;
     _isDown = true;
-    _start = position;
-    const bool canSwipe = position.x() < kEdge && _edgeSwipe.begin && !wasInMotion;
+    _start = finger;
+    const bool canSwipe = finger.position.x() < kEdge && _edgeSwipe.begin && !wasInMotion;
     _swipe = canSwipe ? Swipe::Possible : Swipe::None;
-    scroller->handleInput(QScroller::InputPress, position, time);
+    scroller->handleInput(QScroller::InputPress, finger.position, finger.time);
     dropPress();
-    const auto row = _table.rowAt(position);
+    const auto row = _table.rowAt(finger.position);
     if (wasInMotion || !row)
         return;
     _press = Press{*row, _table.keyOf(*row)};
     _showTimer.start(kShowAfter);
 }
 
-void TableTouch::move(const QPointF& position, qint64 time)
+void TableTouch::move(const Finger& finger)
 {
     if (!_isDown)
         return;
-    const QPointF way = position - _start;
+    const QPointF way = finger.onScreen - _start.onScreen;
     if (_swipe == Swipe::UnderWay) {
         _edgeSwipe.move(way.x());
         return;
@@ -150,26 +152,28 @@ void TableTouch::move(const QPointF& position, qint64 time)
         _swipe = isRightwards && _edgeSwipe.begin() ? Swipe::UnderWay : Swipe::None;
         if (_swipe == Swipe::UnderWay) {
             dropPress();
-            scroller->handleInput(QScroller::InputRelease, _start, time);
+            scroller->handleInput(QScroller::InputRelease, _start.position, finger.time);
             _edgeSwipe.move(way.x());
             return;
         }
     }
-    scroller->handleInput(QScroller::InputMove, position, time);
+    scroller->handleInput(QScroller::InputMove, finger.position, finger.time);
     if (scroller->state() == QScroller::Dragging || way.manhattanLength() > kTapReach)
         dropPress();
 }
 
-void TableTouch::end(const QPointF& position, qint64 time)
+void TableTouch::end(const Finger& finger)
 {
     if (!std::exchange(_isDown, false))
         return;
     if (std::exchange(_swipe, Swipe::None) == Swipe::UnderWay) {
         constexpr double kFarEnough = 0.3;
-        _edgeSwipe.end(position.x() - _start.x() > kFarEnough * _widget.width());
+        const double way = finger.onScreen.x() - _start.onScreen.x();
+        _edgeSwipe.end(way > kFarEnough * _widget.width());
         return;
     }
-    QScroller::scroller(&_widget)->handleInput(QScroller::InputRelease, position, time);
+    QScroller::scroller(&_widget)->handleInput(QScroller::InputRelease, finger.position,
+                                               finger.time);
     const auto press = _press;
     dropPress();
     if (press)
@@ -183,7 +187,7 @@ void TableTouch::cancel(qint64 time)
     if (std::exchange(_swipe, Swipe::None) == Swipe::UnderWay)
         _edgeSwipe.end(false);
     else
-        QScroller::scroller(&_widget)->handleInput(QScroller::InputRelease, _start, time);
+        QScroller::scroller(&_widget)->handleInput(QScroller::InputRelease, _start.position, time);
     dropPress();
 }
 

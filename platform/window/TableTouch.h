@@ -63,11 +63,18 @@ private:
     };
     enum class Swipe { None, Possible, UnderWay };
 
+    // Where the finger or the mouse is, and when, in milliseconds.
+    struct Finger {
+        QPointF position; // in the widget's coordinates
+        QPointF onScreen; // there a swipe is measured: it moves the widget
+        qint64 time;
+    };
+
     bool takeMouse(const QMouseEvent& event, QEvent& accepted);
     void takeTouch(QTouchEvent& event);
-    void begin(const QPointF& position, qint64 time);
-    void move(const QPointF& position, qint64 time);
-    void end(const QPointF& position, qint64 time);
+    void begin(const Finger& finger);
+    void move(const Finger& finger);
+    void end(const Finger& finger);
     void cancel(qint64 time);
     void dropPress();
 
@@ -75,7 +82,7 @@ private:
     Table& _table;
     EdgeSwipe _edgeSwipe;
     bool _isDown = false;
-    QPointF _start;
+    Finger _start{};
     Swipe _swipe = Swipe::None;
     std::optional<Press> _press;
     std::optional<std::size_t> _panRow;

@@ -42,7 +42,7 @@ const View* frontModalView(NavigationController& stack)
 WindowFrame::WindowFrame(Screen& screen, Settings settings)
     : _screen(screen), _settings(std::move(settings)),
       _titleBar(new TitleBar(this, _settings.mark, [this] { goBack(); })),
-      _deck(new PaneDeck(this, _settings.waitingHint, _settings.isAnimated, [this] { goBack(); })),
+      _deck(new PaneDeck(this, _settings.waitingHint, _settings.isAnimated, [this] { popPane(); })),
       _playback(new PlaybackBar(this, screen)),
       _toolbar(new ToolbarWidget(this, [this](std::size_t index) { pressToolbarItem(index); })),
       _sheet(new SheetWidget(this)),
@@ -130,7 +130,13 @@ void WindowFrame::goBack()
         _screen.dismissAlert();
     else if (_sheet->interface())
         _sheet->interface()->pressButton("cancelButton");
-    else if (NavigationController* stack = navigation())
+    else
+        popPane();
+}
+
+void WindowFrame::popPane()
+{
+    if (NavigationController* stack = navigation())
         stack->popViewController(true);
 }
 

@@ -57,6 +57,7 @@ protected:
 
 private:
     [[nodiscard]] NavigationController* navigation() const;
+    void popPane();
     void pressToolbarItem(std::size_t index);
     void syncTitle(NavigationController* stack);
     void giveKeyboard();

@@ -4,6 +4,7 @@
 
 #include <QScrollBar>
 #include <QTest>
+#include <QWindow>
 
 namespace orvane
 {
@@ -25,6 +26,15 @@ protected:
     }
     [[nodiscard]] FlatButton& back() const { return frame().titleBar().backButton(); }
     void open() { clickRow(1); }
+    // With one finger that is still down; in the window's coordinates, which no pane moves.
+    void swipe(int from, int to)
+    {
+        QTest::touchEvent(&table(), touchScreen()).press(0, {from, kSwipeY}, &frame());
+        for (int x = from + 10; x <= to; x += 10)
+            QTest::touchEvent(&table(), touchScreen()).move(0, {x, kSwipeY}, &frame());
+    }
+
+    static constexpr int kSwipeY = 250;
 };
 
 TEST_F(BrowsingTest, FromTheRootToAValueAndBack)
@@ -109,26 +119,49 @@ TEST_F(BrowsingTest, MousesBackButtonGoesBack)
 TEST_F(BrowsingTest, SwipeFromTheLeftEdgeGoesBack)
 {
     open();
-    QTest::touchEvent(&table(), touchScreen()).press(0, {5, 200});
-    for (int x = 15; x <= 165; x += 15)
-        QTest::touchEvent(&table(), touchScreen()).move(0, {x, 204});
+    swipe(5, 165);
     EXPECT_EQ(topPane().x(), 160) << "it follows the finger";
-    QTest::touchEvent(&table(), touchScreen()).release(0, {165, 204});
+    QTest::touchEvent(&table(), touchScreen()).release(0, {165, kSwipeY}, &frame());
     turnEvents();
     EXPECT_EQ(title(), "Orvane");
     EXPECT_EQ(topPane().x(), 0);
 }
 
+TEST_F(BrowsingTest, DragWithTheMouseFromTheLeftEdgeGoesBack)
+{
+    open();
+    constexpr int kTo = 5 + 360 * 54 / 100;
+    QTest::mousePress(frame().windowHandle(), Qt::LeftButton, {}, {5, kSwipeY});
+    for (int x = 10; x <= kTo; x += 5)
+        QTest::mouseMove(frame().windowHandle(), {x, kSwipeY});
+    QTest::mouseMove(frame().windowHandle(), {kTo, kSwipeY});
+    EXPECT_EQ(topPane().x(), kTo - 5) << "it follows the mouse";
+    QTest::mouseRelease(frame().windowHandle(), Qt::LeftButton, {}, {kTo, kSwipeY});
+    turnEvents();
+    EXPECT_EQ(title(), "Orvane");
+}
+
 TEST_F(BrowsingTest, SwipeThatIsTooShortStays)
 {
     open();
-    QTest::touchEvent(&table(), touchScreen()).press(0, {5, 200});
-    for (int x = 15; x <= 75; x += 15)
-        QTest::touchEvent(&table(), touchScreen()).move(0, {x, 204});
-    QTest::touchEvent(&table(), touchScreen()).release(0, {75, 204});
+    swipe(5, 75);
+    EXPECT_EQ(topPane().x(), 70);
+    QTest::touchEvent(&table(), touchScreen()).release(0, {75, kSwipeY}, &frame());
     turnEvents();
     EXPECT_EQ(title(), "Serving Cell Info");
     EXPECT_EQ(topPane().x(), 0);
+}
+
+TEST_F(BrowsingTest, SwipeDuringWhichAnAlertCameGoesBackAllTheSame)
+{
+    open();
+    swipe(5, 165);
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    QTest::touchEvent(&table(), touchScreen()).release(0, {165, kSwipeY}, &frame());
+    turnEvents();
+    EXPECT_EQ(title(), "Orvane");
+    EXPECT_TRUE(screen.alert());
 }
 
 TEST_F(BrowsingTest, SwipeAtTheRootDoesNothing)
