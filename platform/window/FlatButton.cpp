@@ -4,6 +4,7 @@
 #include "platform/window/Theme.h"
 
 #include <QFocusEvent>
+#include <QKeyEvent>
 #include <QPainter>
 
 #include <algorithm>
@@ -18,6 +19,15 @@ namespace
 constexpr double kTextSize = 15;
 constexpr int kMargin = 12;
 constexpr int kSignWidth = 22; // of a sign that a text follows
+
+// Nothing for any key but Return and Enter.
+std::optional<QKeyEvent> spaceFor(const QKeyEvent& event)
+{
+    if (event.key() != Qt::Key_Return && event.key() != Qt::Key_Enter)
+        return std::nullopt;
+    return std::optional<QKeyEvent>(std::in_place, event.type(), Qt::Key_Space, event.modifiers(),
+                                    QString(), event.isAutoRepeat());
+}
 
 } // namespace
 
@@ -81,9 +91,20 @@ void FlatButton::paintEvent(QPaintEvent*)
 
 void FlatButton::focusInEvent(QFocusEvent* event)
 {
-    // For those who come with the keyboard.
     _hasRing = event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason;
     QAbstractButton::focusInEvent(event);
+}
+
+void FlatButton::keyPressEvent(QKeyEvent* event)
+{
+    auto space = spaceFor(*event);
+    QAbstractButton::keyPressEvent(space ? &*space : event);
+}
+
+void FlatButton::keyReleaseEvent(QKeyEvent* event)
+{
+    auto space = spaceFor(*event);
+    QAbstractButton::keyReleaseEvent(space ? &*space : event); // may destroy this
 }
 
 } // namespace orvane

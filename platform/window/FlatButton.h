@@ -10,7 +10,8 @@ namespace orvane
 {
 
 // A button without a frame: a sign, a text, or a sign and then a text. At least 44 points high and
-// wide. Its text is what a screen reader speaks unless it has another name.
+// wide. Its text is what a screen reader speaks unless it has another name. Return and Enter press
+// it as Space does.
 class FlatButton final : public QAbstractButton
 {
 public:
@@ -23,12 +24,17 @@ public:
     // For a button of a sign alone: what it does, for screen readers and as a tooltip.
     void setName(const QString& name);
 
+    // Whether the ring is drawn while it has the focus: for those who use the keyboard.
+    [[nodiscard]] bool hasRing() const { return _hasRing; }
+
     [[nodiscard]] QSize sizeHint() const override;
     [[nodiscard]] QSize minimumSizeHint() const override { return {kSize, kSize}; }
 
 protected:
     void paintEvent(QPaintEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void keyReleaseEvent(QKeyEvent* event) override;
 
 private:
     std::optional<Sign> _sign;

@@ -89,6 +89,14 @@ TEST_F(BrowsingTest, EnterOpensTheKeyboardsRow)
     EXPECT_TRUE(frame().focusWidget() == &table()) << "the keyboard goes with it";
 }
 
+TEST_F(BrowsingTest, ReturnPressesTheWayBack)
+{
+    open();
+    QTest::keyClick(&back(), Qt::Key_Return);
+    turnEvents();
+    EXPECT_EQ(title(), "Orvane");
+}
+
 TEST_F(BrowsingTest, EscapeGoesBack)
 {
     open();
