@@ -64,7 +64,21 @@ DrawnStrip stripOf(const ScrollView& view, const QPointF& origin)
     return strip;
 }
 
+// Small letters say more than an ellipsis.
+void fit(DrawnLabel& label)
+{
+    constexpr int kSmallest = 12;
+    while (label.isCut() && label.font.pixelSize() > kSmallest)
+        label.font.setPixelSize(label.font.pixelSize() - 1);
+}
+
 } // namespace
+
+bool DrawnLabel::isCut() const
+{
+    constexpr double kSlack = 0.5; // measured as whole texts and drawn as lines
+    return sizeOfLine(text, font).width() > frame.width() + kSlack;
+}
 
 DrawnRow DrawnRow::of(TableViewCell& cell)
 {
@@ -75,8 +89,10 @@ DrawnRow DrawnRow::of(TableViewCell& cell)
     const QPointF origin(view.frame().x, view.frame().y);
     collectLabels(view, origin, content.labels);
     // A text that is too long ends before the accessory.
-    for (DrawnLabel& label : content.labels)
+    for (DrawnLabel& label : content.labels) {
         label.frame.setRight(std::min(label.frame.right(), origin.x() + view.frame().width));
+        fit(label);
+    }
     for (const auto& subview : view.subviews())
         if (const auto* strip = dynamic_cast<const ScrollView*>(subview.get()))
             content.strips.push_back(stripOf(*strip, origin));
@@ -103,6 +119,13 @@ QString DrawnRow::spokenText() const
     for (const DrawnStrip& strip : strips)
         add(strip.labels);
     return texts.join(QLatin1String(", "));
+}
+
+QString DrawnRow::cutText() const
+{
+    const auto cut = std::find_if(labels.begin(), labels.end(),
+                                  [](const DrawnLabel& label) { return label.isCut(); });
+    return cut == labels.end() ? QString() : cut->text;
 }
 
 double DrawnRow::sidewaysRange() const

@@ -17,6 +17,7 @@ struct DrawnLabel {
     QString text;
     QFont font;
     Qt::Alignment alignment;
+    [[nodiscard]] bool isCut() const; // for want of room
     friend bool operator==(const DrawnLabel&, const DrawnLabel&) = default;
 };
 
@@ -42,6 +43,8 @@ struct DrawnRow {
     [[nodiscard]] QString key() const;
     // All texts, as a screen reader speaks them: "KEY, VALUE".
     [[nodiscard]] QString spokenText() const;
+    // What is not to be read in full, whatever is scrolled; empty for nothing.
+    [[nodiscard]] QString cutText() const;
     // How far the row can be scrolled sideways.
     [[nodiscard]] double sidewaysRange() const;
 };

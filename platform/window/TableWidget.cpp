@@ -3,6 +3,7 @@
 #include "platform/window/Theme.h"
 
 #include <QAccessible>
+#include <QHelpEvent>
 #include <QKeyEvent>
 #include <QPainter>
 #include <QScrollBar>
@@ -153,7 +154,9 @@ void TableWidget::updateMarks()
     const auto selected = table ? table->selectedRow() : std::nullopt;
     const auto pressed = _touch.pressedRow();
     for (const auto& [row, widget] : _rows) {
-        widget->setPressed(pressed == row || selected == row);
+        // A row that leads nowhere is not left marked.
+        const bool leadsOn = widget->content().accessory == CellAccessory::DisclosureIndicator;
+        widget->setPressed(pressed == row || (selected == row && leadsOn));
         widget->setRing(_isKeyboardUsed && hasFocus() && row == _currentRow);
     }
 }
@@ -173,7 +176,16 @@ bool TableWidget::event(QEvent* event)
         setFocus(Qt::MouseFocusReason);
         updateMarks();
     }
+    if (event->type() == QEvent::ToolTip)
+        setToolTip(toolTipAt(static_cast<QHelpEvent*>(event)->pos()));
     return _touch.takeEvent(*event) || QWidget::event(event);
+}
+
+QString TableWidget::toolTipAt(const QPoint& position) const
+{
+    const auto row = rowAt(position);
+    const RowWidget* widget = row ? rowWidget(*row) : nullptr;
+    return widget ? widget->content().cutText() : QString();
 }
 
 void TableWidget::resizeEvent(QResizeEvent*)

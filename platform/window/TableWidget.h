@@ -69,6 +69,7 @@ private:
     void scrollTo(std::optional<std::size_t> row, const QPointF& position) override;
     void showPress() override;
 
+    [[nodiscard]] QString toolTipAt(const QPoint& position) const;
     void placeRows();
     std::unique_ptr<RowWidget> takeSpare();
     void showRow(std::size_t row, const std::shared_ptr<TableViewCell>& cell);

@@ -3,6 +3,7 @@
 #include "window/WindowTest.h"
 
 #include <QAccessible>
+#include <QHelpEvent>
 #include <QScrollBar>
 #include <QTest>
 
@@ -62,6 +63,33 @@ TEST_F(TableWidgetTest, LongNameOfAGroupEndsBeforeTheDisclosureMark)
     EXPECT_EQ(key.text.size(), 100);
     EXPECT_EQ(key.frame.left(), 10);
     EXPECT_EQ(key.frame.right(), 360 - TableViewCell::kAccessoryWidth);
+}
+
+TEST_F(TableWidgetTest, NameOfAGroupThatIsALittleTooLongIsWrittenSmaller)
+{
+    const std::string name(34, 'n');
+    show(rootNode({groupNode("Short", {}), groupNode(name, {})}));
+    const DrawnLabel& key = row(1)->content().labels.front();
+    const int size = key.font.pixelSize();
+    EXPECT_EQ(row(0)->content().labels.front().font.pixelSize(), 15);
+    EXPECT_LT(size, 15);
+    EXPECT_GE(size, 12);
+    EXPECT_FALSE(key.isCut());
+}
+
+TEST_F(TableWidgetTest, NameThatIsCutIsTheRowsToolTip)
+{
+    const QString name(100, 'x');
+    show(rootNode({groupNode("Short", {}), groupNode(name.toStdString(), {})}));
+    EXPECT_EQ(row(1)->content().labels.front().font.pixelSize(), 12);
+    const auto hover = [this](std::size_t index) {
+        QHelpEvent event(QEvent::ToolTip, middleOf(index), table().mapToGlobal(middleOf(index)));
+        QCoreApplication::sendEvent(&table(), &event);
+        return table().toolTip();
+    };
+    EXPECT_EQ(hover(0), "");
+    EXPECT_EQ(hover(1), name);
+    EXPECT_EQ(hover(0), "");
 }
 
 TEST_F(TableWidgetTest, RowsUnderOneAnotherTouch)
