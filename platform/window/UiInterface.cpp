@@ -4,6 +4,7 @@
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/TableView.h"
 #include "platform/window/FlatButton.h"
+#include "platform/window/Fonts.h"
 #include "platform/window/TableWidget.h"
 #include "platform/window/TextFieldBinding.h"
 
@@ -16,6 +17,8 @@ namespace orvane
 
 namespace
 {
+
+constexpr double kTextSize = 15; // of what the file gives no other
 
 // Knows the widgets of this layer by the names that interface files call them.
 class Loader final : public QUiLoader
@@ -50,6 +53,8 @@ std::unique_ptr<QWidget> readFile(const std::string& name)
     if (!widget)
         logError("The interface file \"%s.ui\" cannot be used: %s\n", name.c_str(),
                  qPrintable(loader.errorString().simplified()));
+    else
+        widget->setFont(fontFor(Font::system(kTextSize)));
     return widget;
 }
 
