@@ -6,7 +6,6 @@
 #include <QDBusPendingCallWatcher>
 #include <QDBusPendingReply>
 #include <QDBusVariant>
-#include <QPalette>
 
 #include <array>
 #include <utility>
@@ -23,23 +22,39 @@ constexpr const char* kInterface = "org.freedesktop.portal.Settings";
 constexpr const char* kGroup = "org.freedesktop.appearance";
 constexpr const char* kKey = "color-scheme";
 
-QPalette darkPalette()
+using Colours = std::array<std::pair<QPalette::ColorRole, QRgb>, 10>;
+
+constexpr Colours kDark{
+    {{QPalette::Window, 0x2B2D31},
+     {QPalette::WindowText, 0xE9EBEE},
+     {QPalette::Base, 0x181A1F},
+     {QPalette::Text, 0xE9EBEE},
+     {QPalette::Button, 0x33363B},
+     {QPalette::ButtonText, 0xE9EBEE},
+     {QPalette::ToolTipBase, 0x33363B},
+     {QPalette::ToolTipText, 0xE9EBEE},
+     {QPalette::PlaceholderText, 0x8A939E},
+     {QPalette::Highlight, 0x356DB0}}
+};
+
+constexpr Colours kLight{
+    {{QPalette::Window, 0xF0F1F3},
+     {QPalette::WindowText, 0x1B1F24},
+     {QPalette::Base, 0xFFFFFF},
+     {QPalette::Text, 0x1B1F24},
+     {QPalette::Button, 0xE6E9EE},
+     {QPalette::ButtonText, 0x1B1F24},
+     {QPalette::ToolTipBase, 0xFFFFFF},
+     {QPalette::ToolTipText, 0x1B1F24},
+     {QPalette::PlaceholderText, 0x6B7480},
+     {QPalette::Highlight, 0x1A5FB4}}
+};
+
+QPalette paletteOf(const Colours& colours)
 {
-    const std::array<std::pair<QPalette::ColorRole, QColor>, 10> colours{
-        {{QPalette::Window, QColor(0x2B, 0x2D, 0x31)},
-         {QPalette::WindowText, QColor(0xE9, 0xEB, 0xEE)},
-         {QPalette::Base, QColor(0x18, 0x1A, 0x1F)},
-         {QPalette::Text, QColor(0xE9, 0xEB, 0xEE)},
-         {QPalette::Button, QColor(0x33, 0x36, 0x3B)},
-         {QPalette::ButtonText, QColor(0xE9, 0xEB, 0xEE)},
-         {QPalette::ToolTipBase, QColor(0x33, 0x36, 0x3B)},
-         {QPalette::ToolTipText, QColor(0xE9, 0xEB, 0xEE)},
-         {QPalette::PlaceholderText, QColor(0x8A, 0x93, 0x9E)},
-         {QPalette::Highlight, QColor(0x35, 0x6D, 0xB0)}}
-    };
     QPalette palette;
     for (const auto& [role, colour] : colours)
-        palette.setColor(role, colour);
+        palette.setColor(role, QColor(colour));
     return palette;
 }
 
@@ -94,14 +109,20 @@ void DesktopColours::settingChanged(const QString& group, const QString& key,
         apply(schemeOf(value.variant()));
 }
 
+QPalette DesktopColours::paletteFor(Scheme scheme, const QPalette& desktop)
+{
+    constexpr int kHalfLight = 128;
+    const bool isDark = desktop.color(QPalette::Window).lightness() < kHalfLight;
+    if (scheme == Scheme::Dark && !isDark)
+        return paletteOf(kDark);
+    return scheme == Scheme::Light && isDark ? paletteOf(kLight) : QPalette();
+}
+
 void DesktopColours::apply(Scheme scheme)
 {
     // Without one of our own, it is Qt's for this desktop.
     QApplication::setPalette(QPalette());
-    constexpr int kHalfLight = 128;
-    const bool isDark = QApplication::palette().color(QPalette::Window).lightness() < kHalfLight;
-    if (scheme == Scheme::Dark && !isDark)
-        QApplication::setPalette(darkPalette());
+    QApplication::setPalette(paletteFor(scheme, QApplication::palette()));
 }
 
 } // namespace orvane

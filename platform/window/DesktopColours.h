@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QObject>
+#include <QPalette>
 
 class QDBusPendingCallWatcher;
 class QDBusVariant;
@@ -20,6 +21,8 @@ public:
     DesktopColours();
 
     static void apply(Scheme scheme);
+    // What the program needs of its own where the desktop's palette is that one.
+    [[nodiscard]] static QPalette paletteFor(Scheme scheme, const QPalette& desktop);
 
 private slots:
     void settingChanged(const QString& group, const QString& key, const QDBusVariant& value);
