@@ -2,9 +2,8 @@
 
 #include "platform/toolkit/AlertView.h"
 #include "platform/window/FlatButton.h"
-#include "platform/window/Fonts.h"
+#include "platform/window/WrappedText.h"
 
-#include <QLabel>
 #include <QVBoxLayout>
 
 #include <algorithm>
@@ -13,24 +12,9 @@
 namespace orvane
 {
 
-namespace
-{
-
-QLabel* makeLabel(QWidget* parent, const Font& font)
-{
-    auto* label = new QLabel(parent);
-    label->setTextFormat(Qt::PlainText);
-    label->setFont(fontFor(font));
-    label->setAlignment(Qt::AlignHCenter);
-    label->setWordWrap(true);
-    return label;
-}
-
-} // namespace
-
 AlertWidget::AlertWidget(QWidget* parent, std::function<void()> dismiss)
-    : Overlay(parent), _title(makeLabel(&card(), Font::boldSystem(17))),
-      _message(makeLabel(&card(), Font::system(15))), _button(new FlatButton(&card()))
+    : Overlay(parent), _title(new WrappedText(&card(), Font::boldSystem(17))),
+      _message(new WrappedText(&card(), Font::system(15))), _button(new FlatButton(&card()))
 {
     auto* column = new QVBoxLayout(&card());
     column->setContentsMargins(20, 24, 20, 10);
@@ -56,7 +40,7 @@ void AlertWidget::sync(const AlertView* alert)
         return placeCard();
     show();
     raise();
-    _button->setFocus(Qt::OtherFocusReason);
+    takeKeyboard();
 }
 
 QRect AlertWidget::cardPlace(const QSize& size) const

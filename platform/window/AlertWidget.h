@@ -4,13 +4,12 @@
 
 #include <functional>
 
-class QLabel;
-
 namespace orvane
 {
 
 class AlertView;
 class FlatButton;
+class WrappedText;
 
 // The alert in front, with its one button.
 class AlertWidget final : public Overlay
@@ -26,8 +25,8 @@ protected:
     [[nodiscard]] QRect cardPlace(const QSize& size) const override;
 
 private:
-    QLabel* _title; // children
-    QLabel* _message;
+    WrappedText* _title; // children
+    WrappedText* _message;
     FlatButton* _button;
 };
 

@@ -2,10 +2,10 @@
 
 #include <QWidget>
 
-class QLabel;
-
 namespace orvane
 {
+
+class WrappedText;
 
 // What stands where a pane has no rows: that there is no data yet and, while the program waits for
 // some, what for and what the user can do.
@@ -18,15 +18,12 @@ public:
     [[nodiscard]] QString text() const;
 
 protected:
-    void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    void applyTheme();
-
-    QLabel* _title; // children
-    QLabel* _reason;
-    QLabel* _hint;
+    WrappedText* _title; // children
+    WrappedText* _reason;
+    WrappedText* _hint;
 };
 
 } // namespace orvane

@@ -3,6 +3,7 @@
 #include "platform/window/Theme.h"
 
 #include <QEvent>
+#include <QLineEdit>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QWheelEvent>
@@ -33,17 +34,30 @@ void Overlay::placeCard()
 bool Overlay::focusNextPrevChild(bool isNext)
 {
     // Round and round within the card.
-    QWidget* const start = focusWidget() ? focusWidget() : _card;
+    if (QWidget* next = partAfter(focusWidget() ? focusWidget() : _card, isNext)) {
+        next->clearFocus(); // it may be the only one; it is told how it was reached
+        next->setFocus(isNext ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+    }
+    return true;
+}
+
+QWidget* Overlay::partAfter(QWidget* start, bool isNext) const
+{
     QWidget* next = start;
     do {
         next = isNext ? next->nextInFocusChain() : next->previousInFocusChain();
         const bool takesFocus = (next->focusPolicy() & Qt::TabFocus) != 0;
-        if (takesFocus && next->isEnabled() && next->isVisible() && _card->isAncestorOf(next)) {
-            next->setFocus(isNext ? Qt::TabFocusReason : Qt::BacktabFocusReason);
-            return true;
-        }
+        if (takesFocus && next->isEnabled() && next->isVisible() && _card->isAncestorOf(next))
+            return next;
     } while (next != start);
-    return true;
+    return nullptr;
+}
+
+void Overlay::takeKeyboard()
+{
+    QWidget* const field = _card->findChild<QLineEdit*>();
+    if (QWidget* first = field ? field : partAfter(_card, true))
+        first->setFocus(_keyboard.isUnderWay() ? Qt::TabFocusReason : Qt::OtherFocusReason);
 }
 
 void Overlay::showEvent(QShowEvent*)
@@ -70,7 +84,8 @@ void Overlay::paintEvent(QPaintEvent*)
 void Overlay::mousePressEvent(QMouseEvent* event)
 {
     // What a press on an empty part of the card leaves over comes here as well.
-    event->accept();
+    // The way back is the window's.
+    event->setAccepted(event->button() != Qt::BackButton);
     if (event->button() == Qt::LeftButton)
         pressBackground();
 }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/window/KeyboardUse.h"
+
 #include <QWidget>
 
 namespace orvane
@@ -11,6 +13,10 @@ class Overlay : public QWidget
 {
 public:
     explicit Overlay(QWidget* parent);
+
+    // Gives the keyboard to the card's text field, else to the first part that takes it; with a
+    // focus ring where the user works with the keyboard.
+    void takeKeyboard();
 
 protected:
     // The card's place within the given size.
@@ -30,6 +36,9 @@ protected:
     void wheelEvent(QWheelEvent* event) override;
 
 private:
+    [[nodiscard]] QWidget* partAfter(QWidget* start, bool isNext) const;
+
+    KeyboardUse _keyboard;
     QWidget* _card; // a child
 };
 

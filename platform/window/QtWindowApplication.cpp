@@ -49,7 +49,6 @@ QtWindowApplication::QtWindowApplication() : _parts(std::make_unique<Parts>())
 {
     // Qt has taken over the user's locale, in which printf may write "1,5".
     std::setlocale(LC_NUMERIC, "C");
-    QGuiApplication::setApplicationDisplayName(QStringLiteral("Orvane"));
     QGuiApplication::setDesktopFileName(QStringLiteral("org.orvane.Orvane"));
     // The program decides when it ends.
     QGuiApplication::setQuitOnLastWindowClosed(false);

@@ -39,7 +39,7 @@ void SheetWidget::sync(UiInterface* interface)
     shown.show();
     placeCard();
     _interface->sync();
-    shown.setFocus(Qt::OtherFocusReason);
+    takeKeyboard();
 }
 
 QRect SheetWidget::cardPlace(const QSize& size) const

@@ -35,7 +35,7 @@ void TextFieldBinding::sync()
     if (field->isFirstResponder())
         _line.setFocus(Qt::OtherFocusReason);
     else
-        _line.clearFocus();
+        _line.parentWidget()->setFocus(Qt::OtherFocusReason); // what is in front keeps the keyboard
 }
 
 bool TextFieldBinding::eventFilter(QObject*, QEvent* event)

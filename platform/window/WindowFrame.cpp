@@ -94,12 +94,15 @@ void WindowFrame::sync(const std::function<UiInterface*(const View*)>& findInter
     layout()->activate();
     _deck->sync(stack);
     UiInterface* modal = stack ? findInterface(frontModalView(*stack)) : nullptr;
-    const bool wasCovered = _sheet->isVisible() || _alert->isVisible();
+    const bool wasAlerted = _alert->isVisible();
+    const bool wasCovered = _sheet->isVisible() || wasAlerted;
     _sheet->sync(modal);
     _alert->sync(_screen.alert());
     const bool isCovered = _sheet->isVisible() || _alert->isVisible();
     if (!isCovered && (wasCovered || _deck->top() != before))
         giveKeyboard();
+    else if (_sheet->isVisible() && wasAlerted && !_alert->isVisible())
+        _sheet->takeKeyboard();
 }
 
 void WindowFrame::syncTitle(NavigationController* stack)
@@ -108,14 +111,16 @@ void WindowFrame::syncTitle(NavigationController* stack)
         return _titleBar->show({}, false, {});
     const auto& controllers = stack->viewControllers();
     const QString title = QString::fromStdString(controllers.back()->title());
+    const QString root = QString::fromStdString(controllers.front()->title());
     const bool canGoBack = controllers.size() > 1;
     const QString back = canGoBack
                              ? QString::fromStdString(controllers[controllers.size() - 2]->title())
                              : QString();
     _titleBar->show(title, canGoBack, back);
+    const QString whole = canGoBack ? QStringLiteral("%1 \u2014 %2").arg(title, root) : root;
     setWindowTitle(_settings.mark.isEmpty()
-                       ? title
-                       : QStringLiteral("%1 (%2)").arg(title, _settings.mark.toLower()));
+                       ? whole
+                       : QStringLiteral("%1 (%2)").arg(whole, _settings.mark.toLower()));
 }
 
 void WindowFrame::giveKeyboard()

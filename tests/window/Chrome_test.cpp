@@ -3,6 +3,7 @@
 #include "platform/window/FlatButton.h"
 #include "platform/window/Theme.h"
 #include "platform/window/TitleBar.h"
+#include "platform/window/ToolbarWidget.h"
 #include "window/WindowTest.h"
 
 #include <QApplication>
@@ -82,6 +83,15 @@ TEST_F(SimulatedChromeTest, SimulatedPhoneIsMarked)
     show(rootNode({valueNode("Technology", "LTE")}));
     EXPECT_EQ(frame().titleBar().accessibleDescription(), "Simulated phone");
     EXPECT_EQ(frame().windowTitle(), "Orvane (simulated phone)");
+    EXPECT_EQ(QGuiApplication::applicationDisplayName(), QCoreApplication::applicationName())
+        << "or Qt adds it once more";
+}
+
+TEST_F(SimulatedChromeTest, WindowsTitleNamesThePaneAndTheProgram)
+{
+    show(rootNode({groupNode("Group", {})}));
+    clickRow(0);
+    EXPECT_EQ(frame().windowTitle(), "Group \u2014 Orvane (simulated phone)");
 }
 
 TEST_F(ChromeTest, RealPhoneIsNotMarked)
@@ -117,6 +127,25 @@ TEST_F(ChromeTest, DesktopsWishForDarkAndLightIsFollowed)
         turnEvents();
         EXPECT_GT(pictureOf(frame()).pixelColor(emptyPlace).lightness(), 200);
     }
+}
+
+TEST_F(ChromeTest, WishForTheOtherOfLightAndDarkIsFollowedOnEitherDesktop)
+{
+    using Scheme = DesktopColours::Scheme;
+    const QPalette light(Qt::white);
+    const QPalette dark(QColor(30, 30, 30));
+    const auto lightness = [](Scheme scheme, const QPalette& desktop) {
+        return DesktopColours::paletteFor(scheme, desktop).color(QPalette::Window).lightness();
+    };
+    EXPECT_GT(lightness(Scheme::Light, dark), 200);
+    EXPECT_LT(lightness(Scheme::Dark, light), 60);
+    const auto isDesktops = [](Scheme scheme, const QPalette& desktop) {
+        return DesktopColours::paletteFor(scheme, desktop).resolveMask() == 0;
+    };
+    EXPECT_TRUE(isDesktops(Scheme::Dark, dark));
+    EXPECT_TRUE(isDesktops(Scheme::Light, light));
+    EXPECT_TRUE(isDesktops(Scheme::NoPreference, dark));
+    EXPECT_FALSE(isDesktops(Scheme::Light, dark));
 }
 
 TEST_F(ChromeTest, TextsStandOutInLightAndDark)
@@ -183,6 +212,7 @@ TEST_F(ChromeTest, TabReachesEverythingThatCanBePressed)
         reached.push_back(frame().focusWidget());
     }
     EXPECT_EQ(std::count(reached.begin(), reached.end(), &frame().titleBar().backButton()), 1);
+    EXPECT_EQ(std::count(reached.begin(), reached.end(), frame().toolbar().itemWidget(3)), 1);
     EXPECT_EQ(std::count(reached.begin(), reached.end(), &table()), 1);
 }
 

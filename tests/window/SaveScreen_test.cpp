@@ -2,6 +2,7 @@
 #include "platform/window/AlertWidget.h"
 #include "platform/window/FlatButton.h"
 #include "platform/window/SheetWidget.h"
+#include "platform/window/Theme.h"
 #include "platform/window/ToolbarWidget.h"
 #include "platform/window/UiInterface.h"
 #include "ui/SnapshotFile.h"
@@ -151,10 +152,133 @@ TEST_F(SaveScreenTest, EnterPressesTheAlertsButton)
     screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
     turnEvents();
     EXPECT_EQ(frame().focusWidget(), &frame().alert().button());
-    QTest::keyClick(&frame().alert().button(), Qt::Key_Space);
+    QTest::keyClick(&frame().alert().button(), Qt::Key_Return);
     turnEvents();
     EXPECT_FALSE(frame().alert().isVisible());
     EXPECT_EQ(frame().focusWidget(), &table()) << "the keyboard is the pane's again";
+}
+
+TEST_F(SaveScreenTest, AlertsButtonShowsTheKeyboardsRingToThoseWhoUseTheKeyboard)
+{
+    const FlatButton& button = frame().alert().button();
+    clickRow(0);
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    EXPECT_FALSE(button.hasRing()) << "the mouse brought it";
+    QTest::keyClick(frame().focusWidget(), Qt::Key_Tab);
+    EXPECT_EQ(frame().focusWidget(), &button);
+    EXPECT_TRUE(button.hasRing());
+    screen.dismissAlert();
+    turnEvents();
+    QTest::keyClick(&table(), Qt::Key_Down);
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    EXPECT_TRUE(button.hasRing());
+}
+
+TEST_F(SaveScreenTest, AlertsTextsAreInTheThemesColour)
+{
+    QPalette dark;
+    dark.setColor(QPalette::Window, QColor(30, 30, 30));
+    frame().setPalette(dark);
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    for (const QLabel* label : frame().alert().findChildren<QLabel*>())
+        EXPECT_EQ(label->palette().color(QPalette::WindowText), Theme::of(frame()).text);
+}
+
+TEST_F(SaveScreenTest, MousesBackButtonAnswersTheAlertAndThenCancels)
+{
+    open();
+    screen.showAlert(std::make_unique<AlertView>("Title", "Message", "Close"));
+    turnEvents();
+    QTest::mouseClick(&frame().alert(), Qt::BackButton, {}, {5, 5});
+    turnEvents();
+    EXPECT_FALSE(frame().alert().isVisible());
+    ASSERT_TRUE(isOpen());
+    QTest::mouseClick(&frame().sheet(), Qt::BackButton, {}, {5, 5});
+    queue.runPending();
+    turnEvents();
+    EXPECT_FALSE(isOpen());
+}
+
+TEST_F(SaveScreenTest, TypingRightAfterControlSIsTheDescription)
+{
+    QTest::keyClick(&table(), Qt::Key_S, Qt::ControlModifier);
+    turnEvents();
+    ASSERT_TRUE(isOpen());
+    QTest::keyClicks(frame().focusWidget(), "north");
+    EXPECT_EQ(field().text(), "north");
+    EXPECT_EQ(saveScreen()->saveDescription()->text(), "north");
+    EXPECT_TRUE(saveScreen()->saveDescription()->isFirstResponder());
+}
+
+TEST_F(SaveScreenTest, TabGoesFromTheFieldOverTheListToTheButtonsAndRound)
+{
+    open();
+    QStringList reached;
+    for (int i = 0; i < 4; ++i) {
+        QTest::keyClick(frame().focusWidget(), Qt::Key_Tab);
+        reached += frame().focusWidget()->objectName();
+    }
+    EXPECT_EQ(reached,
+              QStringList({"saveContentTable", "cancelButton", "saveButton", "saveDescription"}));
+}
+
+TEST_F(SaveScreenTest, ReturnAndEnterPressItsButtons)
+{
+    makeLogFolder();
+    open();
+    QTest::keyClick(part<FlatButton>("cancelButton"), Qt::Key_Return);
+    queue.runPending();
+    turnEvents();
+    EXPECT_FALSE(isOpen());
+    EXPECT_TRUE(savedFiles().empty());
+    open();
+    QTest::keyClick(part<FlatButton>("saveButton"), Qt::Key_Enter);
+    queue.runPending();
+    turnEvents();
+    EXPECT_FALSE(isOpen());
+    EXPECT_EQ(savedFiles().size(), 1U);
+}
+
+TEST_F(SaveScreenTest, ReturnOpensItFromTheToolbar)
+{
+    QTest::keyClick(frame().toolbar().itemWidget(3), Qt::Key_Return);
+    turnEvents();
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, HeldReturnPressesAButtonOnce)
+{
+    QWidget* button = frame().toolbar().itemWidget(3);
+    QKeyEvent press(QEvent::KeyPress, Qt::Key_Return, {});
+    QKeyEvent repeated(QEvent::KeyPress, Qt::Key_Return, {}, {}, true);
+    for (QKeyEvent* event : {&press, &repeated, &repeated})
+        QCoreApplication::sendEvent(button, event);
+    turnEvents();
+    EXPECT_FALSE(isOpen());
+    QTest::keyRelease(button, Qt::Key_Return);
+    turnEvents();
+    EXPECT_TRUE(isOpen());
+}
+
+TEST_F(SaveScreenTest, TextsHaveTheSizesOfThePanes)
+{
+    open();
+    EXPECT_EQ(field().font().pixelSize(), 15);
+    EXPECT_EQ(part<QLabel>("captionLabel")->font().pixelSize(), 13);
+    EXPECT_EQ(part<QLabel>("titleLabel")->font().pixelSize(), 16);
+}
+
+TEST_F(SaveScreenTest, PressedEntryIsNotLeftMarked)
+{
+    open();
+    auto* entries = part<TableWidget>("saveContentTable");
+    const RowWidget* entry = entries->rowWidget(1);
+    QTest::mouseClick(entries, Qt::LeftButton, {}, entry->geometry().center());
+    turnEvents();
+    EXPECT_FALSE(entry->isPressed());
 }
 
 TEST_F(SaveScreenTest, CancelWritesNothing)
@@ -207,6 +331,7 @@ TEST_F(SaveScreenTest, ReturnGivesTheKeyboardBack)
     turnEvents();
     EXPECT_FALSE(saveScreen()->saveDescription()->isFirstResponder());
     EXPECT_NE(frame().focusWidget(), &field());
+    EXPECT_TRUE(frame().sheet().isAncestorOf(frame().focusWidget()));
     EXPECT_TRUE(isOpen());
 }
 
