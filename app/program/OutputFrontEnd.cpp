@@ -5,6 +5,7 @@
 #include "platform/qt/QtEventLoop.h"
 #include "ui/output/PrintingPaneController.h"
 
+#include <csignal>
 #include <optional>
 #include <unistd.h>
 
@@ -32,6 +33,9 @@ public:
 
     void begin(OrvaneApp& app) override
     {
+        // In the background of a terminal, reading it would stop the program; ignored, it is the
+        // end of the input, which ends nothing.
+        std::signal(SIGTTIN, SIG_IGN);
         _commands.emplace(app, _output.pane(), [this] { _loop.quit(); });
         _lines.emplace(STDIN_FILENO, [this](std::string_view line, bool wasCut) {
             _commands->takeLine(line, wasCut);
