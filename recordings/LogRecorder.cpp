@@ -5,6 +5,7 @@
 #include "platform/Console.h"
 #include "platform/SystemLog.h"
 #include "platform/TelephonyServer.h"
+#include "platform/toolkit/Screen.h"
 
 #include <cerrno>
 #include <cstring>
@@ -56,8 +57,7 @@ void LogRecorder::channelOpened(const PropertyValue& technology)
     _hasModemMessages = technology != kTSLogChannelTechnology_IFX;
     if (_hasModemMessages || !_file || std::exchange(_hasSaidThatNothingComes, true))
         return;
-    consoleLine("Nothing to record to \"%s\": a cell monitor has no messages of a modem.",
-                _path.c_str());
+    tell("Nothing to record to \"" + _path + "\": a cell monitor has no messages of a modem.");
 }
 
 void LogRecorder::messageReceived(ByteView message)
@@ -98,9 +98,15 @@ void LogRecorder::endIfFailed(int error)
 {
     if (error == 0)
         return;
-    consoleLine("Recording to \"%s\" has ended: %s. What came before is kept.", _path.c_str(),
-                std::strerror(error));
+    tell("Recording to \"" + _path + "\" has ended: " + std::strerror(error) +
+         ". What came before is kept.");
     _file.reset();
+}
+
+void LogRecorder::tell(const std::string& line) const
+{
+    consoleLine("%s", line.c_str());
+    Screen::main().showAlert(std::make_unique<AlertView>("Recording", line, "Close"));
 }
 
 } // namespace orvane

@@ -17,7 +17,8 @@ namespace orvane
 //
 // Each item is written at once, so that the end of the process loses none; what was written is made
 // safe from a power cut within a second. The first failure, a full disk as a rule, ends the
-// recording with one line on the console and leaves the whole items in the file.
+// recording with one line, on the console and on the screen, and leaves the whole items in the
+// file.
 class LogRecorder final : public LogChannelObserver
 {
 public:
@@ -42,6 +43,7 @@ public:
 
 private:
     void synchroniseSoon();
+    void tell(const std::string& line) const;
     void endIfFailed(int error);
 
     MainQueue& _queue;

@@ -7,6 +7,7 @@
 #include "LogGenerator/support/PacketBuilder.h"
 #include "platform/FileSystem.h"
 #include "platform/TelephonyServer.h"
+#include "platform/fake/FakeScreen.h"
 #include "platform/fake/ManualMainQueue.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
@@ -181,6 +182,16 @@ TEST_F(LogRecorderTest, AFullDiskEndsTheRecordingWithOneLine)
         services.console.lines,
         ElementsAre("Recording to \"drive.dlf\" has ended: No space left on device. What came "
                     "before is kept."));
+}
+
+TEST_F(LogRecorderTest, WhoWatchesAScreenIsToldThere)
+{
+    FakeScreen screen;
+    file.appendError = ENOSPC;
+    recorder->messageReceived(joined({{1}, item(kCode, 20)}));
+    ASSERT_TRUE(screen.alert());
+    EXPECT_EQ(screen.alert()->title(), "Recording");
+    EXPECT_EQ(screen.alert()->message(), services.console.lines.front());
 }
 
 TEST_F(LogRecorderTest, ADiskThatFailsLaterEndsTheRecordingToo)
