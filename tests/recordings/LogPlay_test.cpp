@@ -37,7 +37,7 @@ protected:
 TEST_F(LogPlayTest, EveryItemShowsWhatALiveViewWouldShow)
 {
     for (const RecordedDrive& drive : kDrives) {
-        const LiveView live(recordedFile(drive.file), drive.technology);
+        const LiveView& live = liveViewOf(drive);
         LogPlay play(recordedLog(drive.file), drive.technology);
         play.lookAhead();
         for (const LiveView::Moment& moment : live.moments) {
@@ -72,6 +72,31 @@ TEST_F(LogPlayTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
     }
     EXPECT_THAT(times, ElementsAre(0s, 0s, 3s, 3s, 3s, 3s, 4s));
     EXPECT_EQ(play.clock().isoText(play.time()), "2017-07-11T04:34:12.000Z");
+}
+
+TEST_F(LogPlayTest, AnItemOfAnImpossibleTimeHasThatOfTheOneBefore)
+{
+    constexpr std::uint64_t kWild = std::uint64_t{0x7FFF} << 48;
+    LogPlay play(LogBuilder()
+                     .measurement(kWild, 1)
+                     .measurement(kLogStart, 2)
+                     .measurement(kLogStart + kLogSecond, 3)
+                     .measurement(kWild, 4)
+                     .measurement(kWild + kLogSecond, 5)
+                     .measurement(kLogStart + 2 * kLogSecond, 6)
+                     .measurement(kLogStart + 3 * kLogSecond, 7)
+                     .measurement(kWild, 8)
+                     .source(),
+                 kLte);
+    std::vector<LogTime> times;
+    play.lookAhead();
+    while (play.hasNext()) {
+        play.takeNext();
+        times.push_back(play.time());
+    }
+    EXPECT_THAT(times, ElementsAre(0s, 0s, 1s, 1s, 1s, 2s, 3s, 3s));
+    EXPECT_EQ(play.impossibleTimes(), 4U);
+    EXPECT_EQ(play.clock().isoText(0s), "2017-07-11T04:34:08.000Z");
 }
 
 TEST_F(LogPlayTest, NothingIsShownBeforeTheFirstItem)
@@ -154,12 +179,12 @@ TEST_F(LogPlayTest, ServingCellsOfOneMomentCountAsTheLastOfThem)
 TEST_F(LogPlayTest, ARestoredPlayGoesOnFromAnyItemAsBefore)
 {
     for (const RecordedDrive& drive : kDrives) {
-        const LiveView live(recordedFile(drive.file), drive.technology);
+        const LiveView& live = liveViewOf(drive);
         const auto log = recordedLog(drive.file);
         LogPlay play(log, drive.technology);
         LogPlay other(log, drive.technology);
         play.lookAhead();
-        for (std::size_t i = 0; i < live.moments.size(); i += 1 + i % 5) {
+        for (std::size_t i = 0; i < live.moments.size(); i += 5 + i % 3) {
             while (play.itemsTaken() < i)
                 play.takeNext();
             const LogPlay::Checkpoint checkpoint = play.checkpoint();

@@ -46,7 +46,7 @@ protected:
 TEST_F(LogTimelineTest, EveryMoveIsExact)
 {
     for (const RecordedDrive& drive : kDrives) {
-        const LiveView live(recordedFile(drive.file), drive.technology);
+        const LiveView& live = liveViewOf(drive);
         LogTimeline timeline(recordedLog(drive.file), drive.technology);
         readAll(timeline);
         ASSERT_EQ(timeline.duration(), live.duration());
@@ -58,10 +58,10 @@ TEST_F(LogTimelineTest, EveryMoveIsExact)
             times.push_back(time);
         std::vector<LogTime> all = times;
         all.insert(all.end(), times.rbegin(), times.rend());
-        std::mt19937 random(1);
+        std::mt19937_64 random(1);
+        std::uniform_int_distribution<LogTime::rep> anywhere(0, live.duration().count());
         for (int i = 0; i < 100; ++i)
-            all.push_back(LogTime(static_cast<LogTime::rep>(random()) * live.duration().count() /
-                                  static_cast<LogTime::rep>(std::mt19937::max())));
+            all.emplace_back(anywhere(random));
         // Just before, at and just after items.
         for (std::size_t i = 0; i < live.moments.size(); i += 97)
             for (const LogTime offset : {LogTime(-1), LogTime(0), LogTime(1)})
@@ -147,6 +147,39 @@ TEST_F(LogTimelineTest, EachServingCellIsReachedInTurn)
     }
     EXPECT_EQ(cells, 23);
     EXPECT_EQ(cell(timeline), last);
+}
+
+TEST_F(LogTimelineTest, AServingCellOneStepBeforeTheEndIsTheEnd)
+{
+    LogTimeline timeline(LogBuilder()
+                             .servingCell(kLogStart, 1)
+                             .servingCell(kLogStart + kLogSecond, 2)
+                             .measurement(kLogStart + kLogSecond + kLogStep, 7)
+                             .source(),
+                         kLte);
+    readAll(timeline);
+    timeline.moveTo(0s);
+    timeline.moveToNextServingCell();
+    EXPECT_EQ(timeline.position(), timeline.duration());
+    EXPECT_EQ(channel(timeline), "7");
+}
+
+TEST_F(LogTimelineTest, MovesAreExactAroundImpossibleTimes)
+{
+    LogBuilder builder;
+    for (std::uint16_t i = 0; i < 2000; ++i)
+        builder.measurement(i % 100 == 7 ? std::uint64_t{0x7FFF} << 48 : kLogStart + i * kLogSecond,
+                            i);
+    LogTimeline timeline(builder.source(), kLte);
+    readAll(timeline);
+    EXPECT_EQ(timeline.duration(), 1999s);
+    EXPECT_EQ(timeline.remark(), "20 items with impossible times");
+    for (const int i : {1999, 1106, 7, 1207, 6, 507, 1999, 1, 900}) {
+        timeline.moveTo(std::chrono::seconds(i) + 1ns);
+        // The item of an impossible time belongs to the one before.
+        const bool isFollowedByOne = i % 100 == 6;
+        EXPECT_EQ(channel(timeline), std::to_string(isFollowedByOne ? i + 1 : i)) << i;
+    }
 }
 
 TEST_F(LogTimelineTest, WithoutAnotherServingCellTheNextOneIsTheEnd)

@@ -101,7 +101,7 @@ TEST_F(RecordingPrinterTest, EveryRecordingHasItsPeriods)
 {
     for (const RecordedDrive& drive : kDrives) {
         lines.clear();
-        const LiveView live(recordedFile(drive.file), drive.technology);
+        const LiveView& live = liveViewOf(drive);
         EXPECT_EQ(json(log(recordedLog(drive.file)), {drive.file, {}, 1s}).size(),
                   live.periods(1s).size());
         EXPECT_EQ(printer->remark().empty(), drive.file != std::string("lte-drive-damaged.dlf"));
@@ -115,8 +115,7 @@ TEST_F(RecordingPrinterTest, ASnapshotIsALineAnEntry)
         ElementsAre("{\"status\":\"Snapshot (2026-11-21 10:00:00 +0000)\",\"loading\":false,"
                     "\"tree\":{\"name\":\"Orvane\",\"children\":[{\"name\":\"Cell ID\",\"value\":"
                     "\"7\"}]},\"time\":\"2026-11-21T10:00:00.000Z\"}\n",
-                    "{\"status\":\"DLF binary (161 bytes)\",\"loading\":false,\"tree\":null,"
-                    "\"time\":null}\n"));
+                    "{\"status\":\"DLF binary (161 bytes)\",\"loading\":false,\"tree\":null}\n"));
     EXPECT_TRUE(printer->hasEnded());
 }
 

@@ -43,7 +43,7 @@ protected:
 TEST_F(RefreshPeriodsTest, EachPeriodShowsWhatALiveViewWouldShowAtItsEnd)
 {
     for (const RecordedDrive& drive : kDrives) {
-        const LiveView live(recordedFile(drive.file), drive.technology);
+        const LiveView& live = liveViewOf(drive);
         for (const LogTime period : {LogTime(2s), LogTime(300ms), LogTime(1h)}) {
             const auto expected = live.periods(period);
             RefreshPeriods periods(recordedLog(drive.file), drive.technology, period);

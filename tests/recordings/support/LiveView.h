@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <exception>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -67,5 +68,16 @@ struct LiveView {
 
     std::vector<Moment> moments;
 };
+
+// Of a whole drive; made once for all tests.
+inline const LiveView& liveViewOf(const RecordedDrive& drive)
+{
+    static std::map<std::string, LiveView> views;
+    const auto known = views.find(drive.file);
+    if (known != views.end())
+        return known->second;
+    return views.emplace(drive.file, LiveView(recordedFile(drive.file), drive.technology))
+        .first->second;
+}
 
 } // namespace orvane
