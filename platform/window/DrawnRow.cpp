@@ -3,6 +3,7 @@
 #include "platform/toolkit/ScrollView.h"
 #include "platform/window/Fonts.h"
 
+#include <QFontMetricsF>
 #include <QStringList>
 
 #include <algorithm>
@@ -70,6 +71,16 @@ void fit(DrawnLabel& label)
     constexpr int kSmallest = 12;
     while (label.isCut() && label.font.pixelSize() > kSmallest)
         label.font.setPixelSize(label.font.pixelSize() - 1);
+    if (!label.isCut())
+        return;
+    constexpr double kTwoLines = 36; // of the smallest letters, in a row
+    const double middle = label.frame.center().y();
+    const QRectF room(label.frame.left(), middle - kTwoLines / 2, label.frame.width(), kTwoLines);
+    label.isWrapped =
+        room.contains(QFontMetricsF(label.font)
+                          .boundingRect(room, Qt::AlignVCenter | Qt::TextWordWrap, label.text));
+    if (label.isWrapped)
+        label.frame = room;
 }
 
 } // namespace
@@ -77,7 +88,7 @@ void fit(DrawnLabel& label)
 bool DrawnLabel::isCut() const
 {
     constexpr double kSlack = 0.5; // measured as whole texts and drawn as lines
-    return sizeOfLine(text, font).width() > frame.width() + kSlack;
+    return !isWrapped && sizeOfLine(text, font).width() > frame.width() + kSlack;
 }
 
 DrawnRow DrawnRow::of(TableViewCell& cell)

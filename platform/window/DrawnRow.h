@@ -17,6 +17,7 @@ struct DrawnLabel {
     QString text;
     QFont font;
     Qt::Alignment alignment;
+    bool isWrapped = false;           // between its words, into two lines
     [[nodiscard]] bool isCut() const; // for want of room
     friend bool operator==(const DrawnLabel&, const DrawnLabel&) = default;
 };

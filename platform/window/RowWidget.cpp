@@ -21,7 +21,11 @@ void drawLabels(QPainter& painter, const std::vector<DrawnLabel>& labels)
 {
     for (const DrawnLabel& label : labels) {
         painter.setFont(label.font);
-        drawLine(painter, label.frame, label.alignment, label.text);
+        if (label.isWrapped)
+            painter.drawText(label.frame, static_cast<int>(label.alignment) | Qt::TextWordWrap,
+                             label.text);
+        else
+            drawLine(painter, label.frame, label.alignment, label.text);
     }
 }
 

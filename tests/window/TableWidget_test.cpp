@@ -77,6 +77,18 @@ TEST_F(TableWidgetTest, NameOfAGroupThatIsALittleTooLongIsWrittenSmaller)
     EXPECT_FALSE(key.isCut());
 }
 
+TEST_F(TableWidgetTest, NameOfAGroupThatIsLongerStillTakesTwoLines)
+{
+    show(rootNode({groupNode("Connected mode LTE Intra-frequency Measurement Configuration", {})}));
+    const DrawnLabel& key = row(0)->content().labels.front();
+    EXPECT_TRUE(key.isWrapped);
+    EXPECT_FALSE(key.isCut());
+    EXPECT_NEAR(key.frame.center().y(), 22, 0.01);
+    EXPECT_TRUE(QRectF(row(0)->rect()).contains(key.frame));
+    EXPECT_EQ(row(0)->accessibleName(),
+              "Connected mode LTE Intra-frequency Measurement Configuration");
+}
+
 TEST_F(TableWidgetTest, NameThatIsCutIsTheRowsToolTip)
 {
     const QString name(100, 'x');
