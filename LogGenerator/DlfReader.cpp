@@ -26,18 +26,6 @@ constexpr std::uint64_t kMonth = 30 * 24 * kHour;
 
 bool isType(std::optional<std::uint64_t> byte) { return byte == kModemType || byte == kServerType; }
 
-// Nothing before March 1980, the time of a clock that was never set: small numbers are common in
-// payloads. Nothing after 2150: the bytes of an erased block all look alike.
-constexpr std::uint64_t kFirstTimely = std::uint64_t{1} << 48;
-constexpr std::uint64_t kFirstFuture = std::uint64_t{0x400} << 48;
-
-bool areWithin(std::uint64_t steps, std::uint64_t one, std::uint64_t other)
-{
-    const std::uint64_t a = one >> 16;
-    const std::uint64_t b = other >> 16;
-    return one < kFirstFuture && other < kFirstFuture && (a < b ? b - a : a - b) <= steps;
-}
-
 } // namespace
 
 // An item that fits at its place, with what stands between it and the item before.
@@ -109,19 +97,19 @@ std::optional<DlfReader::Start> DlfReader::firstStart(std::uint64_t from, bool f
 
 bool DlfReader::isTimely(const Start& start) const
 {
-    if (start.timestamp < kFirstTimely)
+    if (start.timestamp < kFirstTimelyTimestamp)
         return false;
     // Equal ones may be the same bytes twice, in a payload that repeats itself.
     const auto comesNext = [&](const Start& follower) {
         return start.timestamp != follower.timestamp &&
-               areWithin(kHour, start.timestamp, follower.timestamp);
+               areTimestampsWithin(kHour, start.timestamp, follower.timestamp);
     };
     return firstStart(start.end(), true, comesNext).has_value();
 }
 
 bool DlfReader::isVouchedFor(const Start& start) const
 {
-    return (_clock == 0 || areWithin(kMonth, _clock, start.timestamp)) && isTimely(start);
+    return (_clock == 0 || areTimestampsWithin(kMonth, _clock, start.timestamp)) && isTimely(start);
 }
 
 bool DlfReader::hasVouchedStart(std::uint64_t from, std::uint64_t end)
@@ -147,7 +135,7 @@ bool DlfReader::isFollowed(const Start& start)
     if (start.end() == _size)
         return true;
     const auto follows = [&](const Start& follower) {
-        return areWithin(kHour, start.timestamp, follower.timestamp) || isSound(follower);
+        return areTimestampsWithin(kHour, start.timestamp, follower.timestamp) || isSound(follower);
     };
     return firstStart(start.end(), true, follows).has_value();
 }
@@ -156,7 +144,7 @@ std::optional<DlfReader::Start> DlfReader::startHere()
 {
     const auto isVouched = [&](const Start& start) { return isVouchedFor(start); };
     const auto goesOn = [&](const Start& start) {
-        return areWithin(kHour, _lastTimestamp, start.timestamp) && isFollowed(start);
+        return areTimestampsWithin(kHour, _lastTimestamp, start.timestamp) && isFollowed(start);
     };
     const auto fits = [&](const Start& start) { return isSound(start) && isFollowed(start); };
 

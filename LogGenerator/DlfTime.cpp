@@ -15,6 +15,14 @@ constexpr double kSteps = 281474976710656.0; // 2 to the 48th
 
 } // namespace
 
+bool areTimestampsWithin(std::uint64_t steps, std::uint64_t one, std::uint64_t other)
+{
+    const std::uint64_t a = one >> 16;
+    const std::uint64_t b = other >> 16;
+    return one < kFirstFutureTimestamp && other < kFirstFutureTimestamp &&
+           (a < b ? b - a : a - b) <= steps;
+}
+
 double dlfSecondsSince1970(std::uint64_t timestamp)
 {
     // The step and its fraction apart: 64 bits in one go would not fit a double.

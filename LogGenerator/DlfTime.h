@@ -11,6 +11,16 @@ namespace orvane
 
 // Whole steps in one second.
 constexpr std::uint64_t kDlfStepsPerSecond = 800;
+constexpr std::uint64_t kDlfStepsPerDay = 24 * 3600 * kDlfStepsPerSecond;
+
+// Nothing before March 1980, the time of a clock that was never set: small numbers are common in
+// payloads. Nothing after 2150: the bytes of an erased block all look alike.
+constexpr std::uint64_t kFirstTimelyTimestamp = std::uint64_t{1} << 48;
+constexpr std::uint64_t kFirstFutureTimestamp = std::uint64_t{0x400} << 48;
+
+// Whether two timestamps are no more than so many whole steps apart, and neither lies in the
+// future.
+[[nodiscard]] bool areTimestampsWithin(std::uint64_t steps, std::uint64_t one, std::uint64_t other);
 
 // Seconds since 1970-01-01 00:00:00 UTC.
 [[nodiscard]] double dlfSecondsSince1970(std::uint64_t timestamp);

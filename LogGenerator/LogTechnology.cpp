@@ -88,6 +88,14 @@ std::optional<std::string> technologyNamed(std::string_view name)
     return std::nullopt;
 }
 
+std::string nameOfTechnology(std::string_view constant)
+{
+    for (const Technology& technology : kTechnologies)
+        if (constant == technology.constant)
+            return technology.name;
+    return "";
+}
+
 std::string technologyNames()
 {
     std::string names;

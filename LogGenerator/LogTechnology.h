@@ -32,6 +32,8 @@ std::optional<std::string> technologyOfLog(ByteView file);
 // The technology constant for its name on the command line: "lte", "umts", "utran", "cdma" or
 // "cellmonitor". Nothing for any other text.
 std::optional<std::string> technologyNamed(std::string_view name);
+// The name of a technology constant; empty for any other text.
+std::string nameOfTechnology(std::string_view constant);
 // All those names, as a text for people.
 std::string technologyNames();
 

@@ -3,6 +3,7 @@
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
 #include "recordings/LogSlice.h"
+#include "recordings/TimesAhead.h"
 
 #include <algorithm>
 #include <exception>
@@ -45,14 +46,29 @@ void LogPlay::lookAhead()
     const std::optional<DlfItem> item = _place.reader.next(LogSlice::kBytes);
     if (!item)
         return;
-    if (item->timestamp != 0 && !_place.hasClock) {
-        _place.clock = LogClock(item->timestamp);
-        _place.hasClock = true;
-    }
     _place.hasNext = true;
-    _place.nextTime = std::max(_place.time, _place.clock.timeOf(item->timestamp));
     _place.nextMessage.assign(1, item->type);
     _place.nextMessage.insert(_place.nextMessage.end(), item->bytes.begin(), item->bytes.end());
+    const bool isBelieved = item->timestamp == 0 || believe(item->timestamp);
+    _place.nextTime = _place.time;
+    if (!isBelieved)
+        ++_place.impossibleTimes;
+    else
+        _place.nextTime = std::max(_place.time, _place.clock.timeOf(item->timestamp));
+}
+
+// Whether the next item's time counts. The first one that does sets the clock.
+bool LogPlay::believe(std::uint64_t timestamp)
+{
+    if (_place.hasClock) {
+        const bool isLeap = _place.clock.timeOf(timestamp) - _place.time > TimesAhead::kLongestStep;
+        return !isLeap || TimesAhead(_place.reader).allowLeap(timestamp, _place.clock, _place.time);
+    }
+    if (!TimesAhead(_place.reader).allowStart(timestamp))
+        return false;
+    _place.clock = LogClock(timestamp);
+    _place.hasClock = true;
+    return true;
 }
 
 void LogPlay::takeNext()

@@ -15,8 +15,9 @@ namespace orvane
 // A diagnostic log on its way through the generator of its technology, item by item in file order,
 // as if each came from a telephony server.
 //
-// The time is that of the latest item taken. It never goes back, and an item without a timestamp
-// has the time of the one before. What a message makes a decoder throw costs that message only.
+// The time is that of the latest item taken. It never goes back, and an item without a timestamp,
+// or with one that those of the next items contradict, has the time of the one before. What a
+// message makes a decoder throw costs that message only.
 class LogPlay
 {
 public:
@@ -44,6 +45,9 @@ public:
     // shown after all items of one time.
     [[nodiscard]] std::uint64_t servingCellChanges() const { return _place.servingCellChanges; }
 
+    // How many items that were found so far have a time that cannot be.
+    [[nodiscard]] std::uint64_t impossibleTimes() const { return _place.impossibleTimes; }
+
     // For how far reading has come, and what could not be placed.
     [[nodiscard]] const DlfReader& reader() const { return _place.reader; }
 
@@ -61,6 +65,7 @@ private:
         bool hasNext = false;
         LogTime nextTime{0};
         LogTime time{0};
+        std::uint64_t impossibleTimes = 0;
         std::uint64_t itemsTaken = 0;
         std::uint64_t servingCellChanges = 0;
     };
@@ -79,6 +84,7 @@ public:
     void restore(const Checkpoint& checkpoint);
 
 private:
+    [[nodiscard]] bool believe(std::uint64_t timestamp);
     void decodeNext();
 
     Place _place;

@@ -1,5 +1,6 @@
 #include "recordings/LogSurvey.h"
 
+#include "LogGenerator/DlfTime.h"
 #include "LogGenerator/DlfWriter.h"
 #include "recordings/LogSlice.h"
 
@@ -25,9 +26,26 @@ bool LogSurvey::takeSlice()
             return !_reader.isAtEnd();
         if (item->position == 0 && item->logCode == kDlfVersionReportCode)
             _beginsWithReport = true;
-        _finder.take(*item);
+        else
+            take(*item);
     }
     return true;
+}
+
+void LogSurvey::take(const DlfItem& item)
+{
+    _hasItems = true;
+    _finder.take(item);
+    if (item.timestamp < kFirstTimelyTimestamp)
+        return;
+    const bool isFuture = item.timestamp >= kFirstFutureTimestamp;
+    const bool isFirst = _lastTimestamp == 0;
+    const bool agrees =
+        !isFuture &&
+        (isFirst || areTimestampsWithin(kDlfStepsPerDay, _lastTimestamp, item.timestamp));
+    ++(agrees ? _timelyItems : _untimelyItems);
+    if (!isFuture)
+        _lastTimestamp = item.timestamp;
 }
 
 double LogSurvey::progress() const
@@ -36,10 +54,12 @@ double LogSurvey::progress() const
     return size > 0 ? std::min(static_cast<double>(_reader.position()) / size, 1.0) : 1.0;
 }
 
-// Among any bytes a few are found that could be items. A log consists of them.
+// Nearly any two bytes are a length that fits, so most of any file could be items. Only those of a
+// log have timestamps that agree with each other.
 bool LogSurvey::isLog() const
 {
-    return _beginsWithReport || _reader.placedBytes() > _reader.unplacedBytes();
+    return _beginsWithReport ||
+           (_reader.placedBytes() > _reader.unplacedBytes() && _timelyItems >= _untimelyItems);
 }
 
 std::optional<std::string> LogSurvey::technology() const
@@ -49,6 +69,9 @@ std::optional<std::string> LogSurvey::technology() const
 
 std::string LogSurvey::complaint(const std::string& path) const
 {
+    if (isLog() && !_hasItems)
+        return "\"" + path +
+               "\": the log is empty, nothing follows its version report: name another file";
     if (isLog())
         return "\"" + path +
                "\" holds no log codes that tell its technology: name it with --technology, one "
@@ -60,7 +83,7 @@ std::string LogSurvey::complaint(const std::string& path) const
            technologyNames();
 }
 
-std::string remarkOn(const DlfReader& reader, std::uint64_t size)
+std::string remarkOn(const DlfReader& reader, std::uint64_t impossibleTimes, std::uint64_t size)
 {
     std::string text;
     const auto& ranges = reader.unplacedRanges();
@@ -72,6 +95,10 @@ std::string remarkOn(const DlfReader& reader, std::uint64_t size)
         text += " and at " + std::to_string(reader.unplacedRangeCount() - named) + " more places";
     if (!text.empty())
         text = std::to_string(reader.unplacedBytes()) + " bytes could not be placed: " + text;
+    if (impossibleTimes > 0)
+        text += (text.empty() ? "" : "; ") + std::to_string(impossibleTimes) +
+                (impossibleTimes == 1 ? " item with an impossible time"
+                                      : " items with impossible times");
     if (reader.size() < size)
         text += (text.empty() ? "" : "; ") + std::to_string(size - reader.size()) +
                 " bytes could not be read: the file ends at byte " + std::to_string(reader.size());

@@ -31,16 +31,23 @@ public:
     [[nodiscard]] std::string complaint(const std::string& path) const;
 
 private:
+    void take(const DlfItem& item);
     [[nodiscard]] bool isLog() const;
 
     std::shared_ptr<ByteSource> _log;
     DlfReader _reader;
     TechnologyFinder _finder;
     bool _beginsWithReport = false;
+    bool _hasItems = false; // beside that report
+    // Of the items with a timestamp: those that agree with the one before, and the others.
+    std::uint64_t _timelyItems = 0;
+    std::uint64_t _untimelyItems = 0;
+    std::uint64_t _lastTimestamp = 0;
 };
 
 // What a person should know about a log that has been read, which was `size` bytes long at first:
-// how many bytes could not be placed or read, and where. Empty where all could.
-std::string remarkOn(const DlfReader& reader, std::uint64_t size);
+// how many bytes could not be placed or read, and where, and how many items have a time that cannot
+// be. Empty where all is well.
+std::string remarkOn(const DlfReader& reader, std::uint64_t impossibleTimes, std::uint64_t size);
 
 } // namespace orvane

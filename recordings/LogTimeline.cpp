@@ -108,12 +108,12 @@ void LogTimeline::moveToNextServingCell()
     while (canTakeNext() && _play.servingCellChanges() == changes)
         _play.takeNext();
     // Behind all items of the moment.
-    _position = std::min(_play.time() + kStep, duration());
+    moveTo(_play.time() + kStep);
 }
 
 std::string LogTimeline::remark() const
 {
-    return _end ? remarkOn(_end->place.reader, _bytesAtFirst) : "";
+    return _end ? remarkOn(_end->place.reader, _end->place.impossibleTimes, _bytesAtFirst) : "";
 }
 
 } // namespace orvane

@@ -27,18 +27,21 @@ std::optional<std::string> RecordingExport::run()
 
 std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSource>& log)
 {
-    std::optional<std::string> technology = _request.technology;
-    if (!technology) {
+    _technology = _request.technology;
+    if (!_technology) {
         LogSurvey survey(log);
-        while (survey.takeSlice()) {
-        }
-        technology = survey.technology();
-        if (!technology)
+        while (_isReadOn && survey.takeSlice())
+            goOnIf(_progress(LogSurvey::kShareOfTime * survey.progress()));
+        if (!_isReadOn)
+            return std::nullopt;
+        _technology = survey.technology();
+        if (!_technology)
             return survey.complaint(_request.file);
     }
-    RefreshPeriods periods(log, *technology, _request.period);
+    RefreshPeriods periods(log, *_technology, _request.period);
     while (takeSlice(periods))
-        goOnIf(_progress(periods.progress()));
+        goOnIf(_progress(LogSurvey::kShareOfTime +
+                         (1 - LogSurvey::kShareOfTime) * periods.progress()));
     goOnIf(_progress(1));
     if (const std::string remark = periods.remark(); _isReadOn && !remark.empty())
         _remarks.push_back(_request.file + ": " + remark);
@@ -76,10 +79,18 @@ std::optional<std::string> RecordingExport::finish()
         if (!missing.empty() && missing.size() == _request.paths.size())
             return missingText(missing.front());
         for (const std::string& path : missing)
-            _remarks.push_back(missingText(path));
+            _remarks.push_back(_request.paths.empty() ? emptyText() : missingText(path));
         _writer.finish(_table);
     }
     return _writer.problem();
+}
+
+std::string RecordingExport::emptyText() const
+{
+    if (!_technology)
+        return _request.file + ": no row occurs";
+    return _request.file + ": no row occurs in it as a log of \"" + nameOfTechnology(*_technology) +
+           "\": for another technology name it with --technology, one of " + technologyNames();
 }
 
 std::string RecordingExport::missingText(const std::string& path) const

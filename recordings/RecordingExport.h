@@ -21,7 +21,6 @@ struct ExportRequest {
 
 // Hands the rows of a recording to a writer: of a log what is shown at the end of each refresh
 // period, of a snapshot what each of its entries shows. Memory does not grow with the file.
-//
 class RecordingExport
 {
 public:
@@ -44,12 +43,14 @@ private:
     void take(const std::string& time, const PropertyValue& display);
     void goOnIf(bool isReadOn) { _isReadOn = _isReadOn && isReadOn; }
     std::optional<std::string> finish();
+    [[nodiscard]] std::string emptyText() const;
     [[nodiscard]] std::string missingText(const std::string& path) const;
 
     const ExportRequest _request;
     RowWriter& _writer;
     Progress _progress;
     RowTable _table;
+    std::optional<std::string> _technology; // that a log is read as
     bool _isReadOn = true;
     std::vector<std::string> _remarks;
 };

@@ -41,6 +41,9 @@ double RefreshPeriods::progress() const
     return size > 0 ? static_cast<double>(_play.reader().position()) / size : 1;
 }
 
-std::string RefreshPeriods::remark() const { return remarkOn(_play.reader(), _bytesAtFirst); }
+std::string RefreshPeriods::remark() const
+{
+    return remarkOn(_play.reader(), _play.impossibleTimes(), _bytesAtFirst);
+}
 
 } // namespace orvane

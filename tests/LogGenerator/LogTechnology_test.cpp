@@ -94,6 +94,8 @@ TEST(LogTechnologyTest, TechnologiesHaveNames)
     EXPECT_EQ(technologyNamed("cellmonitor"), kTSLogChannelTechnology_IFX);
     EXPECT_FALSE(technologyNamed("gsm"));
     EXPECT_FALSE(technologyNamed(""));
+    EXPECT_EQ(nameOfTechnology(kTSLogChannelTechnology_Varnel_GSM), "umts");
+    EXPECT_EQ(nameOfTechnology("umts"), "");
     EXPECT_EQ(technologyNames(), "lte, umts, utran, cdma, cellmonitor");
 }
 

@@ -6,6 +6,8 @@
 
 #include <gmock/gmock.h>
 
+#include <random>
+
 namespace orvane
 {
 namespace
@@ -68,6 +70,60 @@ TEST_F(LogSurveyTest, FilesOfForeignBytesAreNoLogs)
     EXPECT_FALSE(read(sourceOf({})).technology());
 }
 
+// Nearly all of it is placed: any two bytes are a length that fits.
+TEST_F(LogSurveyTest, RandomBytesAreNoLogs)
+{
+    std::mt19937 random(1);
+    for (const std::size_t size : {100U, 1000U, 10'000U, 300'000U}) {
+        Bytes bytes(size);
+        for (std::uint8_t& byte : bytes)
+            byte = static_cast<std::uint8_t>(random());
+        const LogSurvey survey = read(sourceOf(bytes));
+        EXPECT_FALSE(survey.technology()) << size;
+        EXPECT_THAT(survey.complaint("x"), HasSubstr("is neither a diagnostic log")) << size;
+    }
+}
+
+TEST_F(LogSurveyTest, TextsAndProgramsAreNoLogs)
+{
+    std::string text;
+    for (int line = 0; line < 5000; ++line)
+        text += "Line " + std::to_string(line) + " of a text that is no log at all.\n";
+    const LogSurvey survey = read(sourceOf(Bytes(text.begin(), text.end())));
+    EXPECT_FALSE(survey.technology());
+    EXPECT_THAT(survey.complaint("x.txt"), HasSubstr("is neither a diagnostic log"));
+
+    Bytes start = readFile("/proc/self/exe").value_or(Bytes());
+    ASSERT_GT(start.size(), 500'000U);
+    start.resize(500'000);
+    const LogSurvey program = read(sourceOf(start));
+    EXPECT_FALSE(program.technology());
+    EXPECT_THAT(program.complaint("x"), HasSubstr("is neither a diagnostic log"));
+}
+
+TEST_F(LogSurveyTest, ALogMayHaveNoTimestampsAndSomeThatAreWild)
+{
+    LogBuilder untimed;
+    for (int i = 0; i < 5; ++i)
+        untimed.servingCell(0, 1);
+    EXPECT_TRUE(read(untimed.source()).technology());
+
+    LogBuilder wild;
+    for (std::uint64_t i = 0; i < 10; ++i)
+        wild.servingCell(i % 4 == 0 ? std::uint64_t{0x7FFF} << 48 : kLogStart + i * kLogSecond, 1);
+    EXPECT_TRUE(read(wild.source()).technology());
+
+    EXPECT_TRUE(read(LogBuilder().servingCell(kLogStart, 1).source()).technology());
+}
+
+TEST_F(LogSurveyTest, ALogOfNothingButItsReportIsEmpty)
+{
+    const LogSurvey survey = read(sourceOf(makeVersionReport().value_or(Bytes())));
+    EXPECT_FALSE(survey.technology());
+    EXPECT_EQ(survey.complaint("a.dlf"), "\"a.dlf\": the log is empty, nothing follows its version "
+                                         "report: name another file");
+}
+
 TEST_F(LogSurveyTest, ADamagedLogThatBeginsWithAReportIsALog)
 {
     LogBuilder builder;
@@ -100,13 +156,15 @@ TEST_F(LogSurveyTest, TheFirstPlacesOfForeignBytesAreNamed)
     builder.measurement(kLogStart + 9 * kLogSecond, 1);
     DlfReader reader(builder.source());
     const std::uint64_t size = builder.bytes.size();
-    EXPECT_EQ(remarkOn(reader, size), "");
+    EXPECT_EQ(remarkOn(reader, 0, size), "");
     while (reader.next()) {
     }
-    EXPECT_EQ(remarkOn(reader, size),
+    EXPECT_EQ(remarkOn(reader, 0, size),
               "430 bytes could not be placed: 86 at byte 152, 86 at byte 390, 86 at byte 628 and "
               "at 2 more places");
-    EXPECT_THAT(remarkOn(reader, size + 7),
+    EXPECT_THAT(remarkOn(reader, 1, size), testing::EndsWith("; 1 item with an impossible time"));
+    EXPECT_THAT(remarkOn(reader, 2, size), testing::EndsWith("; 2 items with impossible times"));
+    EXPECT_THAT(remarkOn(reader, 0, size + 7),
                 testing::EndsWith("; 7 bytes could not be read: the file ends at byte " +
                                   std::to_string(size)));
 }

@@ -174,6 +174,53 @@ TEST_F(RecordingExportTest, WhereNoneOfThePathsOccursItFails)
     EXPECT_EQ(written, "");
 }
 
+TEST_F(RecordingExportTest, ARecordingWithoutAnyRowSaysWhatItWasReadAs)
+{
+    request.file = ORVANE_TEST_DATA "/cdma-evening.dlf";
+    request.technology = kTSLogChannelTechnology_Varnel_LTE;
+    EXPECT_EQ(runCsv(), "");
+    EXPECT_THAT(remarks, ElementsAre(HasSubstr(
+                             "cdma-evening.dlf: no row occurs in it as a log of \"lte\"")));
+}
+
+TEST_F(RecordingExportTest, LookingForTheTechnologyTellsItsProgressAndCanBeGivenUp)
+{
+    LogBuilder builder;
+    for (std::uint64_t i = 0; i < 5000; ++i)
+        builder.measurement(kLogStart + i * kLogStep, 1);
+    write(builder.bytes);
+    slicesWanted = 2;
+    EXPECT_EQ(runJson(), "");
+    ASSERT_EQ(progress.size(), 2U);
+    EXPECT_GT(progress[0], 0);
+    EXPECT_GT(progress[1], progress[0]);
+    EXPECT_LT(progress[1], 0.05);
+    EXPECT_EQ(written, "");
+}
+
+TEST_F(RecordingExportTest, AnImpossibleTimeIsToldAndLeavesThePeriodsAsTheyAre)
+{
+    const Bytes drive = recordedFile("lte-drive.dlf");
+    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    runJson();
+    const auto lines = std::count(written.begin(), written.end(), '\n');
+    request.file = directory.path() + "/wild.dlf";
+    for (const int wild : {1, 5, 100}) {
+        DlfReader reader(drive);
+        std::optional<DlfItem> item;
+        for (int timed = 0; timed < wild;)
+            if (item = reader.next(); item->timestamp != 0)
+                ++timed;
+        Bytes changed = drive;
+        changed[item->position + 10] = 0;
+        changed[item->position + 11] = 0x7F;
+        write(changed);
+        EXPECT_EQ(runJson(), "");
+        EXPECT_LE(std::abs(std::count(written.begin(), written.end(), '\n') - lines), 1) << wild;
+        EXPECT_THAT(remarks, ElementsAre(HasSubstr("wild.dlf: 1 item with an impossible time")));
+    }
+}
+
 TEST_F(RecordingExportTest, StopsOnceNobodyReads)
 {
     request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
@@ -186,6 +233,7 @@ TEST_F(RecordingExportTest, StopsOnceNobodyReads)
 TEST_F(RecordingExportTest, GivesUpWhereItIsAskedTo)
 {
     request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.technology = kTSLogChannelTechnology_Varnel_LTE; // not looked for in slices of its own
     slicesWanted = 3;
     EXPECT_EQ(runCsv(), "");
     EXPECT_EQ(written, "") << "no part of a table";
