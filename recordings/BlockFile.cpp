@@ -15,8 +15,12 @@ namespace
 std::string whyNot(const std::string& path, int error)
 {
     std::error_code ignored;
-    if (error == EEXIST && !std::filesystem::is_directory(path, ignored))
+    const std::filesystem::file_type type = std::filesystem::status(path, ignored).type();
+    if (error == EEXIST && type == std::filesystem::file_type::regular)
         return "\"" + path + "\" is there already: give --force to overwrite it, or another name";
+    if (error == EEXIST && type != std::filesystem::file_type::directory)
+        return "\"" + path +
+               "\" is no regular file: give --force to write to it all the same, or another name";
     return "\"" + path + "\" cannot be written (" +
            std::strerror(error == EEXIST ? EISDIR : error) + "): give another name to record to";
 }

@@ -77,6 +77,15 @@ TEST_F(BlockFileTest, AnExistingFileIsRefusedAndLeftAlone)
     EXPECT_EQ(readFile(path), (Bytes{9, 9}));
 }
 
+TEST_F(BlockFileTest, WhatIsNoRegularFileIsSaidToBeNone)
+{
+    path = "/dev/full";
+    EXPECT_FALSE(create());
+    EXPECT_EQ(error, "\"/dev/full\" is no regular file: give --force to write to it all the same, "
+                     "or another name");
+    EXPECT_TRUE(create(Existing::Overwritten));
+}
+
 TEST_F(BlockFileTest, AnExistingFileIsOverwrittenWhereThatIsAskedFor)
 {
     ASSERT_TRUE(writeFile(path, Bytes{9, 9}));

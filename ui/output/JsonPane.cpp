@@ -95,12 +95,9 @@ std::string JsonPane::statusOutput(const std::string& status, bool isLoading,
     members += isLoading ? ",\"loading\":true" : ",\"loading\":false";
     members += ",\"tree\":";
     appendJsonNode(members, tree);
-    if (hasTimes()) {
+    if (time()) {
         members += ",\"time\":";
-        if (time())
-            appendJsonString(members, *time());
-        else
-            members += "null";
+        appendJsonString(members, *time());
     }
     return line(std::move(members));
 }

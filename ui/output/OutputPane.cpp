@@ -23,11 +23,7 @@ void OutputPane::setStatus(std::optional<std::string> status, bool isLoading)
     _write(statusOutput(*_status, _isLoading, _node.get()));
 }
 
-void OutputPane::setTime(std::optional<std::string> time)
-{
-    _time = std::move(time);
-    _hasTimes = true;
-}
+void OutputPane::setTime(std::optional<std::string> time) { _time = std::move(time); }
 
 void OutputPane::showNote(const std::string& text)
 {

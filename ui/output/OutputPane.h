@@ -45,8 +45,6 @@ protected:
     [[nodiscard]] virtual std::string errorOutput(const std::string& text) const = 0;
     [[nodiscard]] virtual std::string noteOutput(const std::string&) const { return ""; }
 
-    // Whether times have been set at all.
-    [[nodiscard]] bool hasTimes() const { return _hasTimes; }
     [[nodiscard]] const std::optional<std::string>& time() const { return _time; }
 
 private:
@@ -54,7 +52,6 @@ private:
     NodePointer _node;
     std::optional<std::string> _status;
     std::optional<std::string> _time;
-    bool _hasTimes = false;
     bool _isLoading = true;
     bool _isReloaded = false;
 };
