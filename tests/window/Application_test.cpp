@@ -1,11 +1,4 @@
-#include "app/OrvaneApp.h"
-
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/FramePorts.h"
-#include "platform/FrameTelephonyServer.h"
-#include "platform/fake/FakePreferencesStore.h"
-#include "platform/fake/LoopbackTransport.h"
-#include "platform/fake/ScriptedTelephonyServer.h"
 #include "platform/window/BusyIndicator.h"
 #include "platform/window/EmptyView.h"
 #include "platform/window/FlatButton.h"
@@ -13,12 +6,10 @@
 #include "platform/window/TextLine.h"
 #include "platform/window/TitleBar.h"
 #include "platform/window/ToolbarWidget.h"
-#include "window/WindowTest.h"
+#include "window/WindowedApplication.h"
 
 #include <QLineEdit>
 #include <QTest>
-
-#include <filesystem>
 
 namespace orvane
 {
@@ -28,37 +19,14 @@ namespace
 
 using namespace std::chrono_literals;
 
-// The application in its window, on a telephony server that answers by a script.
-class ApplicationTest : public ::testing::Test
+class ApplicationTest : public WindowedApplication
 {
 protected:
-    ApplicationTest()
-    {
-        services.useShippedResources();
-        for (const char* folder : {kInstallMarker, kLogFolder})
-            std::filesystem::create_directories(files.located(folder));
-        screen.frame().resize(360, 640);
-    }
-    ~ApplicationTest() override { app.applicationWillTerminate(); }
-
-    void launch()
-    {
-        app.applicationDidFinishLaunching();
-        queue.runPending();
-        turnEvents();
-    }
     void refreshWithServingCell()
     {
         ASSERT_TRUE(server.sendLogMessage(PacketBuilder(0xB0C2, 38).put16(14, 9).bytes()));
-        turn();
+        turn(2s);
     }
-    void turn(std::chrono::nanoseconds time = 2s)
-    {
-        queue.advance(time);
-        turnEvents();
-    }
-    [[nodiscard]] WindowFrame& frame() const { return screen.frame(); }
-    [[nodiscard]] TableWidget& table() const { return frame().deck().top()->table(); }
     [[nodiscard]] QString status() const
     {
         return dynamic_cast<TextLine&>(*frame().toolbar().itemWidget(1)).text();
@@ -67,41 +35,6 @@ protected:
     {
         return dynamic_cast<BusyIndicator&>(*frame().toolbar().itemWidget(0)).isTurning();
     }
-    // The index of the row of that key; the number of rows where there is none.
-    [[nodiscard]] std::size_t rowOf(const QString& key) const
-    {
-        std::size_t row = 0;
-        while (table().rowWidget(row) && table().rowWidget(row)->content().key() != key)
-            ++row;
-        return row;
-    }
-    void openRow(const QString& key)
-    {
-        RowWidget* row = table().rowWidget(rowOf(key));
-        ASSERT_TRUE(row) << key.toStdString();
-        QTest::mouseClick(&table(), Qt::LeftButton, {}, row->geometry().center());
-        turnEvents();
-    }
-
-    TestServices services;
-    TemporaryDirectory root;
-    FileSystem files{root.path()};
-    ManualMainQueue queue;
-    LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
-    ScriptedTelephonyServer server{transport};
-    FakePreferencesStore preferences;
-    QtScreen screen{[] {
-        QtScreen::Settings settings;
-        settings.isAnimated = false;
-        return settings;
-    }()};
-    OrvaneApp app{
-        ModelEnvironment{queue, ports, client, 2s,
-                         [] { return std::optional<std::string>("UUID"); }},
-        files, preferences
-    };
 };
 
 TEST_F(ApplicationTest, FromTheFirstConnectionToAValue)

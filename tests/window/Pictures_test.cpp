@@ -1,7 +1,11 @@
+#include "LogGenerator/DlfReader.h"
+#include "LogGenerator/DlfTime.h"
 #include "platform/fake/FakePlayback.h"
-#include "window/WindowTest.h"
+#include "platform/window/DesktopColours.h"
+#include "platform/window/SheetWidget.h"
+#include "platform/window/ToolbarWidget.h"
+#include "window/WindowedApplication.h"
 
-#include <QApplication>
 #include <QLineEdit>
 #include <QTest>
 
@@ -11,17 +15,18 @@ namespace orvane
 namespace
 {
 
-// The pictures of the docs, written to the directory that ORVANE_PICTURES names; without it, the
-// windows are drawn all the same.
-class PicturesTest : public WindowTest
+using namespace std::chrono_literals;
+
+// The pictures of the docs, of a recorded drive, written to the directory that ORVANE_PICTURES
+// names; without it, the windows are drawn all the same.
+class PicturesTest : public WindowedApplication
 {
 protected:
     PicturesTest()
-        : WindowTest([] {
+        : WindowedApplication([] {
               auto settings = stillSettings();
-              settings.isSimulated = true;
-              settings.waitingHint =
-                  "Start telephonyd, or look at the simulated phone: orvane --demo";
+              settings.waitingHint = "Start telephonyd on this machine, or try a simulated phone: "
+                                     "orvane --demo";
               return settings;
           }())
     {
@@ -38,79 +43,82 @@ protected:
         }
     }
 
-    void showPhone()
+    // The program after so many seconds of the drive.
+    void drive(double seconds = 60)
     {
-        show(phone());
-        setStatus("Updated 2026-11-21 at 10:00:00", false);
+        launch();
+        const auto file = readFile(std::string(ORVANE_TEST_DATA) + "/lte-drive.dlf");
+        ASSERT_TRUE(file);
+        DlfReader reader(*file);
+        double start = 0;
+        while (const auto item = reader.next()) {
+            if (item->timestamp == 0)
+                continue;
+            const double time = dlfSecondsSince1970(item->timestamp);
+            if (start == 0)
+                services.clock.now = start = time;
+            if (time > start + seconds)
+                break;
+            goOnTo(time);
+            Bytes message(1, item->type);
+            message.insert(message.end(), item->bytes.begin(), item->bytes.end());
+            ASSERT_TRUE(server.sendLogMessage(message));
+        }
+        turn(0s);
     }
-
-    static std::vector<NodePointer> servingCell()
+    void goOnTo(double time)
     {
-        return {
-            valueNode("MCC", "262"),
-            valueNode("MNC", "02"),
-            valueNode("Tracking Area Code", "4711"),
-            valueNode("Cell Identity", "27447297"),
-            valueNode("Physical Cell ID", "301"),
-            valueNode("Downlink EARFCN", "1300"),
-            valueNode("Downlink Bandwidth", "20 MHz"),
-            valueNode("Measured RSRP", "-95.50 dBm"),
-            valueNode("Measured RSRQ", "-10.25 dB"),
-            valueNode("Neighbour Cells", "302, 17, 488, 251, 93, 120, 6, 341, 77, 215, 460"),
-        };
+        if (time <= services.clock.now)
+            return;
+        const std::chrono::duration<double> way(time - services.clock.now);
+        services.clock.now = time;
+        queue.advance(std::chrono::duration_cast<std::chrono::nanoseconds>(way));
     }
-    static NodePointer phone()
+    void openSaveScreen()
     {
-        const std::vector<NodePointer> none;
-        return rootNode({groupNode("Serving Cell Info", servingCell()),
-                         groupNode("Serving Cell Measurements", none),
-                         groupNode("Neighbor Measurements", none),
-                         groupNode("Reselection Candidates", none),
-                         groupNode("HSDPA Information", none), groupNode("Version Info", none)});
+        QTest::mouseClick(frame().toolbar().itemWidget(3), Qt::LeftButton);
+        turnEvents();
+        ASSERT_TRUE(frame().sheet().isVisible());
     }
 };
 
 TEST_F(PicturesTest, RootPane)
 {
-    showPhone();
+    drive();
     picture("root");
 }
 
 TEST_F(PicturesTest, ServingCell)
 {
-    showPhone();
-    clickRow(0);
+    drive();
+    openRow("Serving Cell Measurements");
     picture("serving-cell");
 }
 
 TEST_F(PicturesTest, LongValueScrolledSideways)
 {
-    showPhone();
-    clickRow(0);
+    drive();
+    openRow("Serving Cell Measurements");
     QTest::keyClick(&table(), Qt::Key_End);
-    for (int i = 0; i < 3; ++i)
-        QTest::keyClick(&table(), Qt::Key_Right);
+    const auto current = [this] { return table().rowWidget(table().currentRow()); };
+    while (table().currentRow() > 0 && !current()->content().key().startsWith("Num of Consecutive"))
+        QTest::keyClick(&table(), Qt::Key_Up);
+    QTest::keyClick(&table(), Qt::Key_Right);
+    EXPECT_GT(current()->sideways(), 0);
     picture("long-value");
 }
 
 TEST_F(PicturesTest, SaveScreen)
 {
-    for (const char* text : {"Current", "Snapshot (2026-11-21 09:59:58 +0000)",
-                             "Snapshot (2026-11-21 09:59:56 +0000)"}) {
-        const PropertyValue entry = PropertyValue::newDictionary();
-        entry.asDictionary()->set("Description", text);
-        saveContents.asArray()->append(entry);
-    }
-    showPhone();
-    showSaveView();
-    turnEvents();
-    QTest::keyClicks(frame().findChild<QLineEdit*>("saveDescription"), "Platform 3, northern end");
+    drive();
+    openSaveScreen();
+    QTest::keyClicks(frame().focusWidget(), "Platform 3, northern end");
     picture("save");
 }
 
 TEST_F(PicturesTest, Alert)
 {
-    showPhone();
+    drive();
     screen.showAlert(
         std::make_unique<AlertView>("File Error", "Unable to write file to disk", "Close"));
     turnEvents();
@@ -119,32 +127,30 @@ TEST_F(PicturesTest, Alert)
 
 TEST_F(PicturesTest, Dark)
 {
-    const QPalette earlier = QApplication::palette();
-    QPalette dark;
-    dark.setColor(QPalette::Window, QColor(30, 30, 30));
-    dark.setColor(QPalette::WindowText, Qt::white);
-    QApplication::setPalette(dark);
-    showPhone();
-    clickRow(0);
+    DesktopColours::apply(DesktopColours::Scheme::Dark);
+    drive();
     picture("dark");
-    QApplication::setPalette(earlier);
+    DesktopColours::apply(DesktopColours::Scheme::NoPreference);
 }
 
 TEST_F(PicturesTest, Waiting)
 {
-    show(nullptr);
+    app.applicationDidFinishLaunching();
+    turnEvents();
     picture("waiting");
 }
 
 TEST_F(PicturesTest, Recording)
 {
+    drive();
+    constexpr double kFakesStart = 1795255200;
     FakePlayback playback;
-    playback.at = 37;
+    playback.at = services.clock.now - kFakesStart;
+    playback.length = 2 * playback.at;
     playback.rate = 10;
     playback.plays = true;
     playback.note = "198 bytes could not be placed, the first at 0x1F40";
-    showPhone();
-    clickRow(0);
+    openRow("Serving Cell Info");
     screen.setPlayback(&playback);
     turnEvents();
     picture("recording");
@@ -154,10 +160,9 @@ TEST_F(PicturesTest, Recording)
 TEST_F(PicturesTest, Desktop)
 {
     frame().resize(900, 600);
-    showPhone();
-    clickRow(0);
-    showSaveView();
-    turnEvents();
+    drive();
+    openRow("Serving Cell Info");
+    openSaveScreen();
     picture("desktop");
 }
 
