@@ -34,13 +34,9 @@ LogTime timeOf(double seconds)
 
 RecordingPlayer::RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
                                  RecordingSettings settings, OnChange onChange)
-    : _queue(queue), _now(std::move(now)), _log(std::move(log)), _settings(std::move(settings)),
-      _onChange(std::move(onChange))
+    : _queue(queue), _now(std::move(now)), _settings(std::move(settings)),
+      _onChange(std::move(onChange)), _reading(std::move(log), _settings.name, _settings.technology)
 {
-    if (_settings.technology)
-        beginReading(*_settings.technology);
-    else
-        _survey.emplace(_log);
     readLater();
 }
 
@@ -54,64 +50,34 @@ void RecordingPlayer::readLater()
 
 void RecordingPlayer::read()
 {
-    if (_failure || isReady())
+    if (failure() || isReady())
         return;
-    if (_survey) {
-        if (!_survey->takeSlice())
-            endSurvey();
-    } else if (!_timeline->readSlice() || _timeline->bytesRead() >= _bytesToRead) {
-        endReading();
-        return;
-    }
-    if (!_failure)
+    if (_reading.readSlice())
         readLater();
-    tell();
-}
-
-void RecordingPlayer::endSurvey()
-{
-    if (const auto technology = _survey->technology())
-        beginReading(*technology);
-    else
-        _failure = _survey->complaint(_settings.name);
-    _survey.reset();
-}
-
-void RecordingPlayer::beginReading(const std::string& technology)
-{
-    _timeline = std::make_unique<LogTimeline>(_log, technology);
-}
-
-void RecordingPlayer::endReading()
-{
-    _timeline->stopReading();
-    moveTo(_settings.refreshPeriod);
+    tellOrBegin();
 }
 
 void RecordingPlayer::stopReading()
 {
-    if (_survey) {
-        _bytesToRead = _survey->bytesRead();
-        endSurvey();
-        tell();
-    } else if (_timeline && !isReady()) {
-        endReading();
-    }
+    if (failure() || isReady())
+        return;
+    _reading.stop();
+    tellOrBegin();
 }
 
-double RecordingPlayer::progress() const
+// Once the log has been read, it stands at the end of its first period.
+void RecordingPlayer::tellOrBegin()
 {
-    if (_timeline)
-        return isReady() ? 1
-                         : LogSurvey::kShareOfTime +
-                               (1 - LogSurvey::kShareOfTime) * _timeline->progress();
-    return _survey ? LogSurvey::kShareOfTime * _survey->progress() : 1;
+    if (isReady())
+        moveTo(_settings.refreshPeriod);
+    else
+        tell();
 }
 
 NodePointer RecordingPlayer::topLevelNodes()
 {
     if (!_nodes && isReady())
-        _nodes = OrvaneModelNode::makeTreeFromObject(_timeline->display(), _nodesByPath);
+        _nodes = OrvaneModelNode::makeTreeFromObject(timeline()->display(), _nodesByPath);
     return _nodes;
 }
 
@@ -124,20 +90,20 @@ NodePointer RecordingPlayer::nodeAtPath(const std::string& path)
 
 double RecordingPlayer::position() const
 {
-    return _timeline ? secondsOf(_timeline->position()) : 0;
+    return timeline() ? secondsOf(timeline()->position()) : 0;
 }
 
 double RecordingPlayer::duration() const
 {
-    return _timeline ? secondsOf(_timeline->duration()) : 0;
+    return timeline() ? secondsOf(timeline()->duration()) : 0;
 }
 
 std::string RecordingPlayer::positionText() const
 {
-    return isReady() ? _timeline->clock().text(_timeline->position()) : "";
+    return isReady() ? timeline()->clock().text(timeline()->position()) : "";
 }
 
-std::string RecordingPlayer::remark() const { return _timeline ? _timeline->remark() : ""; }
+std::string RecordingPlayer::remark() const { return timeline() ? timeline()->remark() : ""; }
 
 double RecordingPlayer::speed() const { return kSpeeds[_speed]; }
 
@@ -145,8 +111,8 @@ void RecordingPlayer::play()
 {
     if (!isReady() || isPlaying())
         return;
-    if (_timeline->position() == _timeline->duration())
-        _timeline->moveTo(LogTime(0));
+    if (timeline()->position() == timeline()->duration())
+        timeline()->moveTo(LogTime(0));
     _playedTo = _now();
     startTimer();
     moved();
@@ -166,11 +132,11 @@ void RecordingPlayer::goOn()
     if (periods <= 0)
         return;
     _playedTo += periods * perPeriod;
-    const LogTime left = _timeline->duration() - _timeline->position();
+    const LogTime left = timeline()->duration() - timeline()->position();
     const bool isEnd = periods >= left / _settings.refreshPeriod + 1;
-    moveTo(isEnd ? _timeline->duration()
-                 : _timeline->position() + periods * _settings.refreshPeriod);
-    if (_timeline->position() == _timeline->duration())
+    moveTo(isEnd ? timeline()->duration()
+                 : timeline()->position() + periods * _settings.refreshPeriod);
+    if (timeline()->position() == timeline()->duration())
         pause();
 }
 
@@ -207,8 +173,8 @@ void RecordingPlayer::step()
     if (!isReady())
         return;
     _timer.reset();
-    const LogTime left = _timeline->duration() - _timeline->position();
-    moveTo(_timeline->position() + std::min(left, LogTime(_settings.refreshPeriod)));
+    const LogTime left = timeline()->duration() - timeline()->position();
+    moveTo(timeline()->position() + std::min(left, LogTime(_settings.refreshPeriod)));
 }
 
 void RecordingPlayer::stepBack()
@@ -216,22 +182,22 @@ void RecordingPlayer::stepBack()
     if (!isReady())
         return;
     _timer.reset();
-    moveTo(_timeline->position() - _settings.refreshPeriod);
+    moveTo(timeline()->position() - _settings.refreshPeriod);
 }
 
 void RecordingPlayer::jumpTo(double position) { moveTo(timeOf(position)); }
 
 void RecordingPlayer::jumpToEnd()
 {
-    if (_timeline)
-        moveTo(_timeline->duration());
+    if (timeline())
+        moveTo(timeline()->duration());
 }
 
 void RecordingPlayer::jumpToNextServingCell()
 {
     if (!isReady())
         return;
-    _timeline->moveToNextServingCell();
+    timeline()->moveToNextServingCell();
     moved();
 }
 
@@ -240,7 +206,7 @@ bool RecordingPlayer::jumpToText(const std::string& text)
     if (!isReady())
         return false;
     const auto time =
-        typedTime(text, _timeline->clock(), _timeline->position(), _timeline->duration());
+        typedTime(text, timeline()->clock(), timeline()->position(), timeline()->duration());
     if (time)
         moveTo(*time);
     return time.has_value();
@@ -250,7 +216,7 @@ void RecordingPlayer::moveTo(LogTime position)
 {
     if (!isReady())
         return;
-    _timeline->moveTo(position);
+    timeline()->moveTo(position);
     moved();
 }
 

@@ -2,8 +2,7 @@
 
 #include "platform/MainQueue.h"
 #include "platform/toolkit/Playback.h"
-#include "recordings/LogSurvey.h"
-#include "recordings/LogTimeline.h"
+#include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"
 #include "ui/OrvaneModelNode.h"
 
@@ -33,15 +32,15 @@ public:
                     RecordingSettings settings, OnChange onChange);
 
     // One line that says why the log cannot be played, and what to do. Reading has ended then.
-    [[nodiscard]] const std::optional<std::string>& failure() const { return _failure; }
-    [[nodiscard]] bool isReady() const { return _timeline && _timeline->isRead(); }
+    [[nodiscard]] const std::optional<std::string>& failure() const { return _reading.failure(); }
+    [[nodiscard]] bool isReady() const { return _reading.isRead(); }
 
     // The display at the position, as a live view's: null before the log has been read.
     NodePointer topLevelNodes();
     // The node under that path or null.
     NodePointer nodeAtPath(const std::string& path);
 
-    [[nodiscard]] double progress() const override;
+    [[nodiscard]] double progress() const override { return _reading.progress(); }
     void stopReading() override;
     [[nodiscard]] double position() const override;
     [[nodiscard]] double duration() const override;
@@ -63,9 +62,9 @@ public:
 private:
     void readLater();
     void read();
-    void endSurvey();
-    void beginReading(const std::string& technology);
-    void endReading();
+    void tellOrBegin();
+    // Null until the technology is known.
+    [[nodiscard]] LogTimeline* timeline() const { return _reading.timeline(); }
     void startTimer();
     void goOn();
     void moveTo(LogTime position);
@@ -74,13 +73,9 @@ private:
 
     MainQueue& _queue;
     Now _now;
-    std::shared_ptr<ByteSource> _log;
     RecordingSettings _settings;
     OnChange _onChange;
-    std::optional<std::string> _failure;
-    std::optional<LogSurvey> _survey;       // while the technology is sought
-    std::unique_ptr<LogTimeline> _timeline; // from then on
-    std::uint64_t _bytesToRead = UINT64_MAX;
+    LogReading _reading;
     NodePointer _nodes;
     PathDictionary _nodesByPath;
     std::unique_ptr<Timer> _timer; // while playing
