@@ -7,6 +7,7 @@
 #include "platform/terminal/CursesDevice.h"
 #include "platform/terminal/TerminalScreen.h"
 
+#include <chrono>
 #include <csignal>
 #include <unistd.h>
 #include <utility>
@@ -17,18 +18,28 @@ namespace orvane
 namespace
 {
 
+using namespace std::chrono_literals;
+
+constexpr auto kReturnInterval = 200ms;
+
 // Tells the terminal's screen what the event loop hears.
 class TerminalFrontEnd final : public FrontEnd
 {
 public:
     explicit TerminalFrontEnd(TerminalScreen::Settings settings)
         : _screen(_device, _queue, std::move(settings)),
-          _input(STDIN_FILENO, DescriptorWatcher::For::Reading, [this] { _screen.inputIsReady(); }),
+          _input(STDIN_FILENO, DescriptorWatcher::For::Reading, [this] { readInput(); }),
           _signals([this](int signal) { take(signal); }, {SIGWINCH, SIGTSTP, SIGCONT})
     {
     }
 
 private:
+    void readInput()
+    {
+        _screen.inputIsReady();
+        followJob();
+    }
+
     void take(int signal)
     {
         if (signal == SIGWINCH)
@@ -37,12 +48,29 @@ private:
             _screen.suspend();
         else
             _screen.wasContinued();
+        followJob();
+    }
+
+    // In the background what is typed is for others. Coming from there to the foreground is no
+    // signal if the process was running.
+    void followJob()
+    {
+        const bool isInFront = _device.hasTerminal();
+        _input.setEnabled(isInFront);
+        if (isInFront)
+            _return.reset();
+        else if (!_return)
+            _return = _queue.repeatingTimer(kReturnInterval, [this] {
+                _screen.wasContinued();
+                followJob();
+            });
     }
 
     CursesDevice _device;
     QtMainQueue _queue;
     TerminalScreen _screen;
     DescriptorWatcher _input;
+    std::unique_ptr<Timer> _return; // while in the background
     SignalWatcher _signals;
 };
 

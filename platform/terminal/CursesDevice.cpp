@@ -78,6 +78,13 @@ void takeModes()
     def_prog_mode();
 }
 
+// Whether the terminal is with another job of the shell's.
+bool isInBackground()
+{
+    const pid_t group = ::tcgetpgrp(STDIN_FILENO);
+    return group > 0 && group != ::getpgrp();
+}
+
 } // namespace
 
 struct CursesDevice::State {
@@ -89,17 +96,22 @@ struct CursesDevice::State {
     CellGrid shown; // of no size while unknown
     CursorPlace cursor;
     std::vector<cchar_t> line;
+    bool isTaken = false;
 
     void take()
     {
         takeModes();
         kind.send(kind.pasteOn);
         guard.arm(kind.restoring(keys.hasMouse()));
+        isTaken = true;
     }
     void giveBack()
     {
-        kind.send(kind.pasteOff);
-        endwin();
+        if (isTaken && !isInBackground()) {
+            kind.send(kind.pasteOff);
+            endwin();
+        }
+        isTaken = false;
         guard.disarm();
     }
     void putLine(const CellGrid& grid, int number);
@@ -148,6 +160,8 @@ void CursesDevice::State::putLine(const CellGrid& grid, int number)
 
 void CursesDevice::show(const CellGrid& grid, CursorPlace cursor)
 {
+    if (!_state->isTaken)
+        return;
     const bool isNew =
         _state->shown.lines() != grid.lines() || _state->shown.columns() != grid.columns();
     for (int line = 0; line < grid.lines(); ++line) {
@@ -166,7 +180,10 @@ void CursesDevice::show(const CellGrid& grid, CursorPlace cursor)
     _state->guard.heldErrors().collect();
 }
 
-std::optional<Key> CursesDevice::readKey() { return _state->keys.read(); }
+std::optional<Key> CursesDevice::readKey()
+{
+    return _state->isTaken ? _state->keys.read() : std::nullopt;
+}
 
 bool CursesDevice::isGone() const
 {
@@ -174,8 +191,8 @@ bool CursesDevice::isGone() const
     int waiting = 0;
     return ::poll(&input, 1, 0) > 0 &&
            ((input.revents & (POLLHUP | POLLERR)) ||
-            ((input.revents & POLLIN) && ::ioctl(STDIN_FILENO, FIONREAD, &waiting) == 0 &&
-             waiting == 0));
+            (_state->isTaken && (input.revents & POLLIN) &&
+             ::ioctl(STDIN_FILENO, FIONREAD, &waiting) == 0 && waiting == 0));
 }
 
 void CursesDevice::updateSize()
@@ -201,18 +218,28 @@ void CursesDevice::suspend()
     ::sigaction(SIGTSTP, &plain, &earlier);
     ::kill(0, SIGTSTP);
     ::sigaction(SIGTSTP, &earlier, nullptr);
-    _state->guard.rememberModes();
-    def_shell_mode();
     retake();
 }
 
 void CursesDevice::retake()
 {
+    if (isInBackground()) {
+        // To touch its modes would stop the process, before it has heard other signals.
+        _state->isTaken = false;
+        _state->guard.disarm();
+        return;
+    }
+    if (!_state->isTaken) {
+        _state->guard.rememberModes();
+        def_shell_mode();
+    }
     reset_prog_mode();
     _state->take();
     updateSize();
     clearok(curscr, TRUE);
     _state->shown = {};
 }
+
+bool CursesDevice::hasTerminal() const { return _state->isTaken; }
 
 } // namespace orvane

@@ -28,6 +28,8 @@ public:
     void updateSize() override;
     void suspend() override;
     void retake() override;
+    // False in the background, until a retake() in the foreground.
+    [[nodiscard]] bool hasTerminal() const;
 
 private:
     struct State;

@@ -64,10 +64,11 @@ public:
 
     // Takes over the size that the terminal has now.
     virtual void updateSize() = 0;
-    // Gives the terminal back, stops the process as Ctrl-Z does, and takes the terminal again when
-    // the process goes on.
+    // Gives the terminal back, stops the process as Ctrl-Z does, and retakes the terminal when the
+    // process goes on.
     virtual void suspend() = 0;
-    // Takes the terminal again, whatever others have done to it: everything is sent anew.
+    // Takes the terminal again, whatever others have done to it: everything is sent anew. Leaves it
+    // to others while the process is in the background; then nothing is shown and no key read.
     virtual void retake() = 0;
 };
 

@@ -318,6 +318,40 @@ TEST_F(TerminalProgramTest, ControlZGivesTheTerminalBackAndTheShellContinues)
     EXPECT_TRUE(shell->waitUntil([&] { return !shell->isOnOtherScreen(); }));
 }
 
+TEST_F(TerminalProgramTest, ASuspendedProgramEndsInOrderWhenTheShellKillsIt)
+{
+    const auto shell = startShell();
+    ASSERT_TRUE(shell->waitFor("ready>"));
+    shell->send(commandLine("--log none"));
+    ASSERT_TRUE(shell->waitFor("Serving Cell Info"));
+    shell->send(kControlZ);
+    ASSERT_TRUE(shell->waitFor("Stopped"));
+    const std::size_t before = shell->received().size();
+    shell->send(std::string("kill %1; wait -f %1; echo status $?.") + kEnter);
+    EXPECT_TRUE(shell->waitFor("status 0.")) << shell->screen();
+    EXPECT_THAT(shell->received().substr(before), Not(HasSubstr("\x1b[?1049")));
+}
+
+TEST_F(TerminalProgramTest, InTheBackgroundItLeavesTheTerminalToTheShellUntilItIsInFront)
+{
+    const auto shell = startShell();
+    ASSERT_TRUE(shell->waitFor("ready>"));
+    shell->send(commandLine("--log none"));
+    ASSERT_TRUE(shell->waitFor("Serving Cell Info"));
+    shell->send(kControlZ);
+    ASSERT_TRUE(shell->waitFor("Stopped"));
+    shell->send(std::string("bg; sleep 0.5; jobs; echo do''ne") + kEnter);
+    ASSERT_TRUE(shell->waitFor("done")) << shell->screen();
+    EXPECT_TRUE(shell->shows("Running")) << shell->screen();
+    EXPECT_FALSE(shell->isOnOtherScreen());
+    shell->send(std::string("fg") + kEnter);
+    ASSERT_TRUE(shell->waitUntil([&] {
+        return shell->isOnOtherScreen() && shell->shows("Serving Cell Info");
+    })) << shell->screen();
+    shell->send("q");
+    EXPECT_TRUE(shell->waitUntil([&] { return !shell->isOnOtherScreen(); }));
+}
+
 TEST_F(TerminalProgramTest, LogLinesWaitUntilTheScreenIsRestored)
 {
     const auto terminal = start({"--ports", ports(), "--log", "stderr"});
