@@ -1,5 +1,7 @@
 #include "platform/terminal/CursesKeys.h"
 
+#include "platform/terminal/Canvas.h"
+
 #include <cwchar>
 #include <ncurses.h>
 
@@ -15,12 +17,39 @@ constexpr int kPasteBegins = KEY_MAX + 1;
 constexpr int kPasteEnds = KEY_MAX + 2;
 constexpr int kEscapeDelayMs = 25;
 
-Key plainKey(Key::Kind kind)
-{
-    Key key;
-    key.kind = kind;
-    return key;
-}
+// A paste whose end was lost on the way ends with a pause.
+constexpr std::chrono::seconds kPastePause{1};
+constexpr int kBell = 7;
+constexpr int kLongestString = 4096;
+
+// What the usual terminals send, whatever TERM says of the one that is there.
+struct Code {
+    const char* sent;
+    int key;
+};
+constexpr Code kCodes[] = {
+    {"\033[200~", kPasteBegins},
+    {"\033[201~", kPasteEnds  },
+    {"\033[A",    KEY_UP      },
+    {"\033OA",    KEY_UP      },
+    {"\033[B",    KEY_DOWN    },
+    {"\033OB",    KEY_DOWN    },
+    {"\033[C",    KEY_RIGHT   },
+    {"\033OC",    KEY_RIGHT   },
+    {"\033[D",    KEY_LEFT    },
+    {"\033OD",    KEY_LEFT    },
+    {"\033[H",    KEY_HOME    },
+    {"\033OH",    KEY_HOME    },
+    {"\033[1~",   KEY_HOME    },
+    {"\033[7~",   KEY_HOME    },
+    {"\033[F",    KEY_END     },
+    {"\033OF",    KEY_END     },
+    {"\033[4~",   KEY_END     },
+    {"\033[8~",   KEY_END     },
+    {"\033[3~",   KEY_DC      },
+    {"\033[5~",   KEY_PPAGE   },
+    {"\033[6~",   KEY_NPAGE   },
+};
 
 Key mouseKey()
 {
@@ -55,8 +84,8 @@ CursesKeys::CursesKeys() : _pad(std::make_unique<Pad>())
     keypad(_pad->window, TRUE);
     nodelay(_pad->window, TRUE);
     set_escdelay(kEscapeDelayMs);
-    define_key("\033[200~", kPasteBegins);
-    define_key("\033[201~", kPasteEnds);
+    for (const Code& code : kCodes)
+        define_key(code.sent, code.key);
     mouseinterval(0);
     _hasMouse = mousemask(BUTTON1_PRESSED | BUTTON4_PRESSED | BUTTON5_PRESSED, nullptr) != 0;
 }
@@ -66,7 +95,14 @@ CursesKeys::~CursesKeys() = default;
 std::optional<Key> CursesKeys::read()
 {
     std::wint_t character = 0;
-    switch (wget_wch(_pad->window, &character)) {
+    const int result = wget_wch(_pad->window, &character);
+    if (result == ERR)
+        return std::nullopt;
+    const auto now = std::chrono::steady_clock::now();
+    if (now - _lastRead > kPastePause)
+        endPaste();
+    _lastRead = now;
+    switch (result) {
     case KEY_CODE_YES:
         return keyOfCode(static_cast<int>(character));
     case OK:
@@ -86,29 +122,29 @@ Key CursesKeys::keyOfCode(int code)
     case KEY_MOUSE:
         return mouseKey();
     case KEY_ENTER:
-        return plainKey(Key::Kind::Enter);
+        return keyOfKind(Key::Kind::Enter);
     case KEY_BACKSPACE:
-        return plainKey(Key::Kind::Backspace);
+        return keyOfKind(Key::Kind::Backspace);
     case KEY_DC:
-        return plainKey(Key::Kind::Delete);
+        return keyOfKind(Key::Kind::Delete);
     case KEY_BTAB:
-        return plainKey(Key::Kind::BackTab);
+        return keyOfKind(Key::Kind::BackTab);
     case KEY_UP:
-        return plainKey(Key::Kind::Up);
+        return keyOfKind(Key::Kind::Up);
     case KEY_DOWN:
-        return plainKey(Key::Kind::Down);
+        return keyOfKind(Key::Kind::Down);
     case KEY_LEFT:
-        return plainKey(Key::Kind::Left);
+        return keyOfKind(Key::Kind::Left);
     case KEY_RIGHT:
-        return plainKey(Key::Kind::Right);
+        return keyOfKind(Key::Kind::Right);
     case KEY_PPAGE:
-        return plainKey(Key::Kind::PageUp);
+        return keyOfKind(Key::Kind::PageUp);
     case KEY_NPAGE:
-        return plainKey(Key::Kind::PageDown);
+        return keyOfKind(Key::Kind::PageDown);
     case KEY_HOME:
-        return plainKey(Key::Kind::Home);
+        return keyOfKind(Key::Kind::Home);
     case KEY_END:
-        return plainKey(Key::Kind::End);
+        return keyOfKind(Key::Kind::End);
     default:
         return {};
     }
@@ -116,7 +152,7 @@ Key CursesKeys::keyOfCode(int code)
 
 Key CursesKeys::keyOfCharacter(char32_t character)
 {
-    Key key = plainKey(_isPasting ? Key::Kind::Pasted : Key::Kind::Character);
+    Key key = keyOfKind(_isPasting ? Key::Kind::Pasted : Key::Kind::Character);
     key.character = character;
     if (_isPasting)
         return key;
@@ -125,12 +161,12 @@ Key CursesKeys::keyOfCharacter(char32_t character)
         return readAfterEscape();
     case '\n':
     case '\r':
-        return plainKey(Key::Kind::Enter);
+        return keyOfKind(Key::Kind::Enter);
     case '\t':
-        return plainKey(Key::Kind::Tab);
+        return keyOfKind(Key::Kind::Tab);
     case '\b':
     case kDeleteCharacter:
-        return plainKey(Key::Kind::Backspace);
+        return keyOfKind(Key::Kind::Backspace);
     default:
         return key;
     }
@@ -144,18 +180,38 @@ Key CursesKeys::readAfterEscape()
     const auto next = [&] { return wget_wch(_pad->window, &character); };
     const int result = next();
     if (result == ERR)
-        return plainKey(Key::Kind::Escape);
+        return keyOfKind(Key::Kind::Escape);
     if (result == KEY_CODE_YES || character == kEscapeCharacter) {
         if (result == OK)
             unget_wch(static_cast<wchar_t>(character));
         else
             ungetch(static_cast<int>(character));
-        return plainKey(Key::Kind::Escape);
+        return keyOfKind(Key::Kind::Escape);
     }
-    if (character == '[' || character == 'O')
+    if (character == ']' || character == 'P' || character == '_' || character == '^' ||
+        character == 'X')
+        skipString();
+    else if (character == '[' || character == 'O')
         while (next() == OK && (character < 0x40 || character > 0x7E)) {
         }
     return {};
+}
+
+// An answer of the terminal's, or somebody's attempt at one: up to BEL or Escape and a backslash.
+void CursesKeys::skipString()
+{
+    wtimeout(_pad->window, kEscapeDelayMs); // may arrive in parts
+    std::wint_t character = 0;
+    for (int i = 0; i < kLongestString; ++i) {
+        const int result = wget_wch(_pad->window, &character);
+        if (result == ERR || (result == OK && character == kBell))
+            break;
+        if (result == OK && character == kEscapeCharacter) {
+            wget_wch(_pad->window, &character);
+            break;
+        }
+    }
+    nodelay(_pad->window, TRUE);
 }
 
 } // namespace orvane

@@ -2,6 +2,7 @@
 
 #include "platform/terminal/TerminalDevice.h"
 
+#include <chrono>
 #include <memory>
 #include <optional>
 
@@ -19,6 +20,8 @@ public:
 
     // The next key that is there already.
     std::optional<Key> read();
+    // What is being pasted has ended, whatever comes.
+    void endPaste() { _isPasting = false; }
     // Whether the terminal tells of clicks.
     [[nodiscard]] bool hasMouse() const { return _hasMouse; }
 
@@ -27,10 +30,12 @@ private:
     Key keyOfCode(int code);
     Key keyOfCharacter(char32_t character);
     Key readAfterEscape();
+    void skipString();
 
     std::unique_ptr<Pad> _pad;
     bool _hasMouse = false;
     bool _isPasting = false;
+    std::chrono::steady_clock::time_point _lastRead;
 };
 
 } // namespace orvane

@@ -149,6 +149,73 @@ TEST_F(TerminalProgramTest, KeysWithoutAMeaningDoNothing)
     ASSERT_TRUE(terminal->waitFor("filter as you type")) << "the last key, at the root";
 }
 
+TEST_F(TerminalProgramTest, WhatTheTerminalAnswersIsNoKeys)
+{
+    const auto terminal = startDemo();
+    ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
+    for (const char* begin : {"]", "P", "_", "^", "X"}) {
+        terminal->send(std::string(kEscape) + begin + "0;evil q\x07");
+        terminal->send(std::string(kEscape) + begin + "evil q\x1b\\");
+    }
+    terminal->send("?");
+    ASSERT_TRUE(terminal->waitFor("filter as you type")) << terminal->screen();
+}
+
+TEST_F(TerminalProgramTest, AnEndlessAnswerDoesNotKeepTheKeysForEver)
+{
+    const auto terminal = startDemo();
+    ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
+    terminal->send(kEscape + ("]" + std::string(2000, 'x')));
+    terminal->waitUntil([] { return false; }, 200ms);
+    terminal->send("?");
+    ASSERT_TRUE(terminal->waitFor("filter as you type"));
+}
+
+TEST_F(TerminalProgramTest, TheCodesOfOtherTerminalsForTheSameKeysWorkToo)
+{
+    const auto terminal = startDemo({}, 10);
+    ASSERT_TRUE(terminal->waitFor("1/11"));
+    for (const std::string end : {"[4~", "[F", "[8~", "OF"})
+        for (const std::string home : {"[1~", "[H", "[7~", "OH"}) {
+            terminal->send(kEscape + end);
+            ASSERT_TRUE(terminal->waitFor("11/11")) << end;
+            terminal->send(kEscape + home);
+            ASSERT_TRUE(terminal->waitFor(" 1/11")) << home;
+        }
+    for (const std::string kind : {"[", "O"}) {
+        terminal->send(kEscape + kind + "B");
+        ASSERT_TRUE(terminal->waitFor(" 2/11")) << kind;
+        terminal->send(kEscape + kind + "A");
+        ASSERT_TRUE(terminal->waitFor(" 1/11")) << kind;
+    }
+    terminal->send(std::string(kEscape) + "[6~");
+    ASSERT_TRUE(terminal->waitFor(" 7/11")) << terminal->screen();
+    terminal->send(std::string(kEscape) + "[5~");
+    ASSERT_TRUE(terminal->waitFor(" 1/11"));
+}
+
+TEST_F(TerminalProgramTest, APasteWhoseEndIsLostEndsWithAPause)
+{
+    const auto terminal = startDemo();
+    ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
+    terminal->send("\x1b[200~xyz?");
+    EXPECT_FALSE(
+        terminal->waitUntil([&] { return terminal->shows("filter as you type"); }, 1200ms));
+    terminal->send("?");
+    ASSERT_TRUE(terminal->waitFor("filter as you type"));
+}
+
+TEST_F(TerminalProgramTest, ControlCEndsItInOrderAlsoWithinAPaste)
+{
+    for (const std::string before : {"", "\x1b[200~xyz"}) {
+        const auto terminal = startDemo();
+        ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
+        terminal->send(before + "\x03");
+        EXPECT_EQ(terminal->waitForEnd(), 0);
+        expectRestored(*terminal);
+    }
+}
+
 TEST_F(TerminalProgramTest, TheFilterNarrowsTheRows)
 {
     const auto terminal = startDemo();
