@@ -282,8 +282,8 @@ TEST_F(TerminalProgramTest, AnAbsentServerIsWaitedForAndAKilledOneShows)
 {
     const auto terminal = start({"--ports", ports(), "--log", "none"});
     ASSERT_TRUE(terminal->waitFor("Waiting for the telephony server"));
-    EXPECT_TRUE(terminal->shows("Start telephonyd"));
-    EXPECT_TRUE(terminal->shows("Connecting..."));
+    EXPECT_TRUE(terminal->waitFor("Start telephonyd"));
+    EXPECT_TRUE(terminal->waitFor("Connecting..."));
     auto server = startServer();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     ASSERT_TRUE(terminal->waitFor("Updated 20"));
