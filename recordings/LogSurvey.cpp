@@ -72,7 +72,8 @@ std::string LogSurvey::complaint(const std::string& path) const
     if (isLog() && !_hasItems)
         return "\"" + path +
                "\": the log is empty, nothing follows its version report: name another file";
-    if (isLog())
+    // Without a report only times that agree tell a log of unknown codes from foreign bytes.
+    if (isLog() && (_beginsWithReport || _timelyItems > 1))
         return "\"" + path +
                "\" holds no log codes that tell its technology: name it with --technology, one "
                "of " +
