@@ -2,7 +2,7 @@
 
 #include "platform/PropertyList.h"
 #include "platform/SystemLog.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 #include <algorithm>
 #include <cmath>

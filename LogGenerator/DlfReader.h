@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ByteSource.h"
-#include "platform/PropertyValue.h"
+#include "platform/Bytes.h"
 
 #include <cstdint>
 #include <deque>

@@ -1,5 +1,7 @@
 #include "LogGenerator/Field.h"
 
+#include "platform/PropertyValue.h"
+
 #include <utility>
 
 namespace orvane

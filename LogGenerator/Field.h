@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/PacketView.h"
+#include "platform/PropertyValue.h"
 
 #include <cstdint>
 #include <optional>

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/UnrecognisedOperation.h"
+#include "platform/Calendar.h"
 #include "platform/Services.h"
 
 namespace orvane

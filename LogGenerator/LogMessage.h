@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/PacketView.h"
+#include "platform/Bytes.h"
 
 #include <cstdint>
 

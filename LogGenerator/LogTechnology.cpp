@@ -5,7 +5,9 @@
 #include "LogGenerator/LogMessage.h"
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/TelephonyServer.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 #include <set>
 

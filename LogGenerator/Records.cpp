@@ -1,6 +1,7 @@
 #include "LogGenerator/Records.h"
 
 #include "LogGenerator/ArrayOutOfBoundsException.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Field.h"
 #include "LogGenerator/PacketView.h"
+#include "platform/PropertyValue.h"
 
 #include <optional>
 #include <span>

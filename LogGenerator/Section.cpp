@@ -1,5 +1,8 @@
 #include "LogGenerator/Section.h"
 
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
+
 namespace orvane
 {
 

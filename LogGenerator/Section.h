@@ -4,6 +4,8 @@
 #include "LogGenerator/CellMonitor.h"
 #include "LogGenerator/Field.h"
 #include "LogGenerator/Records.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <span>

@@ -4,7 +4,8 @@
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

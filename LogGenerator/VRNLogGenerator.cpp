@@ -2,6 +2,8 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/VersionReport.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <cstdio>

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 
 #include <optional>
 

@@ -1,9 +1,12 @@
 #include "LogGenerator/VRNLogGenerator2.h"
 
+#include "LogGenerator/DictionaryResource.h"
 #include "LogGenerator/LogMessage.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 #include <charconv>
 #include <utility>

@@ -1,5 +1,6 @@
 #include "app/OrvaneApp.h"
 
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 #include "platform/toolkit/Screen.h"
 #include "ui/PaneStack.h"

@@ -1,6 +1,8 @@
 #include "app/OrvaneModel.h"
 
 #include "LogGenerator/StateKeys.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <exception>

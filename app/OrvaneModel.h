@@ -2,8 +2,10 @@
 
 #include "LogGenerator/LogChannelObserver.h"
 #include "LogGenerator/LogGenerator.h"
+#include "platform/Bytes.h"
 #include "platform/MainQueue.h"
 #include "platform/MessagePort.h"
+#include "platform/PropertyValue.h"
 #include "platform/TelephonyServer.h"
 #include "ui/OrvaneModelNode.h"
 

@@ -1,7 +1,10 @@
 #include "app/OrvaneModel.h"
 
+#include "platform/Bytes.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
+#include "platform/TelephonyConstants.h"
 
 #include <chrono>
 #include <exception>

@@ -3,6 +3,7 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 
 #include <benchmark/benchmark.h>

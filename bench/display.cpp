@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/PropertyValue.h"
 #include "ui/OrvaneModelNode.h"
 #include "ui/output/JsonPane.h"
 

@@ -6,7 +6,7 @@
 #include "platform/FileSystem.h"
 #include "platform/MainQueue.h"
 #include "platform/Services.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/LogRecorder.h"

@@ -6,6 +6,7 @@
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "platform/FileSystem.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 
 #include <benchmark/benchmark.h>

@@ -5,7 +5,7 @@
 #include "LogGenerator/LogTechnology.h"
 #include "platform/FileSystem.h"
 #include "platform/Services.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/FileWindow.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/LogTimeline.h"

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 
 #include <cstddef>

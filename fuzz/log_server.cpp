@@ -2,7 +2,9 @@
 // to the server's port and to a channel's.
 
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/TelephonyServer.h"
 #include "platform/fake/LoopbackTransport.h"
 #include "telephonyd/LogServer.h"

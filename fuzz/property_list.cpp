@@ -1,6 +1,8 @@
 // Both formats of property lists. What reads must survive being written and read again.
 
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
+#include "platform/Utf8.h"
 
 #include <cmath>
 #include <cstdlib>

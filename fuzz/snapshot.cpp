@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogTechnology.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/SnapshotTree.h"

@@ -1,5 +1,7 @@
 #include "platform/DateFormatter.h"
 
+#include "platform/Calendar.h"
+
 #include <cstdio>
 #include <string_view>
 

@@ -1,5 +1,6 @@
 #include "platform/FrameLocalPort.h"
 
+#include "platform/Bytes.h"
 #include "platform/FrameRequester.h"
 #include "platform/SystemLog.h"
 

@@ -1,5 +1,7 @@
 #include "platform/FrameRemotePort.h"
 
+#include "platform/Bytes.h"
+
 namespace orvane
 {
 

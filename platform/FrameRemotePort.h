@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/FrameRequester.h"
 #include "platform/InvalidationNotice.h"
 #include "platform/MessagePort.h"

@@ -1,5 +1,6 @@
 #include "platform/FrameRequester.h"
 
+#include "platform/Bytes.h"
 #include "platform/SystemLog.h"
 
 namespace orvane

@@ -1,8 +1,11 @@
 #include "platform/FrameTelephonyServer.h"
 
+#include "platform/Bytes.h"
 #include "platform/FrameRequester.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
+#include "platform/TelephonyConstants.h"
 
 #include <limits>
 

@@ -1,7 +1,7 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/MainQueue.h"
-#include "platform/PropertyValue.h"
 
 #include <chrono>
 #include <cstdint>

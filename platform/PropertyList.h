@@ -35,7 +35,4 @@ std::optional<std::string> writeXmlPropertyList(const PropertyValue& value);
 // The same as bytes, as messages and files carry it.
 std::optional<Bytes> xmlPropertyListBytes(const PropertyValue& value);
 
-// Whether the bytes are well-formed UTF-8 (no surrogates, nothing beyond U+10FFFF).
-bool isValidUtf8(std::string_view text);
-
 } // namespace orvane

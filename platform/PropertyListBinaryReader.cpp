@@ -1,7 +1,9 @@
 #include "platform/PropertyListBinaryReader.h"
 
+#include "platform/Bytes.h"
 #include "platform/PropertyListBinaryObjects.h"
 #include "platform/PropertyListText.h"
+#include "platform/PropertyValue.h"
 
 #include <algorithm>
 #include <bit>

@@ -1,5 +1,6 @@
 #include "platform/PropertyListXmlReader.h"
 
+#include "platform/Bytes.h"
 #include "platform/PropertyListText.h"
 #include "platform/PropertyListXmlBuilder.h"
 

@@ -1,6 +1,6 @@
 #include "platform/PropertyListXmlScalars.h"
 
-#include "platform/Clock.h"
+#include "platform/Calendar.h"
 #include "platform/PropertyListText.h"
 
 #include <array>

@@ -1,5 +1,8 @@
-#include "platform/Clock.h"
+#include "platform/Bytes.h"
+#include "platform/Calendar.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
+#include "platform/Utf8.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,6 @@
 #include "platform/PropertyValue.h"
 
-#include "platform/Clock.h"
+#include "platform/Calendar.h"
 #include "platform/Utf8.h"
 
 #include <cmath>

@@ -1,11 +1,11 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/OrderedMap.h"
 
 #include <cstdint>
 #include <memory>
 #include <optional>
-#include <span>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -17,9 +17,6 @@ namespace orvane
 
 class PropertyArray;
 class PropertyDictionary;
-
-using Bytes = std::vector<std::uint8_t>;
-using ByteView = std::span<const std::uint8_t>;
 
 // A point in time as property lists carry it: seconds since 1970-01-01 00:00:00 UTC.
 struct PropertyDate {

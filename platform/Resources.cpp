@@ -1,8 +1,6 @@
 #include "platform/Resources.h"
 
 #include "platform/FileSystem.h"
-#include "platform/PropertyList.h"
-#include "platform/SystemLog.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -26,20 +24,6 @@ std::vector<std::string> DirectoryResources::pathsOfType(std::string_view type) 
             paths.push_back(entry.path().string());
     std::sort(paths.begin(), paths.end());
     return paths;
-}
-
-PropertyValue loadDictionaryResource(const Resources& resources, std::string_view name)
-{
-    const std::optional<Bytes> content = resources.load(name, "plist");
-    if (!content)
-        return {};
-    const PropertyListResult result = readPropertyList(*content);
-    if (!result.value) {
-        logError("Resource \"%s\" cannot be read: %s", std::string(name).c_str(),
-                 result.error.c_str());
-        return {};
-    }
-    return result.value.asDictionary() ? result.value : PropertyValue();
 }
 
 } // namespace orvane

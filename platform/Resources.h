@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/PropertyValue.h"
+#include "platform/Bytes.h"
 
 #include <optional>
 #include <string>
@@ -34,9 +34,5 @@ public:
 private:
     std::string _directory;
 };
-
-// The resource as a property-list dictionary; absent when it is missing, unreadable or no
-// dictionary (why it cannot be read is logged).
-PropertyValue loadDictionaryResource(const Resources& resources, std::string_view name);
 
 } // namespace orvane

@@ -1,5 +1,7 @@
 #include "platform/Services.h"
 
+#include "platform/Bytes.h"
+
 namespace orvane
 {
 

@@ -1,6 +1,6 @@
 #include "platform/Utf8.h"
 
-#include "platform/PropertyList.h"
+#include <cstring>
 
 namespace orvane
 {
@@ -9,18 +9,6 @@ namespace
 {
 
 constexpr std::string_view kReplacement = "\xEF\xBF\xBD";
-
-// The length that the first byte of a sequence announces, 0 for a byte that cannot begin one.
-std::size_t announcedLength(unsigned char first)
-{
-    if (first < 0x80)
-        return 1;
-    if (first >= 0xC2 && first < 0xE0)
-        return 2;
-    if (first >= 0xE0 && first < 0xF0)
-        return 3;
-    return first >= 0xF0 && first < 0xF5 ? 4 : 0;
-}
 
 // U+FFFE and U+FFFF, which no XML holds.
 bool isNoCharacter(std::string_view sequence)
@@ -36,21 +24,91 @@ std::string transformed(std::string_view text, Append append)
 {
     std::string result;
     result.reserve(text.size());
-    for (std::size_t at = 0; at < text.size();) {
-        const std::size_t length = announcedLength(static_cast<unsigned char>(text[at]));
-        const std::string_view sequence = text.substr(at, length);
-        if (length == 0 || sequence.size() < length || !isValidUtf8(sequence)) {
+    while (!text.empty()) {
+        const std::size_t length = utf8CharacterLength(text);
+        if (length == 0)
             result += kReplacement;
-            ++at;
-            continue;
-        }
-        append(result, sequence);
-        at += length;
+        else
+            append(result, text.substr(0, length));
+        text.remove_prefix(length == 0 ? 1 : length);
     }
     return result;
 }
 
 } // namespace
+
+std::size_t utf8CharacterLength(std::string_view text)
+{
+    if (text.empty())
+        return 0;
+    const auto byteAt = [text](std::size_t at) { return static_cast<unsigned char>(text[at]); };
+    const unsigned first = byteAt(0);
+    std::size_t length = 0;
+    // The second byte's range excludes overlong forms, surrogates and what is beyond U+10FFFF.
+    unsigned lowest = 0x80;
+    unsigned highest = 0xBF;
+    if (first < 0x80)
+        return 1;
+    if (first >= 0xC2 && first <= 0xDF) {
+        length = 2;
+    } else if (first >= 0xE0 && first <= 0xEF) {
+        length = 3;
+        lowest = first == 0xE0 ? 0xA0 : lowest;
+        highest = first == 0xED ? 0x9F : highest;
+    } else if (first >= 0xF0 && first <= 0xF4) {
+        length = 4;
+        lowest = first == 0xF0 ? 0x90 : lowest;
+        highest = first == 0xF4 ? 0x8F : highest;
+    } else {
+        return 0;
+    }
+    if (text.size() < length || byteAt(1) < lowest || byteAt(1) > highest)
+        return 0;
+    for (std::size_t i = 2; i < length; ++i)
+        if (!isUtf8Continuation(text[i]))
+            return 0;
+    return length;
+}
+
+void appendUtf8(std::string& to, std::uint32_t character)
+{
+    const auto add = [&to](std::uint32_t byte) { to += static_cast<char>(byte); };
+    if (character < 0x80) {
+        add(character);
+    } else if (character < 0x800) {
+        add(0xC0 | character >> 6);
+        add(0x80 | (character & 0x3F));
+    } else if (character < 0x10000) {
+        add(0xE0 | character >> 12);
+        add(0x80 | (character >> 6 & 0x3F));
+        add(0x80 | (character & 0x3F));
+    } else {
+        add(0xF0 | character >> 18);
+        add(0x80 | (character >> 12 & 0x3F));
+        add(0x80 | (character >> 6 & 0x3F));
+        add(0x80 | (character & 0x3F));
+    }
+}
+
+bool isValidUtf8(std::string_view text)
+{
+    while (!text.empty()) {
+        // Nearly all texts are ASCII: eight bytes at a time as long as they are.
+        std::uint64_t word = 0;
+        if (text.size() >= sizeof word) {
+            std::memcpy(&word, text.data(), sizeof word);
+            if ((word & 0x8080808080808080U) == 0) {
+                text.remove_prefix(sizeof word);
+                continue;
+            }
+        }
+        const std::size_t length = utf8CharacterLength(text);
+        if (length == 0)
+            return false;
+        text.remove_prefix(length);
+    }
+    return true;
+}
 
 std::string validText(std::string_view text)
 {

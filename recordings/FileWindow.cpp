@@ -1,5 +1,7 @@
 #include "recordings/FileWindow.h"
 
+#include "platform/Bytes.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <cstring>

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ByteSource.h"
+#include "platform/Bytes.h"
 
 #include <memory>
 #include <string>

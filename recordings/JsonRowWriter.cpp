@@ -1,5 +1,6 @@
 #include "recordings/JsonRowWriter.h"
 
+#include "platform/JsonText.h"
 #include "ui/output/JsonPane.h"
 
 namespace orvane

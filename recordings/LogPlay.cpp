@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/PropertyValue.h"
 #include "recordings/LogSlice.h"
 #include "recordings/TimesAhead.h"
 

@@ -2,6 +2,8 @@
 
 #include "LogGenerator/DlfReader.h"
 #include "LogGenerator/LogGenerator.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "recordings/LogTime.h"
 #include "recordings/ServingCell.h"
 

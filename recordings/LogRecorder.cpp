@@ -2,9 +2,11 @@
 
 #include "LogGenerator/LogMessage.h"
 #include "LogGenerator/VersionReport.h"
+#include "platform/Bytes.h"
 #include "platform/Console.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/toolkit/Screen.h"
 
 #include <cerrno>

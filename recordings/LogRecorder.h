@@ -1,7 +1,9 @@
 #pragma once
 
 #include "LogGenerator/LogChannelObserver.h"
+#include "platform/Bytes.h"
 #include "platform/MainQueue.h"
+#include "platform/PropertyValue.h"
 #include "recordings/BlockFile.h"
 
 #include <chrono>

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/PropertyValue.h"
 #include "recordings/Checkpoints.h"
 #include "recordings/LogPlay.h"
 

@@ -1,5 +1,6 @@
 #include "recordings/OpenedRecording.h"
 
+#include "platform/Bytes.h"
 #include "platform/FileSystem.h"
 #include "platform/PropertyList.h"
 #include "recordings/FileWindow.h"

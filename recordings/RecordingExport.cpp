@@ -1,5 +1,6 @@
 #include "recordings/RecordingExport.h"
 
+#include "platform/PropertyValue.h"
 #include "recordings/LogSurvey.h"
 
 #include <utility>

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/PropertyValue.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/RefreshPeriods.h"
 #include "recordings/RowWriter.h"

@@ -1,5 +1,7 @@
 #include "recordings/RecordingPrinter.h"
 
+#include "platform/PropertyValue.h"
+
 #include <utility>
 
 namespace orvane

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/MainQueue.h"
+#include "platform/PropertyValue.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/RecordingSettings.h"

@@ -1,5 +1,7 @@
 #include "recordings/RowTable.h"
 
+#include "platform/PropertyValue.h"
+
 #include <algorithm>
 
 namespace orvane

@@ -1,6 +1,6 @@
 #include "recordings/ServingCell.h"
 
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #include "recordings/Snapshot.h"
 
 #include "LogGenerator/StateKeys.h"
-#include "platform/Clock.h"
+#include "platform/Calendar.h"
 
 #include <cstdio>
 

@@ -1,5 +1,7 @@
 #include "recordings/SnapshotTree.h"
 
+#include "platform/PropertyValue.h"
+
 namespace orvane
 {
 

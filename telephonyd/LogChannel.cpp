@@ -1,9 +1,11 @@
 #include "telephonyd/LogChannel.h"
 
+#include "platform/Bytes.h"
 #include "platform/FrameRequester.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/StartCommand.h"
 
 #include <utility>

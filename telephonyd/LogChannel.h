@@ -1,6 +1,8 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/FrameConnection.h"
+#include "platform/PropertyValue.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <functional>

@@ -1,10 +1,12 @@
 #include "telephonyd/LogServer.h"
 
+#include "platform/Bytes.h"
 #include "platform/FrameRequester.h"
 #include "platform/MessagePort.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/LogChannel.h"
 
 namespace orvane

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/DlfTime.h"
 #include "LogGenerator/LogMessage.h"
+#include "platform/Bytes.h"
 
 #include <utility>
 

@@ -1,7 +1,7 @@
 #include "telephonyd/StartCommand.h"
 
 #include "platform/SystemLog.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

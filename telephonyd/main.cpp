@@ -1,4 +1,5 @@
 #include "LogGenerator/LogTechnology.h"
+#include "platform/Bytes.h"
 #include "platform/FileSystem.h"
 #include "platform/Services.h"
 #include "platform/qt/PortsDirectory.h"

@@ -1,5 +1,6 @@
 #include "ui/SnapshotFile.h"
 
+#include "platform/Calendar.h"
 #include "platform/PropertyList.h"
 #include "platform/Services.h"
 #include "platform/Utf8.h"

@@ -1,10 +1,13 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
 #include "LogGenerator/C2K/C2KDecoders.h"
+#include "LogGenerator/DictionaryResource.h"
 #include "LogGenerator/LogMessage.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 #include <algorithm>
 

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "LogGenerator/VRNLogGenerator.h"
+#include "platform/Bytes.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <iterator>

@@ -2,6 +2,7 @@
 #include "LogGenerator/C2K/C2KFormats.h"
 #include "LogGenerator/C2K/Subpackets.h"
 #include "LogGenerator/C2K/TrafficErrors.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <cmath>

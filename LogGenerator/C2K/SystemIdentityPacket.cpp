@@ -1,5 +1,6 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/C2K/C2KFormats.h"
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 // The 1x system identity packet.

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/GSM/GainControl.h"
 #include "LogGenerator/GSM/LogCodes.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

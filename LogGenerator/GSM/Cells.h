@@ -1,7 +1,8 @@
 #pragma once
 
 #include "LogGenerator/CellMonitor.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #include "LogGenerator/GSM/EquivalentPLMNList.h"
 
 #include "LogGenerator/GSM/LogCodes.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -2,8 +2,10 @@
 
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/Bytes.h"
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 #include <utility>
 

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/GSM/LogCodes.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

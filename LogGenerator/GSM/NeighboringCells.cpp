@@ -2,6 +2,8 @@
 
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/LogCodes.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -3,6 +3,8 @@
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/LogCodes.h"
 #include "LogGenerator/GSM/NasTables.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

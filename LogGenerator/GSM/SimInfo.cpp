@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogMessage.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -3,6 +3,7 @@
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/GainControl.h"
 #include "LogGenerator/GSM/LogCodes.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

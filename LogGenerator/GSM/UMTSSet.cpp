@@ -2,6 +2,7 @@
 
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/RankingPacket.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

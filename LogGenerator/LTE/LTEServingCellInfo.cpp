@@ -1,7 +1,8 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
 #include "LogGenerator/Formats.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

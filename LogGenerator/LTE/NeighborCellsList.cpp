@@ -3,6 +3,7 @@
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LTEFormats.h"
 #include "LogGenerator/LTE/LogCodes.h"
+#include "platform/PropertyValue.h"
 #include "platform/Services.h"
 
 namespace orvane

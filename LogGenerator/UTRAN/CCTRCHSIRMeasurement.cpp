@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/UTRAN/TransportChannels.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
 
 #include "LogGenerator/Formats.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Section.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

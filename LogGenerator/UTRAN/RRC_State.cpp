@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Formats.h"
 #include "platform/Console.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Clock.h"
+#include "platform/Calendar.h"
 #include "platform/toolkit/Playback.h"
 
 #include <string>

@@ -1,5 +1,6 @@
 #include "platform/fake/LoopbackConnection.h"
 
+#include "platform/Bytes.h"
 #include "platform/SystemLog.h"
 
 #include <algorithm>

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/FrameConnection.h"
 #include "platform/fake/ManualMainQueue.h"
 

@@ -1,5 +1,6 @@
 #include "platform/fake/LoopbackTransport.h"
 
+#include "platform/Bytes.h"
 #include "platform/MessagePort.h"
 #include "platform/fake/LoopbackConnection.h"
 

@@ -1,6 +1,7 @@
 #include "platform/fake/ScriptedTelephonyServer.h"
 
 #include "platform/PropertyList.h"
+#include "platform/TelephonyConstants.h"
 
 #include <algorithm>
 #include <stdexcept>

@@ -3,7 +3,7 @@
 #include "platform/FrameConnection.h"
 #include "platform/MainQueue.h"
 #include "platform/PropertyValue.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/LoopbackTransport.h"
 
 #include <cstdint>

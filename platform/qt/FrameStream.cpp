@@ -1,5 +1,6 @@
 #include "platform/qt/FrameStream.h"
 
+#include "platform/Bytes.h"
 #include "platform/SystemLog.h"
 
 #include <algorithm>

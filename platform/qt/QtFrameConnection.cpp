@@ -1,5 +1,6 @@
 #include "platform/qt/QtFrameConnection.h"
 
+#include "platform/Bytes.h"
 #include "platform/qt/FrameStream.h"
 
 namespace orvane

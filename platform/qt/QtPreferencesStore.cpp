@@ -1,5 +1,6 @@
 #include "platform/qt/QtPreferencesStore.h"
 
+#include "platform/PropertyValue.h"
 #include "platform/SystemLog.h"
 
 #include <QDBusConnection>

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/PreferencesStore.h"
+#include "platform/PropertyValue.h"
 
 #include <map>
 #include <memory>

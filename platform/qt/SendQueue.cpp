@@ -1,5 +1,7 @@
 #include "platform/qt/SendQueue.h"
 
+#include "platform/Bytes.h"
+
 #include <cerrno>
 #include <sys/socket.h>
 

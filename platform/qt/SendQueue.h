@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/Frame.h"
 
 namespace orvane

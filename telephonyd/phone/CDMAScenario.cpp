@@ -1,6 +1,7 @@
 #include "telephonyd/phone/CDMAScenario.h"
 
-#include "platform/TelephonyServer.h"
+#include "platform/Calendar.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/EvdoPackets.h"
 #include "telephonyd/phone/LTETown.h"
 #include "telephonyd/phone/OneXPackets.h"

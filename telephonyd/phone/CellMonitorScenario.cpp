@@ -1,7 +1,9 @@
 #include "telephonyd/phone/CellMonitorScenario.h"
 
+#include "platform/Bytes.h"
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/LTETown.h"
 
 #include <algorithm>

@@ -1,5 +1,6 @@
 #include "telephonyd/phone/PhoneSource.h"
 
+#include "platform/Bytes.h"
 #include "platform/Services.h"
 #include "telephonyd/phone/PacketWriter.h"
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Bytes.h"
 #include "platform/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 #include "telephonyd/phone/Scenario.h"

@@ -1,6 +1,8 @@
 #include "telephonyd/phone/ServerItems.h"
 
+#include "platform/Bytes.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

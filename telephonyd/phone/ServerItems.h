@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/PropertyValue.h"
 #include "telephonyd/phone/Scenario.h"
 
 namespace orvane

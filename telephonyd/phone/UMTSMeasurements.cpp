@@ -1,6 +1,7 @@
 // What the phone of UMTSScenario hears.
 
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/ServerItems.h"
 #include "telephonyd/phone/UMTSScenario.h"
 

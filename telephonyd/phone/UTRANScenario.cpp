@@ -1,6 +1,7 @@
 #include "telephonyd/phone/UTRANScenario.h"
 
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/LTETown.h"
 #include "telephonyd/phone/ServerItems.h"
 #include "telephonyd/phone/UTRANPackets.h"

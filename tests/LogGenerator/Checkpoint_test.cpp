@@ -6,7 +6,8 @@
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/RecordedMessages.h"
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -7,6 +7,7 @@
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "LogGenerator/support/SectionTest.h"
 #include "platform/FileSystem.h"
+#include "platform/PropertyValue.h"
 
 #include <functional>
 

@@ -3,7 +3,8 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "support/Recording.h"
 
 #include <gtest/gtest.h>

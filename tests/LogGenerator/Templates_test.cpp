@@ -1,8 +1,10 @@
 // Holds every class index against the template that the program ships for it.
 
+#include "LogGenerator/DictionaryResource.h"
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
 #include "LogGenerator/LTE/LTEClassIndex.h"
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
+#include "platform/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

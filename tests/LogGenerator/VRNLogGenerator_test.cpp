@@ -3,6 +3,7 @@
 #include "LogGenerator/DlfWriter.h"
 #include "LogGenerator/PacketView.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

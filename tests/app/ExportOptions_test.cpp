@@ -1,7 +1,7 @@
 #include "app/ExportOptions.h"
 
 #include "app/AppOptions.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -4,6 +4,8 @@
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/FakePreferencesStore.h"
 #include "platform/fake/FakeScreen.h"
 #include "platform/fake/LoopbackTransport.h"

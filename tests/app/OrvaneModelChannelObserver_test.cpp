@@ -2,6 +2,8 @@
 #include "app/OrvaneModel.h"
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/LoopbackTransport.h"
 #include "platform/fake/ScriptedTelephonyServer.h"
 #include "support/Recording.h"

@@ -3,6 +3,8 @@
 #include "LogGenerator/support/PacketBuilder.h"
 #include "platform/FramePorts.h"
 #include "platform/FrameTelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/LoopbackTransport.h"
 #include "platform/fake/ScriptedTelephonyServer.h"
 #include "support/Recording.h"

@@ -1,6 +1,8 @@
 #include "platform/FrameTelephonyServer.h"
 
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/LoopbackTransport.h"
 #include "platform/fake/ScriptedTelephonyServer.h"
 #include "support/Recording.h"

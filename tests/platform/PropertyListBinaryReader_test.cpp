@@ -1,5 +1,6 @@
 #include "platform/PropertyListBinaryReader.h"
 
+#include "platform/PropertyValue.h"
 #include "support/PropertyListBytes.h"
 
 #include <cmath>

@@ -1,5 +1,6 @@
 // The encodings of XML property lists.
 
+#include "platform/PropertyValue.h"
 #include "support/PropertyListBytes.h"
 
 #include <gtest/gtest.h>

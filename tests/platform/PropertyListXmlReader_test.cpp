@@ -1,5 +1,6 @@
 #include "platform/PropertyListXmlReader.h"
 
+#include "platform/PropertyValue.h"
 #include "support/PropertyListBytes.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "support/PropertyListBytes.h"
 
 #include <cmath>

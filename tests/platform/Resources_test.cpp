@@ -58,42 +58,5 @@ TEST_F(ResourcesTest, MissingDirectoryHasNoResources)
     EXPECT_TRUE(missing.pathsOfType("plist").empty());
 }
 
-TEST_F(ResourcesTest, DictionaryIsLoadedInEitherFormat)
-{
-    put("Text.plist", xmlList("<dict><key>Cells</key><array/></dict>"));
-    EXPECT_EQ(loadDictionaryResource(resources, "Text").description(), "{Cells = ()}");
-
-    BinaryListBuilder binary;
-    const std::size_t key = binary.ascii("Cells");
-    const std::size_t value = binary.boolean(true);
-    binary.dictionary({key}, {value});
-    ASSERT_TRUE(writeFile(directory.path() + "/Binary.plist", binary.bytes()));
-    EXPECT_EQ(loadDictionaryResource(resources, "Binary").description(), "{Cells = true}");
-    EXPECT_TRUE(services.log.lines.empty());
-}
-
-TEST_F(ResourcesTest, MissingDictionaryIsAbsentWithoutALine)
-{
-    EXPECT_TRUE(loadDictionaryResource(resources, "Missing").isAbsent());
-    EXPECT_TRUE(services.log.lines.empty());
-}
-
-TEST_F(ResourcesTest, UnreadableDictionaryIsAbsentAndTheReasonIsLogged)
-{
-    put("Broken.plist", "<plist>\n<dict>");
-    EXPECT_TRUE(loadDictionaryResource(resources, "Broken").isAbsent());
-    EXPECT_EQ(services.log.errors(),
-              std::vector<std::string>{"Resource \"Broken\" cannot be read: no element found at "
-                                       "line 2, column 7"});
-}
-
-TEST_F(ResourcesTest, ResourceThatIsNoDictionaryIsAbsent)
-{
-    put("Array.plist", xmlList("<array/>"));
-    put("Text.plist", xmlList("<string>text</string>"));
-    EXPECT_TRUE(loadDictionaryResource(resources, "Array").isAbsent());
-    EXPECT_TRUE(loadDictionaryResource(resources, "Text").isAbsent());
-}
-
 } // namespace
 } // namespace orvane

@@ -1,5 +1,6 @@
 #include "platform/FileSystem.h"
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "processes/support/ChildProcess.h"
 #include "support/TemporaryDirectory.h"
 

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "platform/qt/QtPreferencesStore.h"
 
 #include "support/Recording.h"

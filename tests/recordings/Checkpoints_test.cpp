@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/Checkpoints.h"
 
 #include "recordings/support/LogFiles.h"

@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/LogPlay.h"
 
 #include "recordings/support/LiveView.h"

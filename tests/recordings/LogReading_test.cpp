@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/LogReading.h"
 
 #include "recordings/support/LogFiles.h"

@@ -1,3 +1,5 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/LogRecorder.h"
 
 #include "LogGenerator/DlfReader.h"
@@ -6,7 +8,6 @@
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
 #include "platform/FileSystem.h"
-#include "platform/TelephonyServer.h"
 #include "platform/fake/FakeScreen.h"
 #include "platform/fake/ManualMainQueue.h"
 #include "support/Recording.h"

@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/LogSurvey.h"
 
 #include "LogGenerator/VersionReport.h"

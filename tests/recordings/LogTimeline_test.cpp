@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/LogTimeline.h"
 
 #include "recordings/FileWindow.h"

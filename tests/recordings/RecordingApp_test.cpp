@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/RecordingApp.h"
 
 #include "platform/fake/FakeScreen.h"

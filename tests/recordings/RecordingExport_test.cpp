@@ -1,3 +1,5 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/RecordingExport.h"
 
 #include "platform/FileSystem.h"

@@ -1,3 +1,4 @@
+#include "platform/TelephonyConstants.h"
 #include "recordings/RecordingPlayer.h"
 
 #include "platform/fake/ManualMainQueue.h"

@@ -1,3 +1,5 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/RecordingPrinter.h"
 
 #include "platform/fake/ManualMainQueue.h"

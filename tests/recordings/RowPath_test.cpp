@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/RowPath.h"
 
 #include "ui/OrvaneModelNode.h"

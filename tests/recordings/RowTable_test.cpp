@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/RowTable.h"
 
 #include <gmock/gmock.h>

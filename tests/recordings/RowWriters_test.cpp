@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"

@@ -1,6 +1,7 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "recordings/ServingCell.h"
 
-#include "platform/TelephonyServer.h"
 #include "recordings/LogPlay.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"

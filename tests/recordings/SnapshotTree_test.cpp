@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/SnapshotTree.h"
 
 #include "recordings/support/LogFiles.h"

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "recordings/Snapshot.h"
 
 #include "LogGenerator/LogGenerator.h"

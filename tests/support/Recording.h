@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Calendar.h"
 #include "platform/Clock.h"
 #include "platform/Console.h"
 #include "platform/Services.h"

@@ -1,6 +1,5 @@
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/DaemonOptions.h"
-
-#include "platform/TelephonyServer.h"
 
 #include <gmock/gmock.h>
 

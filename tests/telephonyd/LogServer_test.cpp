@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "telephonyd/LogServer.h"
 
 #include "support/Recording.h"

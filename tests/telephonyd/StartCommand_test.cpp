@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "telephonyd/StartCommand.h"
 
 #include "support/Recording.h"

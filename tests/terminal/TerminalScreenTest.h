@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/PropertyValue.h"
 #include "platform/fake/ManualMainQueue.h"
 #include "platform/terminal/LineWidth.h"
 #include "platform/terminal/TerminalScreen.h"

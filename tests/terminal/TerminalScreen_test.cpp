@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "terminal/TerminalScreenTest.h"
 
 namespace orvane

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "ui/OrvaneModelNode.h"
 
 #include "platform/ArrayLock.h"

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "ui/OrvanePaneController.h"
 
 #include "platform/fake/FakeScreen.h"

@@ -1,3 +1,4 @@
+#include "platform/PropertyValue.h"
 #include "ui/SnapshotFile.h"
 
 #include "platform/PropertyList.h"

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/FileSystem.h"
+#include "platform/PropertyValue.h"
 #include "platform/fake/ManualMainQueue.h"
 #include "platform/toolkit/Window.h"
 #include "platform/window/PaneDeck.h"

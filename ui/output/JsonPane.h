@@ -29,8 +29,6 @@ private:
     bool _isSimulated;
 };
 
-// Appends the text as a JSON string: quotation marks around it, non-ASCII text as UTF-8.
-void appendJsonString(std::string& to, std::string_view text);
 // Appends {"name":...,"children":[...]} or {"name":...,"value":...}; null for no node.
 void appendJsonNode(std::string& to, const OrvaneModelNode* node);
 

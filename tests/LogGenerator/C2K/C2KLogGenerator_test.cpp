@@ -2,7 +2,8 @@
 
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "platform/FileSystem.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -4,6 +4,7 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
+#include "platform/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

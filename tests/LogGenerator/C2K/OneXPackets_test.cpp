@@ -1,4 +1,5 @@
 #include "LogGenerator/C2K/C2KTest.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #include "LogGenerator/GSM/CodingScheme.h"
 
 #include "LogGenerator/support/SectionTest.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

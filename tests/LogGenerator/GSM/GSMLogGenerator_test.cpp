@@ -3,7 +3,8 @@
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -2,6 +2,8 @@
 
 #include "LogGenerator/support/CellRecord.h"
 #include "LogGenerator/support/SectionTest.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -3,6 +3,8 @@
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
 #include "LogGenerator/support/CellRecord.h"
 #include "LogGenerator/support/SectionTest.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 namespace orvane
 {

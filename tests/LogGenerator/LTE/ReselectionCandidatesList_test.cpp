@@ -1,6 +1,7 @@
 #include "LogGenerator/LTE/ReselectionCandidatesList.h"
 
 #include "LogGenerator/support/SectionTest.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,6 +1,7 @@
 #include "LogGenerator/UTRAN/RRC_State.h"
 
 #include "LogGenerator/support/SectionTest.h"
+#include "platform/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,7 +1,8 @@
 #pragma once
 
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 
 #include <initializer_list>
 #include <utility>

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "platform/PropertyValue.h"
 
 #include <functional>
 #include <memory>

@@ -2,6 +2,7 @@
 // Prints a line for each start command. In the mode "other-ids" it sends messages with other ids
 // than 0, then one with 0; in "streaming" one message after each start command.
 
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/ScriptedTelephonyServer.h"
 #include "platform/qt/QtEventLoop.h"
 #include "platform/qt/QtFrameTransport.h"

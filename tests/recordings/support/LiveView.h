@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
+#include "platform/PropertyValue.h"
 #include "recordings/LogTime.h"
 #include "recordings/support/LogFiles.h"
 

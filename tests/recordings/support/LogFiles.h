@@ -2,7 +2,7 @@
 
 #include "LogGenerator/LogTechnology.h"
 #include "platform/FileSystem.h"
-#include "platform/TelephonyServer.h"
+#include "platform/TelephonyConstants.h"
 
 #include <cstdint>
 #include <memory>

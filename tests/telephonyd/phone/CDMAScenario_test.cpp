@@ -1,6 +1,6 @@
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/CDMAScenario.h"
 
-#include "platform/TelephonyServer.h"
 #include "telephonyd/phone/CDMATown.h"
 #include "telephonyd/support/PhoneTour.h"
 

@@ -1,6 +1,7 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/CellMonitorScenario.h"
 
-#include "platform/TelephonyServer.h"
 #include "telephonyd/support/PhoneTour.h"
 
 #include <gmock/gmock.h>

@@ -1,7 +1,8 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/LTEScenario.h"
 
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
 #include "telephonyd/phone/ServerItems.h"
 
 #include <gmock/gmock.h>

@@ -1,6 +1,7 @@
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "telephonyd/phone/UTRANScenario.h"
 
-#include "platform/TelephonyServer.h"
 #include "telephonyd/phone/ServerItems.h"
 #include "telephonyd/phone/UTRANTown.h"
 #include "telephonyd/support/PhoneTour.h"

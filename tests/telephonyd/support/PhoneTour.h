@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/PropertyList.h"
+#include "platform/PropertyValue.h"
 #include "telephonyd/phone/Scenario.h"
 
 #include <algorithm>

@@ -1,7 +1,8 @@
 #pragma once
 
 #include "platform/PropertyList.h"
-#include "platform/TelephonyServer.h"
+#include "platform/PropertyValue.h"
+#include "platform/TelephonyConstants.h"
 #include "platform/fake/LoopbackTransport.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,5 @@
+#include "platform/JsonText.h"
+#include "platform/PropertyValue.h"
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 

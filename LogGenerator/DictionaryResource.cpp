@@ -1,0 +1,26 @@
+#include "LogGenerator/DictionaryResource.h"
+
+#include "platform/PropertyList.h"
+#include "platform/Resources.h"
+#include "platform/SystemLog.h"
+
+#include <string>
+
+namespace orvane
+{
+
+PropertyValue loadDictionaryResource(const Resources& resources, std::string_view name)
+{
+    const std::optional<Bytes> content = resources.load(name, "plist");
+    if (!content)
+        return {};
+    const PropertyListResult result = readPropertyList(*content);
+    if (!result.value) {
+        logError("Resource \"%s\" cannot be read: %s", std::string(name).c_str(),
+                 result.error.c_str());
+        return {};
+    }
+    return result.value.asDictionary() ? result.value : PropertyValue();
+}
+
+} // namespace orvane
