@@ -1,8 +1,8 @@
 #include "LogGenerator/Base.h"
 
 #include "LogGenerator/UnrecognisedOperation.h"
-#include "platform/ArrayLock.h"
-#include "platform/SystemLog.h"
+#include "platform/base/ArrayLock.h"
+#include "platform/services/SystemLog.h"
 
 #include <utility>
 

@@ -1,8 +1,8 @@
 #include "LogGenerator/CellMonitor.h"
 
-#include "platform/PropertyList.h"
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/SystemLog.h"
 
 #include <algorithm>
 #include <cmath>

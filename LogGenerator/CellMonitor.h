@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/Formats.h"
-#include "LogGenerator/LogMessage.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/LogMessage.h"
+#include "platform/base/PropertyValue.h"
 
 #include <cstdint>
 #include <optional>

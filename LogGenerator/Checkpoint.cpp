@@ -3,7 +3,7 @@
 #include "LogGenerator/SharingCopier.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/VRNLogGenerator2.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <algorithm>
 #include <iterator>

@@ -1,7 +1,7 @@
 #include "LogGenerator/ClassIndex.h"
 
-#include "platform/Console.h"
-#include "platform/SystemLog.h"
+#include "platform/services/Console.h"
+#include "platform/services/SystemLog.h"
 
 #include <charconv>
 

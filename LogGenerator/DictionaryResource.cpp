@@ -1,8 +1,8 @@
 #include "LogGenerator/DictionaryResource.h"
 
-#include "platform/PropertyList.h"
-#include "platform/Resources.h"
-#include "platform/SystemLog.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/Resources.h"
+#include "platform/services/SystemLog.h"
 
 #include <string>
 

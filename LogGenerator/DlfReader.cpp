@@ -1,7 +1,7 @@
 #include "LogGenerator/DlfReader.h"
 
 #include "LogGenerator/DlfTime.h"
-#include "LogGenerator/PacketView.h"
+#include "platform/base/PacketView.h"
 
 #include <algorithm>
 

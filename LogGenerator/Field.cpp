@@ -1,6 +1,6 @@
 #include "LogGenerator/Field.h"
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <utility>
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "LogGenerator/PacketView.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PacketView.h"
+#include "platform/base/PropertyValue.h"
 
 #include <cstdint>
 #include <optional>

@@ -1,6 +1,6 @@
 #include "LogGenerator/Formats.h"
 
-#include "platform/FormatText.h"
+#include "platform/base/FormatText.h"
 
 #include <charconv>
 #include <cstdarg>

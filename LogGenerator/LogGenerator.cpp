@@ -2,8 +2,8 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/UnrecognisedOperation.h"
-#include "platform/Calendar.h"
-#include "platform/Services.h"
+#include "platform/base/Calendar.h"
+#include "platform/services/Services.h"
 
 namespace orvane
 {

@@ -2,12 +2,12 @@
 
 #include "LogGenerator/DlfWriter.h"
 #include "LogGenerator/LogGenerator.h"
-#include "LogGenerator/LogMessage.h"
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/LogMessage.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 #include <set>
 

@@ -1,7 +1,7 @@
 #include "LogGenerator/Records.h"
 
 #include "LogGenerator/ArrayOutOfBoundsException.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/Field.h"
-#include "LogGenerator/PacketView.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PacketView.h"
+#include "platform/base/PropertyValue.h"
 
 #include <optional>
 #include <span>

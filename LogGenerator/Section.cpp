@@ -1,7 +1,7 @@
 #include "LogGenerator/Section.h"
 
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -4,9 +4,9 @@
 #include "LogGenerator/CellMonitor.h"
 #include "LogGenerator/Field.h"
 #include "LogGenerator/Records.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 #include <span>
 

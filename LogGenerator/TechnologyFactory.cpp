@@ -4,8 +4,8 @@
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #include "LogGenerator/TechnologyOption.h"
 
 #include "LogGenerator/LogTechnology.h"
-#include "platform/CommandLine.h"
+#include "platform/base/CommandLine.h"
 
 namespace orvane
 {

@@ -2,9 +2,9 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/VersionReport.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 #include <cstdio>
 #include <utility>

@@ -2,8 +2,8 @@
 
 #include "LogGenerator/ClassIndex.h"
 #include "LogGenerator/VRNLogGenerator.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
 
 #include <memory>
 #include <string>

@@ -1,7 +1,7 @@
 #include "LogGenerator/VersionReport.h"
 
 #include "LogGenerator/DlfWriter.h"
-#include "platform/Services.h"
+#include "platform/services/Services.h"
 
 #include <string>
 

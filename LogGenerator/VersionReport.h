@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
 
 #include <optional>
 

@@ -1,6 +1,6 @@
 #include "app/CommandInterpreter.h"
 
-#include "platform/Utf8.h"
+#include "platform/base/Utf8.h"
 
 #include <string>
 

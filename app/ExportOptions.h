@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 #include "recordings/RecordingExport.h"
 
 #include <memory>

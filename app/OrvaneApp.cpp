@@ -1,7 +1,7 @@
 #include "app/OrvaneApp.h"
 
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/Services.h"
 #include "platform/toolkit/Screen.h"
 #include "ui/PaneStack.h"
 

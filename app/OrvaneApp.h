@@ -1,9 +1,9 @@
 #pragma once
 
 #include "app/OrvaneModel.h"
-#include "platform/DateFormatter.h"
-#include "platform/FileSystem.h"
-#include "platform/PreferencesStore.h"
+#include "platform/services/DateFormatter.h"
+#include "platform/services/FileSystem.h"
+#include "platform/services/PreferencesStore.h"
 #include "platform/toolkit/NavigationController.h"
 #include "platform/toolkit/Window.h"
 #include "ui/OrvanePaneController.h"

@@ -1,9 +1,9 @@
 #include "app/OrvaneModel.h"
 
 #include "LogGenerator/StateKeys.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 #include <exception>
 #include <typeinfo>

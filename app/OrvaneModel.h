@@ -2,11 +2,11 @@
 
 #include "LogGenerator/LogChannelObserver.h"
 #include "LogGenerator/LogGenerator.h"
-#include "platform/Bytes.h"
-#include "platform/MainQueue.h"
-#include "platform/MessagePort.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyServer.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/ports/MessagePort.h"
+#include "platform/ports/TelephonyServer.h"
+#include "platform/services/MainQueue.h"
 #include "ui/OrvaneModelNode.h"
 
 #include <chrono>

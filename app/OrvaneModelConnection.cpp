@@ -1,10 +1,10 @@
 #include "app/OrvaneModel.h"
 
-#include "platform/Bytes.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/SystemLog.h"
 
 #include <chrono>
 #include <exception>

@@ -2,9 +2,9 @@
 
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/Services.h"
 
 #include <benchmark/benchmark.h>
 

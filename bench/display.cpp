@@ -2,7 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/OrvaneModelNode.h"
 #include "ui/output/JsonPane.h"
 

@@ -5,7 +5,7 @@
 #include "LogGenerator/DlfTime.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/VRNLogGenerator.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <benchmark/benchmark.h>
 

@@ -1,10 +1,10 @@
 // Frames over a real socket between two processes: how many small ones a second, how fast large
 // ones, and how long a request waits for its answer.
 
-#include "platform/qt/PortsDirectory.h"
-#include "platform/qt/QtEventLoop.h"
-#include "platform/qt/QtFrameTransport.h"
-#include "platform/qt/QtMainQueue.h"
+#include "platform/linux/PortsDirectory.h"
+#include "platform/linux/QtEventLoop.h"
+#include "platform/linux/QtFrameTransport.h"
+#include "platform/linux/QtMainQueue.h"
 
 #include <benchmark/benchmark.h>
 

@@ -5,9 +5,9 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
-#include "platform/FileSystem.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/FileSystem.h"
+#include "platform/services/Services.h"
 
 #include <benchmark/benchmark.h>
 

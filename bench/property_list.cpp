@@ -1,8 +1,8 @@
 // What a message with a cell array costs to read, in both formats, and a list to write.
 
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 
 #include <benchmark/benchmark.h>
 #include <stdexcept>

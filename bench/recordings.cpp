@@ -3,9 +3,9 @@
 // many as ORVANE_BENCH_MEGABYTES says.
 
 #include "LogGenerator/LogTechnology.h"
-#include "platform/FileSystem.h"
-#include "platform/Services.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/FileSystem.h"
+#include "platform/services/Services.h"
 #include "recordings/FileWindow.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/LogTimeline.h"

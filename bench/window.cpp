@@ -1,7 +1,7 @@
 // A refresh of a pane with 1,000 rows in the window: every value new, the visible rows drawn.
 
 #include "platform/toolkit/Window.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 #include "platform/toolkit/NavigationController.h"
 #include "platform/window/QtScreen.h"
 #include "platform/window/QtWindowApplication.h"

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/Services.h"
 
 #include <cstddef>
 #include <cstdint>

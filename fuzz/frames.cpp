@@ -4,7 +4,7 @@
 // The input's first byte is the number of piece lengths that follow it, one byte each; they are
 // used in turn, again and again. The rest is the stream.
 
-#include "platform/Frame.h"
+#include "platform/ports/Frame.h"
 
 #include <algorithm>
 #include <cstdlib>

@@ -1,12 +1,12 @@
 // Clients of a telephony server that send anything: requests, commands and bytes that are neither,
 // to the server's port and to a channel's.
 
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
-#include "platform/TelephonyConstants.h"
-#include "platform/TelephonyServer.h"
-#include "platform/fake/LoopbackTransport.h"
+#include "doubles/LoopbackTransport.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/ports/TelephonyServer.h"
+#include "platform/services/Services.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/phone/Scenarios.h"
 

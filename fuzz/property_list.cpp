@@ -1,8 +1,8 @@
 // Both formats of property lists. What reads must survive being written and read again.
 
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/Utf8.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/Utf8.h"
+#include "platform/plist/PropertyList.h"
 
 #include <cmath>
 #include <cstdlib>

@@ -1,9 +1,9 @@
 // Any property list: what a snapshot file holds is shown as a tree, and its logs are played.
 
 #include "LogGenerator/LogTechnology.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/Services.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/SnapshotTree.h"
 #include "ui/OrvaneModelNode.h"

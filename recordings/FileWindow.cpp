@@ -1,6 +1,6 @@
 #include "recordings/FileWindow.h"
 
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
 
 #include <algorithm>
 #include <cerrno>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ByteSource.h"
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
 
 #include <memory>
 #include <string>

@@ -1,6 +1,6 @@
 #include "recordings/JsonRowWriter.h"
 
-#include "platform/JsonText.h"
+#include "platform/base/JsonText.h"
 #include "ui/output/JsonPane.h"
 
 namespace orvane

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/LogSlice.h"
 #include "recordings/TimesAhead.h"
 

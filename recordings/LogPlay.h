@@ -2,8 +2,8 @@
 
 #include "LogGenerator/DlfReader.h"
 #include "LogGenerator/LogGenerator.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/LogTime.h"
 #include "recordings/ServingCell.h"
 

@@ -1,12 +1,12 @@
 #include "recordings/LogRecorder.h"
 
-#include "LogGenerator/LogMessage.h"
 #include "LogGenerator/VersionReport.h"
-#include "platform/Bytes.h"
-#include "platform/Console.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/LogMessage.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/Console.h"
+#include "platform/services/SystemLog.h"
 #include "platform/toolkit/Screen.h"
 
 #include <cerrno>

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "LogGenerator/LogChannelObserver.h"
-#include "platform/Bytes.h"
-#include "platform/MainQueue.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/MainQueue.h"
 #include "recordings/BlockFile.h"
 
 #include <chrono>

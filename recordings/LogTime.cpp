@@ -1,6 +1,6 @@
 #include "recordings/LogTime.h"
 
-#include "platform/Calendar.h"
+#include "platform/base/Calendar.h"
 
 #include <algorithm>
 #include <cstdio>

@@ -1,8 +1,8 @@
 #include "recordings/OpenedRecording.h"
 
-#include "platform/Bytes.h"
-#include "platform/FileSystem.h"
-#include "platform/PropertyList.h"
+#include "platform/base/Bytes.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/FileSystem.h"
 #include "recordings/FileWindow.h"
 
 #include <algorithm>

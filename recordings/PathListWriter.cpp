@@ -1,6 +1,6 @@
 #include "recordings/PathListWriter.h"
 
-#include "platform/Utf8.h"
+#include "platform/base/Utf8.h"
 
 namespace orvane
 {

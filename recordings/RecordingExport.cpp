@@ -1,6 +1,6 @@
 #include "recordings/RecordingExport.h"
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/LogSurvey.h"
 
 #include <utility>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/MainQueue.h"
+#include "platform/services/MainQueue.h"
 #include "platform/toolkit/Playback.h"
 #include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"

@@ -1,6 +1,6 @@
 #include "recordings/RecordingPrinter.h"
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <utility>
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/MainQueue.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/MainQueue.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/RecordingSettings.h"

@@ -1,6 +1,6 @@
 #include "recordings/RowPath.h"
 
-#include "platform/ArrayLock.h"
+#include "platform/base/ArrayLock.h"
 #include "ui/DisplayWalk.h"
 #include "ui/OrvaneModelNode.h"
 

@@ -1,6 +1,6 @@
 #include "recordings/RowTable.h"
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <algorithm>
 

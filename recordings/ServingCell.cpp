@@ -1,6 +1,6 @@
 #include "recordings/ServingCell.h"
 
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

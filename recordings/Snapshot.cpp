@@ -1,7 +1,7 @@
 #include "recordings/Snapshot.h"
 
 #include "LogGenerator/StateKeys.h"
-#include "platform/Calendar.h"
+#include "platform/base/Calendar.h"
 
 #include <cstdio>
 

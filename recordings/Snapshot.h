@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ByteSource.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <memory>
 #include <optional>

@@ -1,6 +1,6 @@
 #include "recordings/SnapshotTree.h"
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

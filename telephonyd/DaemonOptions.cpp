@@ -2,8 +2,8 @@
 
 #include "LogGenerator/LogTechnology.h"
 #include "LogGenerator/TechnologyOption.h"
-#include "platform/CommandLine.h"
-#include "platform/LogOption.h"
+#include "platform/base/CommandLine.h"
+#include "platform/services/LogOption.h"
 
 #include <algorithm>
 

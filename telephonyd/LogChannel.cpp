@@ -1,11 +1,11 @@
 #include "telephonyd/LogChannel.h"
 
-#include "platform/Bytes.h"
-#include "platform/FrameRequester.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/ports/FrameRequester.h"
+#include "platform/services/SystemLog.h"
 #include "telephonyd/StartCommand.h"
 
 #include <utility>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "platform/Bytes.h"
-#include "platform/FrameConnection.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/ports/FrameConnection.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <functional>

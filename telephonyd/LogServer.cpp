@@ -1,12 +1,12 @@
 #include "telephonyd/LogServer.h"
 
-#include "platform/Bytes.h"
-#include "platform/FrameRequester.h"
-#include "platform/MessagePort.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/ports/FrameRequester.h"
+#include "platform/ports/MessagePort.h"
+#include "platform/services/SystemLog.h"
 #include "telephonyd/LogChannel.h"
 
 namespace orvane

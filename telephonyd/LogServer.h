@@ -1,8 +1,8 @@
 #pragma once
 
-#include "platform/Bytes.h"
-#include "platform/FrameConnection.h"
-#include "platform/MainQueue.h"
+#include "platform/base/Bytes.h"
+#include "platform/ports/FrameConnection.h"
+#include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <cstdint>

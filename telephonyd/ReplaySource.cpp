@@ -1,8 +1,8 @@
 #include "telephonyd/ReplaySource.h"
 
 #include "LogGenerator/DlfTime.h"
-#include "LogGenerator/LogMessage.h"
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/LogMessage.h"
 
 #include <utility>
 

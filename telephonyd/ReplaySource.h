@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/DlfReader.h"
-#include "platform/Bytes.h"
-#include "platform/MainQueue.h"
+#include "platform/base/Bytes.h"
+#include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <chrono>

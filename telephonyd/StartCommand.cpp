@@ -1,7 +1,7 @@
 #include "telephonyd/StartCommand.h"
 
-#include "platform/SystemLog.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/SystemLog.h"
 
 namespace orvane
 {

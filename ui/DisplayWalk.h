@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <algorithm>
 #include <charconv>

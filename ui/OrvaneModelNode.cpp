@@ -1,6 +1,6 @@
 #include "ui/OrvaneModelNode.h"
 
-#include "platform/ArrayLock.h"
+#include "platform/base/ArrayLock.h"
 #include "ui/DisplayWalk.h"
 
 #include <algorithm>

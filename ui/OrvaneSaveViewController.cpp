@@ -1,6 +1,6 @@
 #include "ui/OrvaneSaveViewController.h"
 
-#include "platform/Services.h"
+#include "platform/services/Services.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/Screen.h"
 #include "ui/SnapshotFile.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "platform/toolkit/Interface.h"
 #include "platform/toolkit/TableView.h"
 #include "platform/toolkit/TextField.h"

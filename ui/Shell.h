@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/FileSystem.h"
-#include "platform/MainQueue.h"
+#include "platform/services/FileSystem.h"
+#include "platform/services/MainQueue.h"
 
 namespace orvane
 {

@@ -1,9 +1,9 @@
 #include "ui/SnapshotFile.h"
 
-#include "platform/Calendar.h"
-#include "platform/PropertyList.h"
-#include "platform/Services.h"
-#include "platform/Utf8.h"
+#include "platform/base/Calendar.h"
+#include "platform/base/Utf8.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/Services.h"
 
 #include <cstdint>
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/FileSystem.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/FileSystem.h"
 
 #include <string>
 

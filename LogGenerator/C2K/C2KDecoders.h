@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/C2K/C2KPublisher.h"
-#include "LogGenerator/PacketView.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PacketView.h"
+#include "platform/base/PropertyValue.h"
 
 #include <cstdint>
 #include <span>

@@ -2,12 +2,12 @@
 
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/DictionaryResource.h"
-#include "LogGenerator/LogMessage.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/LogMessage.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/Services.h"
 
 #include <algorithm>
 

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/VRNLogGenerator.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Field.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <span>
 #include <string_view>

@@ -1,8 +1,8 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 #include <iterator>
 

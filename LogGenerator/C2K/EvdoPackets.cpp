@@ -1,8 +1,8 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/C2K/C2KFormats.h"
 #include "LogGenerator/Records.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 // The 1xEV-DO packets: air-link summary, active-set pilots, finger C/I.
 

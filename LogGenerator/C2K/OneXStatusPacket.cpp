@@ -2,8 +2,8 @@
 #include "LogGenerator/C2K/C2KFormats.h"
 #include "LogGenerator/C2K/Subpackets.h"
 #include "LogGenerator/C2K/TrafficErrors.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 #include <cmath>
 

@@ -1,6 +1,6 @@
 #include "LogGenerator/C2K/Subpackets.h"
 
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 
 namespace orvane
 {

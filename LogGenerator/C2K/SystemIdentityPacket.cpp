@@ -1,7 +1,7 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/C2K/C2KFormats.h"
-#include "platform/PropertyValue.h"
-#include "platform/SystemLog.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/SystemLog.h"
 
 // The 1x system identity packet.
 

@@ -3,7 +3,7 @@
 #include "LogGenerator/C2K/C2KDecoders.h"
 #include "LogGenerator/C2K/Subpackets.h"
 #include "LogGenerator/Formats.h"
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 
 // The 1x traffic frame errors packet.
 

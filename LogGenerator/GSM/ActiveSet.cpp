@@ -2,7 +2,7 @@
 
 #include "LogGenerator/GSM/GainControl.h"
 #include "LogGenerator/GSM/LogCodes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Section.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/CellMonitor.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #include "LogGenerator/GSM/EquivalentPLMNList.h"
 
 #include "LogGenerator/GSM/LogCodes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -2,10 +2,10 @@
 
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/Bytes.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 
 #include <utility>
 

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/GSM/LogCodes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,8 +1,8 @@
 #include "LogGenerator/GSM/PDPContextList.h"
 
-#include "LogGenerator/LogMessage.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/LogMessage.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
 
 namespace orvane
 {

@@ -3,8 +3,8 @@
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/LogCodes.h"
 #include "LogGenerator/GSM/NasTables.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

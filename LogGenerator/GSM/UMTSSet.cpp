@@ -2,7 +2,7 @@
 
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/RankingPacket.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

@@ -1,6 +1,6 @@
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
 
-#include "platform/Console.h"
+#include "platform/services/Console.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 
 #include <utility>
 

@@ -1,6 +1,6 @@
 #include "LogGenerator/LTE/LTEClassIndex.h"
 
-#include "platform/Console.h"
+#include "platform/services/Console.h"
 
 namespace orvane
 {

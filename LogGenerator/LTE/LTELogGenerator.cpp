@@ -1,7 +1,7 @@
 #include "LogGenerator/LTE/LTELogGenerator.h"
 
 #include "LogGenerator/LTE/LTEClassIndex.h"
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 
 #include <utility>
 

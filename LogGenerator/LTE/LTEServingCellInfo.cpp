@@ -1,8 +1,8 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
 #include "LogGenerator/Formats.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

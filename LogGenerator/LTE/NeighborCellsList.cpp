@@ -3,8 +3,8 @@
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LTEFormats.h"
 #include "LogGenerator/LTE/LogCodes.h"
-#include "platform/PropertyValue.h"
-#include "platform/Services.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/Services.h"
 
 namespace orvane
 {

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LogCodes.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <algorithm>
 #include <iterator>

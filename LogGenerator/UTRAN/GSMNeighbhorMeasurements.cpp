@@ -1,7 +1,7 @@
 #include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
 
 #include "LogGenerator/Formats.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

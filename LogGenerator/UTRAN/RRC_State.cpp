@@ -1,8 +1,8 @@
 #include "LogGenerator/UTRAN/RRC_State.h"
 
 #include "LogGenerator/Formats.h"
-#include "platform/Console.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/Console.h"
 
 namespace orvane
 {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/PacketView.h"
+#include "platform/base/PacketView.h"
 
 namespace orvane
 {

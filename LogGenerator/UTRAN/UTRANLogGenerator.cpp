@@ -1,7 +1,7 @@
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
-#include "platform/Services.h"
+#include "platform/services/Services.h"
 
 #include <algorithm>
 #include <filesystem>

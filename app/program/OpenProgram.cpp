@@ -2,10 +2,10 @@
 
 #include "app/program/PrintedOutput.h"
 #include "app/program/TerminalProgress.h"
-#include "platform/qt/LineReader.h"
-#include "platform/qt/QtEventLoop.h"
-#include "platform/qt/QtMainQueue.h"
-#include "platform/qt/SignalWatcher.h"
+#include "platform/linux/LineReader.h"
+#include "platform/linux/QtEventLoop.h"
+#include "platform/linux/QtMainQueue.h"
+#include "platform/linux/SignalWatcher.h"
 #include "recordings/RecordingApp.h"
 #include "recordings/RecordingPrinter.h"
 

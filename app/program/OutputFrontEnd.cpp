@@ -1,8 +1,8 @@
 #include "app/CommandInterpreter.h"
 #include "app/program/FrontEnd.h"
 #include "app/program/PrintedOutput.h"
-#include "platform/qt/LineReader.h"
-#include "platform/qt/QtEventLoop.h"
+#include "platform/linux/LineReader.h"
+#include "platform/linux/QtEventLoop.h"
 #include "ui/output/PrintingPaneController.h"
 
 #include <csignal>

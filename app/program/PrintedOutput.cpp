@@ -1,7 +1,7 @@
 #include "app/program/PrintedOutput.h"
 
 #include "app/program/FrontEnd.h"
-#include "platform/qt/QtEventLoop.h"
+#include "platform/linux/QtEventLoop.h"
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "app/AppOptions.h"
-#include "platform/OutputDescriptor.h"
+#include "platform/services/OutputDescriptor.h"
 #include "ui/output/OutputPane.h"
 
 #include <memory>

@@ -1,7 +1,7 @@
 #include "app/program/ProgramServices.h"
 
-#include "platform/Services.h"
-#include "platform/qt/ResourceDirectory.h"
+#include "platform/linux/ResourceDirectory.h"
+#include "platform/services/Services.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/Console.h"
-#include "platform/Resources.h"
+#include "platform/services/Console.h"
+#include "platform/services/Resources.h"
 
 namespace orvane
 {

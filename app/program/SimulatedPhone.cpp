@@ -1,8 +1,8 @@
 #include "app/program/SimulatedPhone.h"
 
 #include "app/OrvaneApp.h"
-#include "platform/FileSystem.h"
-#include "platform/qt/QtFrameTransport.h"
+#include "platform/linux/QtFrameTransport.h"
+#include "platform/services/FileSystem.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/phone/Scenarios.h"
 #include "ui/SnapshotFile.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/qt/EventThread.h"
+#include "platform/linux/EventThread.h"
 
 #include <string>
 

@@ -1,9 +1,9 @@
 #include "app/program/TerminalFrontEnd.h"
 
-#include "platform/qt/DescriptorWatcher.h"
-#include "platform/qt/QtEventLoop.h"
-#include "platform/qt/QtMainQueue.h"
-#include "platform/qt/SignalWatcher.h"
+#include "platform/linux/DescriptorWatcher.h"
+#include "platform/linux/QtEventLoop.h"
+#include "platform/linux/QtMainQueue.h"
+#include "platform/linux/SignalWatcher.h"
 #include "platform/terminal/CursesDevice.h"
 #include "platform/terminal/TerminalScreen.h"
 

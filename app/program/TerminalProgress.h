@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/ProgressLine.h"
+#include "platform/services/ProgressLine.h"
 
 #include <memory>
 #include <string>

@@ -1,6 +1,6 @@
 #include "app/program/WindowFrontEnd.h"
 
-#include "platform/qt/QtEventLoop.h"
+#include "platform/linux/QtEventLoop.h"
 #include "platform/window/QtScreen.h"
 
 #include <utility>

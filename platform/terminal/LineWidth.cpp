@@ -1,6 +1,6 @@
 #include "platform/terminal/LineWidth.h"
 
-#include "platform/Utf8.h"
+#include "platform/base/Utf8.h"
 
 #include <algorithm>
 #include <cwchar>

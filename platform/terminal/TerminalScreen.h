@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/MainQueue.h"
+#include "platform/services/MainQueue.h"
 #include "platform/terminal/Page.h"
 #include "platform/terminal/SaveForm.h"
 #include "platform/terminal/StackPage.h"

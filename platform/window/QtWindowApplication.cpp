@@ -1,6 +1,6 @@
 #include "platform/window/QtWindowApplication.h"
 
-#include "platform/SystemLog.h"
+#include "platform/services/SystemLog.h"
 #include "platform/window/Accessibility.h"
 #include "platform/window/DesktopColours.h"
 

@@ -1,6 +1,6 @@
 #include "platform/window/UiInterface.h"
 
-#include "platform/Services.h"
+#include "platform/services/Services.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/TableView.h"
 #include "platform/window/FlatButton.h"

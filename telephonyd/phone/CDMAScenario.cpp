@@ -1,7 +1,7 @@
 #include "telephonyd/phone/CDMAScenario.h"
 
-#include "platform/Calendar.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Calendar.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/EvdoPackets.h"
 #include "telephonyd/phone/LTETown.h"
 #include "telephonyd/phone/OneXPackets.h"

@@ -1,9 +1,9 @@
 #include "telephonyd/phone/CellMonitorScenario.h"
 
-#include "platform/Bytes.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 #include "telephonyd/phone/LTETown.h"
 
 #include <algorithm>

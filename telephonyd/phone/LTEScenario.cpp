@@ -1,7 +1,7 @@
 #include "telephonyd/phone/LTEScenario.h"
 
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/ServerItems.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #include "telephonyd/phone/MobilityPackets.h"
 
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
 #include "telephonyd/phone/ModemItem.h"
 
 namespace orvane

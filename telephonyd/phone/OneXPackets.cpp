@@ -1,6 +1,6 @@
 #include "telephonyd/phone/OneXPackets.h"
 
-#include "platform/Bytes.h"
+#include "platform/base/Bytes.h"
 #include "telephonyd/phone/ModemItem.h"
 
 namespace orvane

@@ -1,7 +1,7 @@
 #include "telephonyd/phone/PhoneSource.h"
 
-#include "platform/Bytes.h"
-#include "platform/Services.h"
+#include "platform/base/Bytes.h"
+#include "platform/services/Services.h"
 #include "telephonyd/phone/PacketWriter.h"
 
 namespace orvane

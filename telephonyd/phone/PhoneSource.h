@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/Bytes.h"
-#include "platform/MainQueue.h"
+#include "platform/base/Bytes.h"
+#include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 #include "telephonyd/phone/Scenario.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/MainQueue.h"
+#include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 #include "telephonyd/phone/Scenario.h"
 

@@ -1,8 +1,8 @@
 #include "telephonyd/phone/ServerItems.h"
 
-#include "platform/Bytes.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
 
 namespace orvane
 {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "telephonyd/phone/Scenario.h"
 
 namespace orvane

@@ -1,7 +1,7 @@
 // What the phone of UMTSScenario hears.
 
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/ServerItems.h"
 #include "telephonyd/phone/UMTSScenario.h"
 

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/UnrecognisedOperation.h"
 #include "LogGenerator/support/RecordingSection.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

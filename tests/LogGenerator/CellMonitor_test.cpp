@@ -1,8 +1,8 @@
 #include "LogGenerator/CellMonitor.h"
 
 #include "LogGenerator/support/CellRecord.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -5,9 +5,9 @@
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/RecordedMessages.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

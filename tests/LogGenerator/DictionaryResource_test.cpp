@@ -1,7 +1,7 @@
 #include "LogGenerator/DictionaryResource.h"
 
-#include "platform/FileSystem.h"
-#include "platform/Resources.h"
+#include "platform/services/FileSystem.h"
+#include "platform/services/Resources.h"
 
 #include "support/PropertyListBytes.h"
 #include "support/Recording.h"

@@ -1,7 +1,7 @@
 #include "LogGenerator/Field.h"
 
 #include "LogGenerator/Formats.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <gtest/gtest.h>
 

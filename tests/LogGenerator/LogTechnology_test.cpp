@@ -1,7 +1,7 @@
 #include "LogGenerator/LogTechnology.h"
 
-#include "platform/FileSystem.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/FileSystem.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -6,8 +6,8 @@
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "LogGenerator/support/SectionTest.h"
-#include "platform/FileSystem.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/FileSystem.h"
 
 #include <functional>
 

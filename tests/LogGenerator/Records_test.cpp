@@ -2,7 +2,7 @@
 
 #include "LogGenerator/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Formats.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

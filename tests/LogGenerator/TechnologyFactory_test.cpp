@@ -3,8 +3,8 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "support/Recording.h"
 
 #include <gtest/gtest.h>

@@ -4,7 +4,7 @@
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"
 #include "LogGenerator/LTE/LTEClassIndex.h"
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -1,9 +1,9 @@
 #include "LogGenerator/VRNLogGenerator.h"
 
 #include "LogGenerator/DlfWriter.h"
-#include "LogGenerator/PacketView.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PacketView.h"
+#include "platform/base/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

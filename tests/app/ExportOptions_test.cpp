@@ -1,7 +1,7 @@
 #include "app/ExportOptions.h"
 
 #include "app/AppOptions.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

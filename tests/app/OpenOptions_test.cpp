@@ -1,7 +1,7 @@
 // Options of `orvane open FILE`.
 
 #include "app/AppOptions.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 
 #include <gmock/gmock.h>
 

@@ -1,12 +1,12 @@
 #include "app/OrvaneModel.h"
 
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/FramePorts.h"
-#include "platform/FrameTelephonyServer.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
-#include "platform/fake/LoopbackTransport.h"
-#include "platform/fake/ScriptedTelephonyServer.h"
+#include "doubles/LoopbackTransport.h"
+#include "doubles/ScriptedTelephonyServer.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/ports/FramePorts.h"
+#include "platform/ports/FrameTelephonyServer.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

@@ -1,4 +1,4 @@
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/TemporaryDirectory.h"
 

@@ -1,7 +1,7 @@
 // `orvane open FILE` as a user runs it.
 
 #include "LogGenerator/DlfReader.h"
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/Sanitizers.h"
 #include "support/TemporaryDirectory.h"

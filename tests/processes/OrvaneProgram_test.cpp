@@ -1,6 +1,6 @@
-#include "platform/FileSystem.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/TemporaryDirectory.h"
 

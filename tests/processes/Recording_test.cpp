@@ -1,6 +1,6 @@
 #include "LogGenerator/DlfReader.h"
 #include "LogGenerator/DlfWriter.h"
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/TemporaryDirectory.h"
 

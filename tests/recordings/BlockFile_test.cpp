@@ -1,6 +1,6 @@
 #include "recordings/BlockFile.h"
 
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>

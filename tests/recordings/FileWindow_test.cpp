@@ -1,6 +1,6 @@
 #include "recordings/FileWindow.h"
 
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gtest/gtest.h>

@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogPlay.h"
 
 #include "recordings/support/LiveView.h"

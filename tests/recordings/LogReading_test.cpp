@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogReading.h"
 
 #include "recordings/support/LogFiles.h"

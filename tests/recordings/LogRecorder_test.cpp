@@ -1,5 +1,5 @@
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogRecorder.h"
 
 #include "LogGenerator/DlfReader.h"
@@ -7,9 +7,9 @@
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/FileSystem.h"
-#include "platform/fake/FakeScreen.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/FakeScreen.h"
+#include "doubles/ManualMainQueue.h"
+#include "platform/services/FileSystem.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 

@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogSurvey.h"
 
 #include "LogGenerator/VersionReport.h"

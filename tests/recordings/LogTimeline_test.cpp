@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogTimeline.h"
 
 #include "recordings/FileWindow.h"

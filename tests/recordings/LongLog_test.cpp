@@ -1,7 +1,7 @@
 // A log of 100 MB: nothing may grow with it.
 
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/FileWindow.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/RefreshPeriods.h"

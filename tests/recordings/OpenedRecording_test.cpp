@@ -1,6 +1,6 @@
 #include "recordings/OpenedRecording.h"
 
-#include "platform/FileSystem.h"
+#include "platform/services/FileSystem.h"
 #include "recordings/support/LogFiles.h"
 #include "support/PropertyListBytes.h"
 #include "support/TemporaryDirectory.h"

@@ -1,8 +1,8 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/RecordingApp.h"
 
-#include "platform/fake/FakeScreen.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/FakeScreen.h"
+#include "doubles/ManualMainQueue.h"
 #include "platform/toolkit/TableView.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"

@@ -1,9 +1,9 @@
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/RecordingExport.h"
 
-#include "platform/FileSystem.h"
-#include "platform/PropertyList.h"
+#include "platform/plist/PropertyList.h"
+#include "platform/services/FileSystem.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/support/LogFiles.h"

@@ -1,7 +1,7 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/RecordingPlayer.h"
 
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"
 #include "support/Recording.h"
 

@@ -1,8 +1,8 @@
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "recordings/RecordingPrinter.h"
 
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"
 #include "support/Recording.h"
 #include "ui/output/JsonPane.h"

@@ -1,4 +1,4 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/RowPath.h"
 
 #include "ui/OrvaneModelNode.h"

@@ -1,4 +1,4 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"

@@ -1,11 +1,11 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/Snapshot.h"
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/LogTechnology.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/RecordedMessages.h"
-#include "platform/PropertyList.h"
+#include "platform/plist/PropertyList.h"
 #include "recordings/LogPlay.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/support/LogFiles.h"

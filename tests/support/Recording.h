@@ -1,10 +1,10 @@
 #pragma once
 
-#include "platform/Calendar.h"
-#include "platform/Clock.h"
-#include "platform/Console.h"
-#include "platform/Services.h"
-#include "platform/SystemLog.h"
+#include "platform/base/Calendar.h"
+#include "platform/services/Clock.h"
+#include "platform/services/Console.h"
+#include "platform/services/Services.h"
+#include "platform/services/SystemLog.h"
 
 #include <algorithm>
 #include <map>

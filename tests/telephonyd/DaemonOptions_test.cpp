@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/DaemonOptions.h"
 
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #include "telephonyd/ReplaySource.h"
 
 #include "LogGenerator/DlfTime.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 
 #include <gmock/gmock.h>
 

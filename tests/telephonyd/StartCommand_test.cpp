@@ -1,4 +1,4 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "telephonyd/StartCommand.h"
 
 #include "support/Recording.h"

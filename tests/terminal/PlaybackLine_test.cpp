@@ -1,4 +1,4 @@
-#include "platform/fake/FakePlayback.h"
+#include "doubles/FakePlayback.h"
 
 #include "terminal/TerminalScreenTest.h"
 

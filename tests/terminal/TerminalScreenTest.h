@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/PropertyValue.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
+#include "platform/base/PropertyValue.h"
 #include "platform/terminal/LineWidth.h"
 #include "platform/terminal/TerminalScreen.h"
 #include "platform/toolkit/NavigationController.h"

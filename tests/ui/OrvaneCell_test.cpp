@@ -1,6 +1,6 @@
 #include "ui/OrvaneCell.h"
 
-#include "platform/fake/FakeScreen.h"
+#include "doubles/FakeScreen.h"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/OrvaneModelNode.h"
 
-#include "platform/ArrayLock.h"
+#include "platform/base/ArrayLock.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/OrvanePaneController.h"
 
-#include "platform/fake/FakeScreen.h"
+#include "doubles/FakeScreen.h"
 #include "platform/toolkit/ActivityIndicator.h"
 #include "platform/toolkit/Window.h"
 #include "ui/OrvaneCell.h"

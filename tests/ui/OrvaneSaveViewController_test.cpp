@@ -1,8 +1,8 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/OrvaneSaveViewController.h"
 
-#include "platform/PropertyList.h"
-#include "platform/fake/FakeScreen.h"
+#include "doubles/FakeScreen.h"
+#include "platform/plist/PropertyList.h"
 #include "support/Recording.h"
 #include "support/SaveScreen.h"
 #include "support/TemporaryDirectory.h"

@@ -1,7 +1,7 @@
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/SnapshotFile.h"
 
-#include "platform/PropertyList.h"
+#include "platform/plist/PropertyList.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 

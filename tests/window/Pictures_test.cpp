@@ -1,6 +1,6 @@
 #include "LogGenerator/DlfReader.h"
 #include "LogGenerator/DlfTime.h"
-#include "platform/fake/FakePlayback.h"
+#include "doubles/FakePlayback.h"
 #include "platform/window/DesktopColours.h"
 #include "platform/window/SheetWidget.h"
 #include "platform/window/ToolbarWidget.h"

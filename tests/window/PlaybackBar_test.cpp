@@ -1,4 +1,4 @@
-#include "platform/fake/FakePlayback.h"
+#include "doubles/FakePlayback.h"
 #include "platform/window/PlaybackBar.h"
 
 #include "platform/window/FlatButton.h"

@@ -1,5 +1,5 @@
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
 #include "platform/window/AlertWidget.h"
 #include "platform/window/FlatButton.h"
 #include "platform/window/SheetWidget.h"

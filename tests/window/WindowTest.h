@@ -1,8 +1,8 @@
 #pragma once
 
-#include "platform/FileSystem.h"
-#include "platform/PropertyValue.h"
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/services/FileSystem.h"
 #include "platform/toolkit/Window.h"
 #include "platform/window/PaneDeck.h"
 #include "platform/window/QtScreen.h"

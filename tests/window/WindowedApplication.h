@@ -1,11 +1,11 @@
 #pragma once
 
 #include "app/OrvaneApp.h"
-#include "platform/FramePorts.h"
-#include "platform/FrameTelephonyServer.h"
-#include "platform/fake/FakePreferencesStore.h"
-#include "platform/fake/LoopbackTransport.h"
-#include "platform/fake/ScriptedTelephonyServer.h"
+#include "doubles/FakePreferencesStore.h"
+#include "doubles/LoopbackTransport.h"
+#include "doubles/ScriptedTelephonyServer.h"
+#include "platform/ports/FramePorts.h"
+#include "platform/ports/FrameTelephonyServer.h"
 #include "window/WindowTest.h"
 
 #include <QTest>

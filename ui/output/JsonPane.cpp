@@ -1,6 +1,6 @@
 #include "ui/output/JsonPane.h"
 
-#include "platform/JsonText.h"
+#include "platform/base/JsonText.h"
 
 #include <utility>
 

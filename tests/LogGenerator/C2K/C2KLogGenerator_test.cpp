@@ -1,9 +1,9 @@
 #include "LogGenerator/C2K/C2KTest.h"
 
 #include "LogGenerator/C2K/C2KDecoders.h"
-#include "platform/FileSystem.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/FileSystem.h"
 
 namespace orvane
 {

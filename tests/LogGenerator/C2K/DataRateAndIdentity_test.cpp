@@ -1,5 +1,5 @@
 #include "LogGenerator/C2K/C2KTest.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #include "LogGenerator/GSM/CellChangeCounters.h"
 
 #include "LogGenerator/support/SectionTest.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

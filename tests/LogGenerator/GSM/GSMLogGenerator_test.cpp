@@ -2,9 +2,9 @@
 
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

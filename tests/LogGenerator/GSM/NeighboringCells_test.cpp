@@ -2,8 +2,8 @@
 
 #include "LogGenerator/support/CellRecord.h"
 #include "LogGenerator/support/SectionTest.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 
 namespace orvane
 {

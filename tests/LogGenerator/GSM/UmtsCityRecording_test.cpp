@@ -4,7 +4,7 @@
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/support/RecordedMessages.h"
 #include "LogGenerator/support/SectionTest.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 namespace orvane
 {

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 

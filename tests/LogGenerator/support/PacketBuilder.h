@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyList.h"
 
 #include <cstdint>
 #include <stdexcept>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 
 #include <functional>
 #include <memory>

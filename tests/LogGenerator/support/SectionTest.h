@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Base.h"
 #include "LogGenerator/support/PacketBuilder.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>

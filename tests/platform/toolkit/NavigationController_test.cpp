@@ -1,6 +1,6 @@
 #include "platform/toolkit/NavigationController.h"
 
-#include "platform/fake/FakeScreen.h"
+#include "doubles/FakeScreen.h"
 #include "platform/toolkit/Window.h"
 
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 #include "platform/toolkit/Screen.h"
 
-#include "platform/fake/FakeScreen.h"
+#include "doubles/FakeScreen.h"
 #include "platform/toolkit/ActivityIndicator.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/Label.h"

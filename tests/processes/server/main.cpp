@@ -2,11 +2,11 @@
 // Prints a line for each start command. In the mode "other-ids" it sends messages with other ids
 // than 0, then one with 0; in "streaming" one message after each start command.
 
-#include "platform/TelephonyConstants.h"
-#include "platform/fake/ScriptedTelephonyServer.h"
-#include "platform/qt/QtEventLoop.h"
-#include "platform/qt/QtFrameTransport.h"
-#include "platform/qt/QtMainQueue.h"
+#include "doubles/ScriptedTelephonyServer.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/linux/QtEventLoop.h"
+#include "platform/linux/QtFrameTransport.h"
+#include "platform/linux/QtMainQueue.h"
 
 #include <cstdio>
 #include <cstdlib>

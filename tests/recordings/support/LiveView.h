@@ -2,7 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/PropertyValue.h"
 #include "recordings/LogTime.h"
 #include "recordings/support/LogFiles.h"
 

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/LogTechnology.h"
-#include "platform/FileSystem.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/services/FileSystem.h"
 
 #include <cstdint>
 #include <memory>

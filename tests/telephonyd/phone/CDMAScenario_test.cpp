@@ -1,4 +1,4 @@
-#include "platform/TelephonyConstants.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/CDMAScenario.h"
 
 #include "telephonyd/phone/CDMATown.h"

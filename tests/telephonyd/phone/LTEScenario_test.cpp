@@ -1,8 +1,8 @@
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/LTEScenario.h"
 
-#include "platform/PropertyList.h"
+#include "platform/plist/PropertyList.h"
 #include "telephonyd/phone/ServerItems.h"
 
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 #include "telephonyd/phone/PhoneSource.h"
 
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 #include "support/Recording.h"
 #include "telephonyd/phone/Scenarios.h"
 

@@ -1,5 +1,5 @@
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/UTRANScenario.h"
 
 #include "telephonyd/phone/ServerItems.h"

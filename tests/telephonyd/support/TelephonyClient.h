@@ -1,9 +1,9 @@
 #pragma once
 
-#include "platform/PropertyList.h"
-#include "platform/PropertyValue.h"
-#include "platform/TelephonyConstants.h"
-#include "platform/fake/LoopbackTransport.h"
+#include "doubles/LoopbackTransport.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+#include "platform/plist/PropertyList.h"
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,5 @@
-#include "platform/JsonText.h"
-#include "platform/PropertyValue.h"
+#include "platform/base/JsonText.h"
+#include "platform/base/PropertyValue.h"
 #include "ui/output/JsonPane.h"
 #include "ui/output/TextPane.h"
 

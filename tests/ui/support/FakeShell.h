@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/fake/ManualMainQueue.h"
+#include "doubles/ManualMainQueue.h"
 #include "ui/Shell.h"
 
 #include <string>

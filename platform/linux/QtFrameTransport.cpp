@@ -1,0 +1,128 @@
+#include "platform/linux/QtFrameTransport.h"
+
+#include "platform/linux/DescriptorWatcher.h"
+#include "platform/linux/PortSocket.h"
+#include "platform/linux/QtFrameConnection.h"
+#include "platform/linux/QtMainQueue.h"
+#include "platform/linux/UnixSocket.h"
+#include "platform/ports/MessagePort.h"
+#include "platform/services/SystemLog.h"
+
+#include <cerrno>
+
+namespace orvane
+{
+
+namespace
+{
+
+using ConnectionCallback = std::function<void(std::unique_ptr<FrameConnection>)>;
+
+// Callers wait in the socket until there is a connection callback.
+class QtFrameListener final : public FrameListener
+{
+public:
+    explicit QtFrameListener(PortSocket socket) : _state(std::make_shared<State>(std::move(socket)))
+    {
+    }
+    ~QtFrameListener() override { setConnectionCallback({}); }
+    QtFrameListener(const QtFrameListener&) = delete;
+    QtFrameListener& operator=(const QtFrameListener&) = delete;
+
+    void setConnectionCallback(ConnectionCallback callback) override
+    {
+        _state->callback = std::move(callback);
+        _state->watcher.reset();
+        if (!_state->callback)
+            return;
+        _state->watcher = std::make_unique<DescriptorWatcher>(
+            _state->socket.descriptor(), DescriptorWatcher::For::Reading,
+            [weak = std::weak_ptr(_state)] {
+                if (const auto state = weak.lock())
+                    state->acceptOne();
+            });
+    }
+
+private:
+    struct State {
+        explicit State(PortSocket theSocket) : socket(std::move(theSocket)) {}
+
+        void acceptOne()
+        {
+            FileDescriptor accepted(
+                ::accept4(socket.descriptor(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
+            if (!accepted) {
+                pauseIfFailed(errno);
+                return;
+            }
+            if (!isPeerTrusted(accepted.get()))
+                return;
+            enlargeBuffers(accepted.get());
+            const auto call = callback; // it may set another
+            call(std::make_unique<QtFrameConnection>(std::move(accepted)));
+        }
+
+        // A process that has run out of descriptors would be told of the same caller for ever.
+        void pauseIfFailed(int error)
+        {
+            if (error == EAGAIN || error == EINTR || error == ECONNABORTED)
+                return;
+            logError("A connection cannot be accepted: %s\n", errorText(error).c_str());
+            watcher->setEnabled(false);
+            queue.after(std::chrono::milliseconds{100}, [this] {
+                if (watcher)
+                    watcher->setEnabled(true);
+            });
+        }
+
+        PortSocket socket;
+        ConnectionCallback callback;
+        std::unique_ptr<DescriptorWatcher> watcher;
+        QtMainQueue queue;
+    };
+    std::shared_ptr<State> _state;
+};
+
+bool isUsable(const std::string& name, std::string& error)
+{
+    if (isUsablePortName(name))
+        return true;
+    error = "\"" + name + "\" cannot name a port; use 1 to 64 letters, digits, '.', '-' and '_'.";
+    return false;
+}
+
+} // namespace
+
+std::unique_ptr<FrameListener> QtFrameTransport::listen(const std::string& name, std::string& error)
+{
+    if (!isUsable(name, error))
+        return nullptr;
+    auto socket = PortSocket::claim(_directory, name, error);
+    if (!socket)
+        return nullptr;
+    return std::make_unique<QtFrameListener>(std::move(*socket));
+}
+
+std::unique_ptr<FrameConnection> QtFrameTransport::connect(const std::string& name,
+                                                           std::string& error)
+{
+    if (!isUsable(name, error))
+        return nullptr;
+    const std::string path = _directory + '/' + name;
+    const auto address = socketAddress(path, error);
+    if (!address)
+        return nullptr;
+    FileDescriptor socket = newStreamSocket();
+    const int failure = socket ? connectTo(socket.get(), *address) : errno;
+    if (failure != 0) {
+        error = "The port " + path + " cannot be reached: " + errorText(failure);
+        return nullptr;
+    }
+    if (!isPeerTrusted(socket.get())) {
+        error = "The port " + path + " belongs to another user.";
+        return nullptr;
+    }
+    return std::make_unique<QtFrameConnection>(std::move(socket));
+}
+
+} // namespace orvane

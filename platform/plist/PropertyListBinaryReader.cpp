@@ -1,0 +1,211 @@
+#include "platform/plist/PropertyListBinaryReader.h"
+
+#include "platform/base/Bytes.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyListBinaryObjects.h"
+#include "platform/plist/PropertyListText.h"
+
+#include <algorithm>
+#include <bit>
+
+namespace orvane
+{
+
+namespace
+{
+
+using Object = PropertyListBinaryObjects::Object;
+using Type = PropertyListBinaryObjects::Type;
+
+// 2001-01-01 00:00:00 UTC, from which binary lists count.
+constexpr double kDateOrigin = 978307200;
+
+// Builds values from objects. An absent value means that `_error` says why.
+class TreeBuilder
+{
+public:
+    explicit TreeBuilder(ByteView bytes)
+        : _objects(bytes), _budget(kBinaryCostLimit + kBinaryCostLimitPerByte * bytes.size())
+    {
+    }
+    PropertyListResult read();
+
+private:
+    PropertyValue value(std::size_t index);
+    PropertyValue contentOf(const Object& object);
+    PropertyValue integer(const Object& object);
+    PropertyValue real(const Object& object);
+    PropertyValue string(const Object& object);
+    PropertyValue array(const Object& object);
+    PropertyValue dictionary(const Object& object);
+    enum class Use { Element, Key };
+    // The value of the object that the container's n-th reference names.
+    PropertyValue referenced(const Object& container, std::size_t n, Use use = Use::Element);
+    bool spend(std::size_t cost, const Object& on);
+    PropertyValue fail(std::string what, std::size_t at);
+
+    PropertyListBinaryObjects _objects;
+    std::size_t _budget;
+    std::vector<bool> _isOpen; // whether the object's value is being built
+    std::size_t _depth = 0;
+    std::string _error;
+};
+
+PropertyListResult TreeBuilder::read()
+{
+    if (!_objects.isRead())
+        return {{}, _objects.error()};
+    _isOpen.resize(_objects.count());
+    PropertyValue root = value(_objects.rootIndex());
+    return {std::move(root), std::move(_error)};
+}
+
+PropertyValue TreeBuilder::fail(std::string what, std::size_t at)
+{
+    _error = std::move(what) + " at byte " + std::to_string(at);
+    return {};
+}
+
+bool TreeBuilder::spend(std::size_t cost, const Object& on)
+{
+    if (cost > _budget) {
+        fail("too many values for the length of the list, with the object", on.begin);
+        return false;
+    }
+    _budget -= cost;
+    return true;
+}
+
+PropertyValue TreeBuilder::value(std::size_t index)
+{
+    const Object& object = _objects[index];
+    if (_isOpen[index])
+        return fail("reference cycle through the object", object.begin);
+    const bool isContainer = object.type == Type::Array || object.type == Type::Dictionary;
+    if (!isContainer)
+        return spend(kBinaryValueCost + object.count, object) ? contentOf(object) : PropertyValue();
+
+    if (_depth == kPropertyListDepthLimit)
+        return fail("nested deeper than " + std::to_string(kPropertyListDepthLimit) + " levels",
+                    object.begin);
+    if (!spend(kBinaryValueCost + kBinaryContainerCost, object))
+        return {};
+    _isOpen[index] = true;
+    ++_depth;
+    PropertyValue container = contentOf(object);
+    --_depth;
+    _isOpen[index] = false;
+    return container;
+}
+
+PropertyValue TreeBuilder::contentOf(const Object& object)
+{
+    switch (object.type) {
+    case Type::False:
+    case Type::True:
+        return PropertyValue::boolean(object.type == Type::True);
+    case Type::Integer:
+        return integer(object);
+    case Type::Real:
+        return real(object);
+    case Type::Date: {
+        const auto seconds = std::bit_cast<double>(bigEndian(_objects.content(object)));
+        return PropertyValue::date({seconds + kDateOrigin});
+    }
+    case Type::Data: {
+        const ByteView content = _objects.content(object);
+        return PropertyValue::data(Bytes(content.begin(), content.end()));
+    }
+    case Type::AsciiString:
+    case Type::Utf16String:
+        return string(object);
+    case Type::Array:
+        return array(object);
+    case Type::Dictionary:
+        return dictionary(object);
+    }
+    return {};
+}
+
+PropertyValue TreeBuilder::integer(const Object& object)
+{
+    // Of 1, 2 and 4 bytes without sign; of 8 and 16 bytes with.
+    ByteView content = _objects.content(object);
+    if (content.size() == 16) {
+        const ByteView high = content.first(8);
+        content = content.last(8);
+        const std::uint8_t sign = (content[0] & 0x80) != 0 ? 0xFF : 0;
+        if (!std::all_of(high.begin(), high.end(), [sign](auto byte) { return byte == sign; }))
+            return fail("number out of range", object.begin);
+    }
+    return PropertyValue::integer(static_cast<std::int64_t>(bigEndian(content)));
+}
+
+PropertyValue TreeBuilder::real(const Object& object)
+{
+    const std::uint64_t bits = bigEndian(_objects.content(object));
+    const bool isSingle = object.count == sizeof(float);
+    return PropertyValue::real(
+        isSingle ? static_cast<double>(std::bit_cast<float>(static_cast<std::uint32_t>(bits)))
+                 : std::bit_cast<double>(bits));
+}
+
+PropertyValue TreeBuilder::string(const Object& object)
+{
+    const ByteView content = _objects.content(object);
+    if (object.type == Type::AsciiString) {
+        const auto isAscii = [](std::uint8_t byte) { return byte < 0x80; };
+        const auto wrong = std::find_if_not(content.begin(), content.end(), isAscii);
+        if (wrong != content.end())
+            return fail("an ASCII text holds another byte",
+                        object.content + static_cast<std::size_t>(wrong - content.begin()));
+        return PropertyValue(std::string(content.begin(), content.end()));
+    }
+    Utf16Conversion conversion = utf8FromUtf16(content, std::endian::big);
+    if (!conversion.text)
+        return fail("malformed UTF-16", object.content + conversion.faultOffset);
+    return PropertyValue(std::move(*conversion.text));
+}
+
+PropertyValue TreeBuilder::array(const Object& object)
+{
+    PropertyValue array = PropertyValue::newArray();
+    for (std::size_t n = 0; n < object.count; ++n) {
+        PropertyValue element = referenced(object, n);
+        if (!element)
+            return {};
+        array.asArray()->append(std::move(element));
+    }
+    return array;
+}
+
+PropertyValue TreeBuilder::dictionary(const Object& object)
+{
+    PropertyValue dictionary = PropertyValue::newDictionary();
+    for (std::size_t n = 0; n < object.count; ++n) {
+        const PropertyValue key = referenced(object, n, Use::Key);
+        PropertyValue element = key ? referenced(object, object.count + n) : PropertyValue();
+        if (!element)
+            return {};
+        dictionary.asDictionary()->set(*key.asString(), std::move(element));
+    }
+    return dictionary;
+}
+
+PropertyValue TreeBuilder::referenced(const Object& container, std::size_t n, Use use)
+{
+    const std::size_t offset = _objects.referenceOffset(container, n);
+    const std::optional<std::size_t> index = _objects.reference(container, n);
+    if (!index)
+        return fail("reference to no object", offset);
+    const Type type = _objects[*index].type;
+    if (use == Use::Key && type != Type::AsciiString && type != Type::Utf16String)
+        return fail("reference to a dictionary key that is no string", offset);
+    return value(*index);
+}
+
+} // namespace
+
+PropertyListResult readBinaryPropertyList(ByteView bytes) { return TreeBuilder(bytes).read(); }
+
+} // namespace orvane

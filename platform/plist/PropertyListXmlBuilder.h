@@ -1,0 +1,68 @@
+#pragma once
+
+#include "platform/base/PropertyValue.h"
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace orvane
+{
+
+// Builds the value of an XML property list from its elements and texts in their order, and refuses
+// what is no property list. Once an operation has returned false, error() says why and no other may
+// follow.
+class PropertyListXmlBuilder
+{
+public:
+    PropertyListXmlBuilder();
+
+    bool startElement(std::string_view name);
+    bool addText(std::string_view text);
+    // What it refuses is the fault of the element that was started last.
+    bool endElement();
+
+    [[nodiscard]] const std::string& error() const { return _error; }
+    // The list's value, once its last element has ended.
+    [[nodiscard]] const PropertyValue& root() const { return _root; }
+
+private:
+    enum class Element {
+        Unknown,
+        PropertyList,
+        Dictionary,
+        Array,
+        Key,
+        String,
+        Integer,
+        Real,
+        True,
+        False,
+        Data,
+        Date
+    };
+    struct Name;
+    struct OpenContainer {
+        PropertyValue value;
+        std::optional<std::string> key; // waits for its value; dictionaries only
+    };
+
+    static const Name kNames[];
+    static Element elementNamed(std::string_view name);
+
+    bool fail(std::string text);
+    bool canStartHere(Element element, std::string_view name);
+    bool endContainer();
+    PropertyValue leafValue();
+    void add(PropertyValue value);
+
+    bool _isInside = false;       // <plist>
+    std::optional<Element> _leaf; // the open element that holds a text or nothing
+    std::string _text;            // of that element so far
+    std::vector<OpenContainer> _open;
+    PropertyValue _root;
+    std::string _error;
+};
+
+} // namespace orvane

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "platform/base/PropertyValue.h"
+
+#include <string>
+#include <string_view>
+
+namespace orvane
+{
+
+// The values of XML property lists that are written as one text, from that text. Spaces, tabs and
+// line ends around it do not count. On bad text each yields an absent value and says in `error`
+// what is wrong with it.
+
+// Decimal or, after "0x", hexadecimal, with or without a sign, within 64 signed bits.
+PropertyValue integerFromXml(std::string_view text, std::string& error);
+// Decimal with or without an exponent, "nan", "inf" or "infinity". Not dependent on the locale.
+PropertyValue realFromXml(std::string_view text, std::string& error);
+// "2026-11-21T10:00:00Z", the years 1 to 9999.
+PropertyValue dateFromXml(std::string_view text, std::string& error);
+// Base64 with its padding, white space anywhere.
+PropertyValue dataFromXml(std::string_view text, std::string& error);
+
+// Whether the character is one that XML counts as white space.
+constexpr bool isXmlSpace(char character)
+{
+    return character == ' ' || character == '\t' || character == '\n' || character == '\r';
+}
+
+} // namespace orvane

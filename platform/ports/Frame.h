@@ -1,0 +1,65 @@
+#pragma once
+
+#include "platform/base/Bytes.h"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace orvane
+{
+
+// One message on a connection: a 16-byte header (length of the data, message id, serial, flags; all
+// 32-bit little-endian), then the data. Flag bit 0 says that a reply is wanted, bit 1 that this is
+// a reply. The other bits are written as 0 and not looked at when reading, so that a later version
+// may give them a meaning that older readers can do without.
+struct Frame {
+    std::int32_t messageId = 0;
+    std::uint32_t serial = 0; // chosen by the sender; a reply carries its request's
+    bool wantsReply = false;
+    bool isReply = false;
+    Bytes data;
+};
+
+constexpr std::size_t kFrameHeaderBytes = 16;
+constexpr std::size_t kFrameDataLimit = 16U * 1024 * 1024;
+
+// Appends the frame's bytes. The data must be within kFrameDataLimit (std::length_error otherwise).
+void appendFrame(Bytes& to, std::int32_t messageId, std::uint32_t serial, bool wantsReply,
+                 bool isReply, ByteView data);
+
+// Cuts a byte stream into frames, however the stream is split. Holds only bytes that it was given:
+// an announced length takes no memory before the bytes come. Each byte is moved a bounded number of
+// times, also where one append() brings many small frames.
+class FrameReader
+{
+public:
+    // Adds bytes of the stream. Nothing is taken once the reader has failed.
+    void append(ByteView bytes);
+    // The next whole frame, or nothing until more bytes come. The view in `data` of the returned
+    // frame is valid until the next append() or next().
+    struct View {
+        std::int32_t messageId;
+        std::uint32_t serial;
+        bool wantsReply;
+        bool isReply;
+        ByteView data;
+    };
+    std::optional<View> next();
+    // Whether a frame announced more than kFrameDataLimit bytes: the connection must end.
+    [[nodiscard]] bool hasFailed() const { return _failed; }
+    // The announced length that made it fail.
+    [[nodiscard]] std::uint32_t failedLength() const { return _failedLength; }
+    // The error line for a reader that has failed.
+    [[nodiscard]] std::string failureText() const;
+
+private:
+    void discardRead();
+
+    Bytes _buffer;
+    std::size_t _start = 0; // of the next frame in _buffer
+    bool _failed = false;
+    std::uint32_t _failedLength = 0;
+};
+
+} // namespace orvane

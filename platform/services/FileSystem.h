@@ -1,0 +1,34 @@
+#pragma once
+
+#include "platform/base/Bytes.h"
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace orvane
+{
+
+// The files that the system keeps at fixed places (log folder, install marker), all taken below one
+// root directory.
+class FileSystem
+{
+public:
+    // `root` is "/" for the machine itself.
+    explicit FileSystem(std::string root = "/") : _root(std::move(root)) {}
+
+    // Where an absolute path of the system really is: "/a/b" below root "/tmp/x" is "/tmp/x/a/b".
+    [[nodiscard]] std::string located(std::string_view path) const;
+    [[nodiscard]] bool exists(std::string_view path) const;
+
+private:
+    std::string _root;
+};
+
+// The whole file, or nothing when it cannot be read or is longer than `limit` bytes.
+std::optional<Bytes> readFile(const std::string& path, std::size_t limit = SIZE_MAX);
+// Writes the file directly, replacing an earlier one. Where it could be begun but not finished, it
+// is removed: no half file is left behind.
+bool writeFile(const std::string& path, ByteView content);
+
+} // namespace orvane

@@ -1,0 +1,162 @@
+#include "platform/services/FileSystem.h"
+
+#include "support/TemporaryDirectory.h"
+
+#include <csignal>
+#include <filesystem>
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+
+namespace orvane
+{
+namespace
+{
+
+namespace fs = std::filesystem;
+
+Bytes numbered(std::size_t size)
+{
+    Bytes bytes(size);
+    for (std::size_t i = 0; i < size; ++i)
+        bytes[i] = static_cast<std::uint8_t>(i * 31);
+    return bytes;
+}
+
+TEST(FileSystemTest, PathsAreTakenBelowTheRoot)
+{
+    struct Case {
+        const char* root;
+        const char* path;
+        const char* located;
+    };
+    for (const auto& [root, path, located] : {
+             Case{"/",         "/a/b", "/a/b"      },
+             Case{"",          "/a/b", "/a/b"      },
+             Case{"/tmp/x",    "/a/b", "/tmp/x/a/b"},
+             Case{"/tmp/x/",   "/a/b", "/tmp/x/a/b"},
+             Case{"/tmp/x///", "/a",   "/tmp/x/a"  },
+             Case{"relative",  "/a",   "relative/a"},
+    })
+        EXPECT_EQ(FileSystem(root).located(path), located) << root << ' ' << path;
+    EXPECT_EQ(FileSystem().located("/a"), "/a");
+}
+
+TEST(FileSystemTest, ExistenceIsAskedBelowTheRoot)
+{
+    const TemporaryDirectory directory;
+    const FileSystem files(directory.path());
+    EXPECT_FALSE(files.exists("/marker"));
+    ASSERT_TRUE(writeFile(directory.path() + "/marker", {}));
+    EXPECT_TRUE(files.exists("/marker"));
+    EXPECT_FALSE(files.exists("/marker/below"));
+    fs::create_directory(directory.path() + "/folder");
+    EXPECT_TRUE(files.exists("/folder"));
+    EXPECT_FALSE(FileSystem(directory.path() + "/folder").exists("/marker"));
+}
+
+TEST(FileSystemTest, WhatIsWrittenIsRead)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    // Shorter ones after longer ones: nothing of the earlier file is left. 65536 bytes are read at
+    // a time.
+    for (const std::size_t size : {200000U, 131072U, 65537U, 65536U, 65535U, 1U, 0U}) {
+        ASSERT_TRUE(writeFile(path, numbered(size))) << size;
+        EXPECT_EQ(readFile(path), numbered(size)) << size;
+    }
+}
+
+TEST(FileSystemTest, FileLongerThanTheLimitIsNotRead)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    for (const std::size_t size : {0U, 1U, 1000U, 65536U, 70000U}) {
+        ASSERT_TRUE(writeFile(path, numbered(size)));
+        EXPECT_EQ(readFile(path, size), numbered(size)) << size;
+        EXPECT_EQ(readFile(path, size + 1), numbered(size)) << size;
+        if (size > 0) {
+            EXPECT_FALSE(readFile(path, size - 1)) << size;
+        }
+    }
+}
+
+TEST(FileSystemTest, WhatIsNoReadableFileIsNotRead)
+{
+    const TemporaryDirectory directory;
+    EXPECT_FALSE(readFile(directory.path() + "/missing"));
+    EXPECT_FALSE(readFile(directory.path() + "/missing/file"));
+    EXPECT_FALSE(readFile(directory.path()));
+    EXPECT_FALSE(readFile(""));
+}
+
+TEST(FileSystemTest, WritingWhereThereIsNoFolderFails)
+{
+    const TemporaryDirectory directory;
+    EXPECT_FALSE(writeFile(directory.path() + "/missing/file", numbered(1)));
+    EXPECT_FALSE(fs::exists(directory.path() + "/missing"));
+    EXPECT_FALSE(writeFile(directory.path(), numbered(1)));
+    EXPECT_TRUE(fs::is_directory(directory.path()));
+}
+
+// Files longer than so many bytes cannot be written while it lives, as on a full disk.
+class FileSizeLimit
+{
+public:
+    explicit FileSizeLimit(rlim_t bytes) : _signalBefore(std::signal(SIGXFSZ, SIG_IGN))
+    {
+        getrlimit(RLIMIT_FSIZE, &_before);
+        rlimit limited = _before;
+        limited.rlim_cur = bytes;
+        setrlimit(RLIMIT_FSIZE, &limited);
+    }
+    ~FileSizeLimit()
+    {
+        setrlimit(RLIMIT_FSIZE, &_before);
+        std::signal(SIGXFSZ, _signalBefore);
+    }
+    FileSizeLimit(const FileSizeLimit&) = delete;
+    FileSizeLimit& operator=(const FileSizeLimit&) = delete;
+
+private:
+    void (*_signalBefore)(int);
+    rlimit _before{};
+};
+
+TEST(FileSystemTest, FailedWriteLeavesNoHalfFile)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    // The longer ones fail while they are written, the short one when the file is closed.
+    for (const std::size_t size : {1000000U, 100000U, 2000U}) {
+        bool isWritten = true;
+        {
+            const FileSizeLimit limit(1000);
+            isWritten = writeFile(path, numbered(size));
+        }
+        EXPECT_FALSE(isWritten) << size;
+        EXPECT_FALSE(fs::exists(path)) << size;
+    }
+    ASSERT_TRUE(writeFile(path, numbered(2000)));
+    EXPECT_EQ(readFile(path), numbered(2000));
+}
+
+TEST(FileSystemTest, FailedWriteRemovesNothingButAFile)
+{
+    EXPECT_FALSE(writeFile("/dev/full", numbered(10)));
+    EXPECT_TRUE(fs::exists("/dev/full"));
+}
+
+TEST(FileSystemTest, FailedWriteOverAnEarlierFileLeavesNoHalfFile)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    ASSERT_TRUE(writeFile(path, numbered(10)));
+    {
+        const FileSizeLimit limit(1000);
+        EXPECT_FALSE(writeFile(path, numbered(100000)));
+    }
+    EXPECT_FALSE(fs::exists(path));
+}
+
+} // namespace
+} // namespace orvane
