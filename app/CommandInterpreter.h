@@ -1,7 +1,7 @@
 #pragma once
 
 #include "app/OrvaneApp.h"
-#include "ui/output/OutputPane.h"
+#include "screens/print/OutputPane.h"
 
 #include <functional>
 #include <string_view>

@@ -2,7 +2,7 @@
 
 #include "platform/base/PropertyValue.h"
 #include "platform/services/Services.h"
-#include "platform/toolkit/Screen.h"
+#include "screens/toolkit/Screen.h"
 #include "ui/PaneStack.h"
 
 #include <utility>

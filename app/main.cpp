@@ -19,9 +19,9 @@
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
 #include "platform/services/Uuid.h"
-#include "platform/terminal/TerminalKind.h"
-#include "platform/window/QtWindowApplication.h"
 #include "recordings/LogRecorder.h"
+#include "screens/terminal/TerminalKind.h"
+#include "screens/window/QtWindowApplication.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <cstdio>

@@ -3,8 +3,8 @@
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/PropertyValue.h"
+#include "screens/print/JsonPane.h"
 #include "ui/OrvaneModelNode.h"
-#include "ui/output/JsonPane.h"
 
 #include <benchmark/benchmark.h>
 

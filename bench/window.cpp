@@ -1,11 +1,11 @@
 // A refresh of a pane with 1,000 rows in the window: every value new, the visible rows drawn.
 
-#include "platform/toolkit/Window.h"
+#include "screens/toolkit/Window.h"
 #include "doubles/ManualMainQueue.h"
-#include "platform/toolkit/NavigationController.h"
-#include "platform/window/QtScreen.h"
-#include "platform/window/QtWindowApplication.h"
-#include "platform/window/WindowFrame.h"
+#include "screens/toolkit/NavigationController.h"
+#include "screens/window/QtScreen.h"
+#include "screens/window/QtWindowApplication.h"
+#include "screens/window/WindowFrame.h"
 #include "ui/OrvanePaneController.h"
 
 #include <benchmark/benchmark.h>

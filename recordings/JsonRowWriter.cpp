@@ -1,7 +1,7 @@
 #include "recordings/JsonRowWriter.h"
 
 #include "platform/base/JsonText.h"
-#include "ui/output/JsonPane.h"
+#include "screens/print/JsonPane.h"
 
 namespace orvane
 {

@@ -7,7 +7,7 @@
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/Console.h"
 #include "platform/services/SystemLog.h"
-#include "platform/toolkit/Screen.h"
+#include "screens/toolkit/Screen.h"
 
 #include <cerrno>
 #include <cstring>

@@ -1,6 +1,6 @@
 #include "recordings/RecordingApp.h"
 
-#include "platform/toolkit/Screen.h"
+#include "screens/toolkit/Screen.h"
 #include "ui/PaneStack.h"
 
 #include <utility>

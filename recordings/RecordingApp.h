@@ -1,10 +1,10 @@
 #pragma once
 
-#include "platform/toolkit/NavigationController.h"
-#include "platform/toolkit/Window.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/RecordingPlayer.h"
 #include "recordings/SnapshotTree.h"
+#include "screens/toolkit/NavigationController.h"
+#include "screens/toolkit/Window.h"
 #include "ui/OrvanePaneController.h"
 #include "ui/Shell.h"
 

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "platform/services/MainQueue.h"
-#include "platform/toolkit/Playback.h"
 #include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"
+#include "screens/toolkit/Playback.h"
 #include "ui/OrvaneModelNode.h"
 
 #include <chrono>

@@ -6,7 +6,7 @@
 #include "recordings/OpenedRecording.h"
 #include "recordings/RecordingSettings.h"
 #include "recordings/RefreshPeriods.h"
-#include "ui/output/OutputPane.h"
+#include "screens/print/OutputPane.h"
 
 #include <functional>
 #include <memory>

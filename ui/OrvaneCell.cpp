@@ -1,6 +1,6 @@
 #include "ui/OrvaneCell.h"
 
-#include "platform/toolkit/Screen.h"
+#include "screens/toolkit/Screen.h"
 
 namespace orvane
 {

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/toolkit/ScrollView.h"
-#include "platform/toolkit/TableViewCell.h"
+#include "screens/toolkit/ScrollView.h"
+#include "screens/toolkit/TableViewCell.h"
 
 #include <memory>
 #include <string>

@@ -1,7 +1,7 @@
 #include "ui/OrvanePaneController.h"
 
-#include "platform/toolkit/ActivityIndicator.h"
-#include "platform/toolkit/NavigationController.h"
+#include "screens/toolkit/ActivityIndicator.h"
+#include "screens/toolkit/NavigationController.h"
 #include "ui/OrvaneCell.h"
 
 #include <utility>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/toolkit/TableViewController.h"
+#include "screens/toolkit/TableViewController.h"
 #include "ui/OrvaneModelNode.h"
 #include "ui/Shell.h"
 

@@ -1,8 +1,8 @@
 #include "ui/OrvaneSaveViewController.h"
 
 #include "platform/services/Services.h"
-#include "platform/toolkit/Control.h"
-#include "platform/toolkit/Screen.h"
+#include "screens/toolkit/Control.h"
+#include "screens/toolkit/Screen.h"
 #include "ui/SnapshotFile.h"
 
 namespace orvane

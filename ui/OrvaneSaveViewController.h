@@ -1,10 +1,10 @@
 #pragma once
 
 #include "platform/base/PropertyValue.h"
-#include "platform/toolkit/Interface.h"
-#include "platform/toolkit/TableView.h"
-#include "platform/toolkit/TextField.h"
-#include "platform/toolkit/ViewController.h"
+#include "screens/toolkit/Interface.h"
+#include "screens/toolkit/TableView.h"
+#include "screens/toolkit/TextField.h"
+#include "screens/toolkit/ViewController.h"
 #include "ui/Shell.h"
 
 #include <memory>

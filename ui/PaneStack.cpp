@@ -1,6 +1,6 @@
 #include "ui/PaneStack.h"
 
-#include "platform/toolkit/NavigationController.h"
+#include "screens/toolkit/NavigationController.h"
 
 namespace orvane
 {

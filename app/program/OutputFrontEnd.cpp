@@ -3,7 +3,7 @@
 #include "app/program/PrintedOutput.h"
 #include "platform/linux/LineReader.h"
 #include "platform/linux/QtEventLoop.h"
-#include "ui/output/PrintingPaneController.h"
+#include "screens/print/PrintingPaneController.h"
 
 #include <csignal>
 #include <optional>

@@ -2,8 +2,8 @@
 
 #include "app/program/FrontEnd.h"
 #include "platform/linux/QtEventLoop.h"
-#include "ui/output/JsonPane.h"
-#include "ui/output/TextPane.h"
+#include "screens/print/JsonPane.h"
+#include "screens/print/TextPane.h"
 
 #include <unistd.h>
 

@@ -2,7 +2,7 @@
 
 #include "app/AppOptions.h"
 #include "platform/services/OutputDescriptor.h"
-#include "ui/output/OutputPane.h"
+#include "screens/print/OutputPane.h"
 
 #include <memory>
 

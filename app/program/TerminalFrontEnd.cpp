@@ -4,8 +4,8 @@
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/SignalWatcher.h"
-#include "platform/terminal/CursesDevice.h"
-#include "platform/terminal/TerminalScreen.h"
+#include "screens/terminal/CursesDevice.h"
+#include "screens/terminal/TerminalScreen.h"
 
 #include <chrono>
 #include <csignal>

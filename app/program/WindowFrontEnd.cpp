@@ -1,7 +1,7 @@
 #include "app/program/WindowFrontEnd.h"
 
 #include "platform/linux/QtEventLoop.h"
-#include "platform/window/QtScreen.h"
+#include "screens/window/QtScreen.h"
 
 #include <utility>
 

@@ -6,9 +6,9 @@
 #include "platform/plist/PropertyList.h"
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
+#include "screens/print/JsonPane.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
-#include "ui/output/JsonPane.h"
 
 #include <filesystem>
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/base/Calendar.h"
-#include "platform/toolkit/Playback.h"
+#include "screens/toolkit/Playback.h"
 
 #include <string>
 #include <vector>

@@ -1,7 +1,7 @@
 #include "doubles/FakeScreen.h"
 
-#include "platform/toolkit/TableView.h"
-#include "platform/toolkit/Window.h"
+#include "screens/toolkit/TableView.h"
+#include "screens/toolkit/Window.h"
 
 #include <algorithm>
 

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "platform/toolkit/BarButtonItem.h"
-#include "platform/toolkit/NavigationController.h"
-#include "platform/toolkit/Screen.h"
-#include "platform/toolkit/TableViewCell.h"
+#include "screens/toolkit/BarButtonItem.h"
+#include "screens/toolkit/NavigationController.h"
+#include "screens/toolkit/Screen.h"
+#include "screens/toolkit/TableViewCell.h"
 
 #include <functional>
 #include <map>

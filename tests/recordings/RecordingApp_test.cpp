@@ -3,8 +3,8 @@
 
 #include "doubles/FakeScreen.h"
 #include "doubles/ManualMainQueue.h"
-#include "platform/toolkit/TableView.h"
 #include "recordings/support/LogFiles.h"
+#include "screens/toolkit/TableView.h"
 #include "support/Recording.h"
 #include "ui/OrvaneCell.h"
 #include "ui/PaneStack.h"

@@ -4,9 +4,9 @@
 
 #include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"
+#include "screens/print/JsonPane.h"
+#include "screens/print/TextPane.h"
 #include "support/Recording.h"
-#include "ui/output/JsonPane.h"
-#include "ui/output/TextPane.h"
 
 #include <gmock/gmock.h>
 

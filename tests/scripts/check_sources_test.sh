@@ -7,23 +7,15 @@ make_tree() {
     rm -rf "$scratch/tree"
     mkdir "$scratch/tree"
     cd "$scratch/tree" || exit 1
-    put CMakeLists.txt <<'END'
-# orvane_layer(nothing FOLDER app USES ui)
-orvane_layer(platform FOLDER platform)
-orvane_layer(ui FOLDER ui RECURSIVE USES platform)
-orvane_layer(app FOLDER app
-             USES ui platform)
-orvane_layer(qt FOLDER platform/qt USES platform)
-END
     put platform/Value.h <<<'#pragma once'
-    put platform/PropertyListXml.cpp <<<'#include <expat.h>'
+    put platform/plist/Xml.cpp <<<'#include <expat.h>'
     put ui/panes/Pane.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <vector>'
     put app/Shell.h <<<$'#pragma once\n#include "ui/panes/Pane.h"\n#include "platform/Value.h"'
-    put app/main.cpp <<<'#include "platform/qt/Loop.h"'
-    put app/program/FrontEnd.cpp <<<'#include "platform/qt/Loop.h"'
-    put platform/qt/Loop.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <QObject>'
-    put platform/window/Row.h <<<$'#pragma once\n#include <QWidget>'
-    put tests/window/Row_test.cpp <<<'#include <QTest>'
+    put app/main.cpp <<<'#include "platform/linux/Loop.h"'
+    put app/program/FrontEnd.cpp <<<'#include "platform/linux/Loop.h"'
+    put platform/linux/Loop.h <<<$'#pragma once\n#include "platform/Value.h"\n#include <QObject>'
+    put screens/window/Row.h <<<$'#pragma once\n#include <QWidget>'
+    put tests/screens/window/Row_test.cpp <<<'#include <QTest>'
     put tests/support/Helper.cpp <<<'#include "support/Helper.h"'
     put tests/support/Helper.h <<<'#pragma once'
     put fuzz/Target.h <<<'#pragma once'
@@ -55,16 +47,12 @@ expect_complaint app/Other.h "$once#include \"../ui/panes/Pane.h\"" app/Other.h:
 expect_complaint app/Other.h "$once#include \"./Shell.h\"" app/Other.h:2 "an include starts at the root"
 expect_complaint app/Other.h "$once#include \"ui/../ui/panes/Pane.h\"" app/Other.h:2 "an include starts at the root"
 expect_complaint app/Other.cpp '#include "Shell.h"' app/Other.cpp:1 "no such header"
-expect_complaint app/Other.cpp '#include <QTimer>' app/Other.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
-expect_complaint app/main.cpp '#include <QCoreApplication>' app/main.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
-expect_complaint tests/app/Other_test.cpp '#  include <QtCore/QTimer>' tests/app/Other_test.cpp:1 "Qt is for platform/qt/ and platform/window/ alone"
-expect_complaint ui/Other.cpp '#include <ncurses.h>' ui/Other.cpp:1 "ncurses is for platform/terminal/ alone"
-expect_complaint ui/Other.cpp '#include <ncursesw/curses.h>' ui/Other.cpp:1 "ncurses is for platform/terminal/ alone"
+expect_complaint app/Other.cpp '#include <QTimer>' app/Other.cpp:1 "Qt is for platform/linux/ and screens/window/ alone"
+expect_complaint app/main.cpp '#include <QCoreApplication>' app/main.cpp:1 "Qt is for platform/linux/ and screens/window/ alone"
+expect_complaint tests/app/Other_test.cpp '#  include <QtCore/QTimer>' tests/app/Other_test.cpp:1 "Qt is for platform/linux/ and screens/window/ alone"
+expect_complaint ui/Other.cpp '#include <ncurses.h>' ui/Other.cpp:1 "ncurses is for screens/terminal/ alone"
+expect_complaint ui/Other.cpp '#include <ncursesw/curses.h>' ui/Other.cpp:1 "ncurses is for screens/terminal/ alone"
 expect_complaint platform/Other.cpp '#include <expat.h>' platform/Other.cpp:1 "Expat is for"
-expect_complaint ui/Other.cpp '#include "app/Shell.h"' ui/Other.cpp:1 "layer ui does not use layer app"
-expect_complaint ui/panes/Other.cpp '#include "app/Shell.h"' ui/panes/Other.cpp:1 "layer ui does not use layer app"
-expect_complaint platform/Other.cpp '#include "platform/qt/Loop.h"' platform/Other.cpp:1 "layer platform does not use layer qt"
-expect_complaint app/Other.cpp '#include "platform/qt/Loop.h"' app/Other.cpp:1 "layer app does not use layer qt"
 expect_complaint app/Other.h '#include <vector>' app/Other.h:1 "a header begins with #pragma once"
 expect_complaint app/Other.h "$once using namespace std;" app/Other.h:2 "a header opens no namespace"
 expect_complaint app/Other.cpp '// TO''DO: later' app/Other.cpp:1 "what is left to do"
@@ -72,7 +60,7 @@ expect_complaint tests/app/Other_tests.cpp $'\nTEST_F(Shell, Opens)' tests/app/O
 
 case_named "every broken rule of a tree is named"
 make_tree
-put ui/One.cpp <<<$'#include <QTimer>\n#include "app/Shell.h"'
+put ui/One.cpp <<<$'#include <QTimer>\n#include "Shell.h"'
 put ui/Two.h <<<'#include <ncurses.h>'
 check
 expect_equal "$(cut -d: -f1,2 <<<"$complaints")" $'ui/One.cpp:1\nui/One.cpp:2\nui/Two.h:1\nui/Two.h:1'
@@ -80,7 +68,7 @@ expect_equal "$(cut -d: -f1,2 <<<"$complaints")" $'ui/One.cpp:1\nui/One.cpp:2\nu
 case_named "what the build makes and what is ignored are nobody's"
 make_tree
 put build/dev/Bad.h <<<'#include <QTimer>'
-put platform/qt/Loop.cpp <<<'#include "Loop.moc"'
+put platform/linux/Loop.cpp <<<'#include "Loop.moc"'
 check
 expect_equal "$complaints" ""
 
@@ -89,7 +77,7 @@ if type -P git >/dev/null; then
     make_tree
     git init -q . && put .gitignore <<<'/ignored/'
     put ignored/Bad.h <<<'#include <QTimer>'
-    git add . && rm platform/qt/Loop.h app/main.cpp app/program/FrontEnd.cpp
+    git add . && rm platform/linux/Loop.h app/main.cpp app/program/FrontEnd.cpp
     put ui/New.cpp <<<'#include <QTimer>'
     check
     expect_equal "$(cut -d: -f1 <<<"$complaints")" "ui/New.cpp"

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "platform/toolkit/Control.h"
-#include "platform/toolkit/Interface.h"
-#include "platform/toolkit/TableView.h"
-#include "platform/toolkit/TextField.h"
+#include "screens/toolkit/Control.h"
+#include "screens/toolkit/Interface.h"
+#include "screens/toolkit/TableView.h"
+#include "screens/toolkit/TextField.h"
 
 #include <memory>
 

@@ -2,8 +2,8 @@
 #include "ui/OrvanePaneController.h"
 
 #include "doubles/FakeScreen.h"
-#include "platform/toolkit/ActivityIndicator.h"
-#include "platform/toolkit/Window.h"
+#include "screens/toolkit/ActivityIndicator.h"
+#include "screens/toolkit/Window.h"
 #include "ui/OrvaneCell.h"
 #include "ui/PaneStack.h"
 #include "ui/support/FakeShell.h"

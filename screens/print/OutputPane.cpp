@@ -1,0 +1,42 @@
+#include "screens/print/OutputPane.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+void OutputPane::reloadWithNode(NodePointer node)
+{
+    _node = std::move(node);
+    // Printed with the status that comes next.
+    _isReloaded = true;
+}
+
+void OutputPane::setStatus(std::optional<std::string> status, bool isLoading)
+{
+    std::string text = std::move(status).value_or("");
+    if (!_isReloaded && _status == text && _isLoading == isLoading)
+        return;
+    _isReloaded = false;
+    _isLoading = isLoading;
+    _status = std::move(text);
+    _write(statusOutput(*_status, _isLoading, _node.get()));
+}
+
+void OutputPane::setTime(std::optional<std::string> time) { _time = std::move(time); }
+
+void OutputPane::showNote(const std::string& text)
+{
+    if (const std::string output = noteOutput(text); !output.empty())
+        _write(output);
+}
+
+void OutputPane::showSaved(const SnapshotResult& result)
+{
+    _write(result.isWritten ? savedOutput(result.path)
+                            : alertOutput(kFileErrorTitle, kFileErrorMessage));
+}
+
+void OutputPane::showError(const std::string& text) { _write(errorOutput(text)); }
+
+} // namespace orvane

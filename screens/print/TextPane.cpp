@@ -1,0 +1,57 @@
+#include "screens/print/TextPane.h"
+
+#include "platform/base/Utf8.h"
+
+namespace orvane
+{
+
+namespace
+{
+
+void appendOutline(std::string& to, const OrvaneModelNode& node, std::size_t level)
+{
+    to.append(2 * level, ' ');
+    to += shownText(node.displayName());
+    if (const std::string* value = node.value())
+        to += ": " + shownText(*value);
+    to += '\n';
+    if (const auto* children = node.childNodes())
+        for (const NodePointer& child : *children)
+            appendOutline(to, *child, level + 1);
+}
+
+// Blocks are parted by a blank line, so each ends with one.
+std::string block(std::string lines) { return lines + "\n"; }
+
+} // namespace
+
+std::string TextPane::statusOutput(const std::string& status, bool,
+                                   const OrvaneModelNode* tree) const
+{
+    std::string lines = status + (_isSimulated ? " (simulated phone)\n" : "\n");
+    if (tree)
+        appendOutline(lines, *tree, 0);
+    return block(std::move(lines));
+}
+
+std::string TextPane::savedOutput(const std::string& path) const
+{
+    return block("Saved to " + shownText(path) + "\n");
+}
+
+std::string TextPane::alertOutput(const std::string& title, const std::string& message) const
+{
+    return block(title + ": " + message + "\n");
+}
+
+std::string TextPane::errorOutput(const std::string& text) const
+{
+    return block("Error: " + shownText(text) + "\n");
+}
+
+std::string TextPane::noteOutput(const std::string& text) const
+{
+    return block(shownText(text) + "\n");
+}
+
+} // namespace orvane

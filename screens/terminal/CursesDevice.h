@@ -1,0 +1,39 @@
+#pragma once
+
+#include "screens/terminal/TerminalDevice.h"
+
+#include <memory>
+#include <optional>
+
+namespace orvane
+{
+
+// The terminal at standard input and output, by means of ncurses, with the kind that TERM names.
+// Colours unless NO_COLOR is set. While it lives, lines that go to standard error on that same
+// terminal wait (HeldErrors), and every end of the process gives the terminal back (RestoreGuard).
+// One at a time.
+class CursesDevice final : public TerminalDevice
+{
+public:
+    // Throws std::runtime_error where there is a terminalProblem().
+    CursesDevice();
+    ~CursesDevice() override;
+
+    [[nodiscard]] int lines() const override;
+    [[nodiscard]] int columns() const override;
+    [[nodiscard]] bool hasMarks() const override;
+    void show(const CellGrid& grid, CursorPlace cursor) override;
+    std::optional<Key> readKey() override;
+    [[nodiscard]] bool isGone() const override;
+    void updateSize() override;
+    void suspend() override;
+    void retake() override;
+    // False in the background, until a retake() in the foreground.
+    [[nodiscard]] bool hasTerminal() const;
+
+private:
+    struct State;
+    std::unique_ptr<State> _state;
+};
+
+} // namespace orvane

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "screens/toolkit/View.h"
+
+namespace orvane
+{
+
+// What turns while something is being waited for, in the small grey style.
+class ActivityIndicator : public View
+{
+public:
+    [[nodiscard]] bool isAnimating() const { return _isAnimating; }
+    void startAnimating() { setAnimating(true); }
+    void stopAnimating() { setAnimating(false); }
+    void setHidesWhenStopped(bool hides);
+    [[nodiscard]] bool isHidden() const override
+    {
+        return View::isHidden() || (_hidesWhenStopped && !_isAnimating);
+    }
+
+private:
+    void setAnimating(bool isAnimating);
+
+    bool _isAnimating = false;
+    bool _hidesWhenStopped = false;
+};
+
+} // namespace orvane

@@ -1,0 +1,45 @@
+#include "screens/toolkit/TableViewController.h"
+
+#include "screens/toolkit/Screen.h"
+
+#include <utility>
+
+namespace orvane
+{
+
+TableViewController::~TableViewController()
+{
+    // Whoever still has the table must not ask us any more.
+    if (_table) {
+        _table->setDataSource(nullptr);
+        _table->setDelegate(nullptr);
+    }
+}
+
+TableView& TableViewController::tableView()
+{
+    if (!_table) {
+        _table = std::make_shared<TableView>();
+        _table->setFrame(Screen::main().bounds());
+        _table->setDataSource(this);
+        _table->setDelegate(this);
+    }
+    return *_table;
+}
+
+void TableViewController::viewWillAppear(bool animated)
+{
+    ViewController::viewWillAppear(animated);
+    if (!std::exchange(_hasAppeared, true))
+        tableView().reloadData();
+    if (const auto row = tableView().selectedRow())
+        tableView().deselectRow({0, *row}, animated);
+}
+
+std::shared_ptr<View> TableViewController::loadView()
+{
+    static_cast<void>(tableView());
+    return _table;
+}
+
+} // namespace orvane

@@ -1,0 +1,33 @@
+#pragma once
+
+#include "screens/toolkit/TextField.h"
+
+#include <QObject>
+
+#include <memory>
+
+class QLineEdit;
+
+namespace orvane
+{
+
+// A text field and the widget in which the user edits it. Only what differs is set, so that typing,
+// with an input method as well, is never disturbed.
+class TextFieldBinding final : public QObject
+{
+public:
+    TextFieldBinding(QLineEdit& line, const std::shared_ptr<TextField>& field);
+
+    // Shows what the field holds.
+    void sync();
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    QLineEdit& _line;
+    std::weak_ptr<TextField> _field;
+    bool _hadKeyboard = false;
+};
+
+} // namespace orvane

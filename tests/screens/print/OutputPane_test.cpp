@@ -1,0 +1,184 @@
+#include "platform/base/JsonText.h"
+#include "platform/base/PropertyValue.h"
+#include "screens/print/JsonPane.h"
+#include "screens/print/TextPane.h"
+
+#include <gtest/gtest.h>
+
+namespace orvane
+{
+
+namespace
+{
+
+NodePointer tree(const PropertyValue& display)
+{
+    PathDictionary paths;
+    return OrvaneModelNode::makeTreeFromObject(display, paths);
+}
+
+PropertyValue sampleDisplay()
+{
+    return PropertyValue::dictionaryOf({
+        {"Serving Cell Info", PropertyValue::dictionaryOf({{"Cell Identity", "1234"}})},
+        {"Detected Cells",    PropertyValue::newArray()                               }
+    });
+}
+
+template <typename PaneUnderTest>
+class PaneFixture : public ::testing::Test
+{
+protected:
+    PaneUnderTest make(bool isSimulated = false)
+    {
+        return PaneUnderTest([this](std::string_view text) { output += text; }, isSimulated);
+    }
+
+    std::string output;
+};
+
+using JsonPaneTest = PaneFixture<JsonPane>;
+using TextPaneTest = PaneFixture<TextPane>;
+
+} // namespace
+
+TEST_F(JsonPaneTest, BeforeAnyTreeTheTreeIsNull)
+{
+    JsonPane pane = make();
+    pane.setStatus("Connecting", true);
+    EXPECT_EQ(output, "{\"status\":\"Connecting\",\"loading\":true,\"tree\":null}\n");
+}
+
+TEST_F(JsonPaneTest, AReloadAndItsStatusAreOneLine)
+{
+    JsonPane pane = make();
+    pane.reloadWithNode(tree(sampleDisplay()));
+    EXPECT_EQ(output, "");
+    pane.setStatus("Updated 2026-11-21 at 10:00:00", false);
+    EXPECT_EQ(output, "{\"status\":\"Updated 2026-11-21 at 10:00:00\",\"loading\":false,\"tree\":"
+                      "{\"name\":\"Orvane\",\"children\":["
+                      "{\"name\":\"Serving Cell Info\",\"children\":["
+                      "{\"name\":\"Cell Identity\",\"value\":\"1234\"}]},"
+                      "{\"name\":\"Detected Cells\",\"children\":[]}]}}\n");
+}
+
+TEST_F(JsonPaneTest, AStatusThatDoesNotChangePrintsNothingUnlessReloaded)
+{
+    JsonPane pane = make();
+    pane.setStatus("Connecting...", false);
+    output.clear();
+    pane.setStatus("Connecting...", false);
+    EXPECT_EQ(output, "");
+    pane.reloadWithNode(nullptr);
+    pane.setStatus("Connecting...", false);
+    EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":false,\"tree\":null}\n");
+}
+
+TEST_F(JsonPaneTest, AChangeOfTheBusyStateAloneIsAChange)
+{
+    JsonPane pane = make();
+    pane.setStatus("Connecting...", false);
+    output.clear();
+    pane.setStatus("Connecting...", true);
+    EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":true,\"tree\":null}\n");
+}
+
+TEST_F(JsonPaneTest, AChangeOfTheStatusAloneCarriesTheTreeOnTheScreen)
+{
+    JsonPane pane = make();
+    pane.reloadWithNode(tree("text"));
+    pane.setStatus("Updated", false);
+    output.clear();
+    pane.setStatus("Connecting...", true);
+    EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":true,"
+                      "\"tree\":{\"name\":\"Orvane\",\"value\":\"text\"}}\n");
+}
+
+TEST_F(JsonPaneTest, NoStatusIsAnEmptyOne)
+{
+    JsonPane pane = make();
+    pane.setStatus(std::nullopt, true);
+    EXPECT_EQ(output, "{\"status\":\"\",\"loading\":true,\"tree\":null}\n");
+}
+
+TEST_F(JsonPaneTest, EveryObjectOfASimulatedPhoneSaysSo)
+{
+    JsonPane pane = make(true);
+    pane.setStatus("Connecting", true);
+    pane.showSaved({true, "/root/a.orvane"});
+    pane.showSaved({false, "/root/a.orvane"});
+    pane.showError("no");
+    EXPECT_EQ(output,
+              "{\"status\":\"Connecting\",\"loading\":true,\"tree\":null,\"simulated\":true}\n"
+              "{\"saved\":\"/root/a.orvane\",\"simulated\":true}\n"
+              "{\"alert\":\"File Error\",\"message\":\"Unable to write file to disk\","
+              "\"simulated\":true}\n"
+              "{\"error\":\"no\",\"simulated\":true}\n");
+}
+
+TEST(JsonText, EscapesWhatJsonCannotHold)
+{
+    const struct {
+        std::string_view text;
+        const char* json;
+    } kCases[] = {
+        {"plain",            "\"plain\""                },
+        {"a\"b\\c",          "\"a\\\"b\\\\c\""          },
+        {"1\n2\t3\r",        "\"1\\n2\\t3\\r\""         },
+        {"\x01\x1f",         "\"\\u0001\\u001f\""       },
+        {"12 × 64chips",    "\"12 × 64chips\""        },
+        {"\xF0\x9F\x93\xB6", "\"\xF0\x9F\x93\xB6\""     },
+        {"bad \xFF byte",    "\"bad \xEF\xBF\xBD byte\""},
+    };
+    for (const auto& escape : kCases) {
+        std::string json;
+        appendJsonString(json, escape.text);
+        EXPECT_EQ(json, escape.json);
+    }
+}
+
+TEST_F(TextPaneTest, PrintsTheStatusAndAnOutlineAsBlocksPartedByABlankLine)
+{
+    TextPane pane = make();
+    pane.setStatus("Connecting", true);
+    pane.reloadWithNode(tree(sampleDisplay()));
+    pane.setStatus("Updated 2026-11-21 at 10:00:00", false);
+    EXPECT_EQ(output, "Connecting\n"
+                      "\n"
+                      "Updated 2026-11-21 at 10:00:00\n"
+                      "Orvane\n"
+                      "  Serving Cell Info\n"
+                      "    Cell Identity: 1234\n"
+                      "  Detected Cells\n"
+                      "\n");
+}
+
+TEST_F(TextPaneTest, MarksTheStatusOfASimulatedPhone)
+{
+    TextPane pane = make(true);
+    pane.setStatus("Connecting", true);
+    EXPECT_EQ(output, "Connecting (simulated phone)\n\n");
+}
+
+TEST_F(TextPaneTest, AnswersInWords)
+{
+    TextPane pane = make();
+    pane.showSaved({true, "/root/a.orvane"});
+    pane.showSaved({false, "/root/a.orvane"});
+    pane.showError("unknown command \"x\"");
+    EXPECT_EQ(output, "Saved to /root/a.orvane\n\n"
+                      "File Error: Unable to write file to disk\n\n"
+                      "Error: unknown command \"x\"\n\n");
+}
+
+TEST_F(TextPaneTest, ARowStaysOnItsLine)
+{
+    TextPane pane = make();
+    pane.reloadWithNode(tree(PropertyValue::dictionaryOf({
+        {"two\nlines", "a\nb"}
+    })));
+    pane.setStatus("s", false);
+    EXPECT_EQ(output, "s\nOrvane\n  two lines: a b\n\n");
+}
+
+} // namespace orvane
