@@ -1,9 +1,9 @@
 #include "LogGenerator/LogTechnology.h"
 
-#include "LogGenerator/DlfWriter.h"
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
+#include "dlf/DlfWriter.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"

@@ -1,7 +1,7 @@
 #include "LogGenerator/VRNLogGenerator.h"
 
 #include "LogGenerator/StateKeys.h"
-#include "LogGenerator/VersionReport.h"
+#include "dlf/VersionReport.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/services/SystemLog.h"

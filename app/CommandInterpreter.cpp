@@ -37,10 +37,13 @@ void CommandInterpreter::takeLine(std::string_view line, bool wasCut)
 void CommandInterpreter::save(std::string_view description)
 {
     // What a file can hold: a description is typed, and may be anything.
-    if (const auto result = _app.saveSnapshot(shownText(description)))
-        _output.showSaved(*result);
-    else
+    const auto result = _app.saveSnapshot(shownText(description));
+    if (!result)
         _output.showError("saving is not offered on this machine");
+    else if (result->isWritten)
+        _output.showSaved(result->path);
+    else
+        _output.showAlert(kFileErrorTitle, kFileErrorMessage);
 }
 
 } // namespace orvane

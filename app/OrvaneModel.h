@@ -7,7 +7,7 @@
 #include "platform/ports/MessagePort.h"
 #include "platform/ports/TelephonyServer.h"
 #include "platform/services/MainQueue.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <chrono>
 #include <functional>

@@ -1,6 +1,7 @@
 #include "app/AppOptions.h"
 #include "app/ExportOptions.h"
 #include "app/OrvaneApp.h"
+#include "app/RecordingNotice.h"
 #include "app/program/Display.h"
 #include "app/program/ExportProgram.h"
 #include "app/program/FrontEnd.h"
@@ -58,7 +59,8 @@ std::unique_ptr<LogRecorder> makeRecorder(const AppOptions& options, MainQueue& 
     using Existing = DiskBlockFile::Existing;
     const auto existing = options.overwritesRecord ? Existing::Overwritten : Existing::Refused;
     std::string error;
-    auto recorder = LogRecorder::create(queue, *options.record, existing, error);
+    auto recorder =
+        LogRecorder::create(queue, *options.record, existing, showRecordingNotice, error);
     if (!recorder)
         throw std::runtime_error(error);
     return recorder;

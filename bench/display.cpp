@@ -4,7 +4,7 @@
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/PropertyValue.h"
 #include "screens/print/JsonPane.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <benchmark/benchmark.h>
 

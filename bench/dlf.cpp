@@ -1,10 +1,10 @@
 // Diagnostic logs: reading 10 MB, plain, as exported, and damaged here and there; exporting the
 // history of a busy channel.
 
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfTime.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/VRNLogGenerator.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfTime.h"
 #include "platform/base/PropertyValue.h"
 
 #include <benchmark/benchmark.h>

@@ -1,8 +1,8 @@
 // Recordings on the way out: exporting rows of an LTE drive, two of them and all, and recording a
 // busy channel to disk.
 
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfTime.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/MainQueue.h"
@@ -109,8 +109,8 @@ void recordMessages(benchmark::State& state)
     RestingQueue queue;
     const std::string path = temporaryFile("-recorded.dlf");
     std::string error;
-    const auto recorder =
-        LogRecorder::create(queue, path, DiskBlockFile::Existing::Overwritten, error);
+    const auto recorder = LogRecorder::create(
+        queue, path, DiskBlockFile::Existing::Overwritten, [](const std::string&) {}, error);
     if (!recorder) {
         state.SkipWithError(error.c_str());
         return;

@@ -1,10 +1,10 @@
 // Messages to display rows, as the live view decodes them with its log at rest: a drive through LTE
 // as a modem reports it, and the messages that cost most.
 
-#include "LogGenerator/DlfReader.h"
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
+#include "dlf/DlfReader.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"

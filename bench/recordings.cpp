@@ -3,10 +3,10 @@
 // many as ORVANE_BENCH_MEGABYTES says.
 
 #include "LogGenerator/LogTechnology.h"
+#include "dlf/FileWindow.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
-#include "recordings/FileWindow.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/RefreshPeriods.h"

@@ -1,7 +1,7 @@
 // Any file: items lie inside of it, one after the other, and every byte is accounted for.
 
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfTime.h"
 
 #include <cstdint>
 #include <cstdlib>

@@ -6,7 +6,7 @@
 #include "platform/services/Services.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/SnapshotTree.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <cstdint>
 #include <cstdlib>

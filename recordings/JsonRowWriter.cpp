@@ -1,7 +1,6 @@
 #include "recordings/JsonRowWriter.h"
 
 #include "platform/base/JsonText.h"
-#include "screens/print/JsonPane.h"
 
 namespace orvane
 {

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "LogGenerator/DlfReader.h"
 #include "LogGenerator/LogGenerator.h"
+#include "dlf/DlfReader.h"
+#include "insight/ServingCell.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "recordings/LogTime.h"
-#include "recordings/ServingCell.h"
 
 #include <memory>
 #include <optional>

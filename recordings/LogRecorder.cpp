@@ -1,13 +1,11 @@
 #include "recordings/LogRecorder.h"
 
-#include "LogGenerator/VersionReport.h"
+#include "dlf/VersionReport.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "platform/services/Console.h"
 #include "platform/services/SystemLog.h"
-#include "screens/toolkit/Screen.h"
 
 #include <cerrno>
 #include <cstring>
@@ -25,7 +23,7 @@ constexpr std::size_t kLongestItem = 0xFFFF; // what the length field holds
 } // namespace
 
 std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::string& path,
-                                                 DiskBlockFile::Existing existing,
+                                                 DiskBlockFile::Existing existing, Notify notify,
                                                  std::string& error)
 {
     auto file = DiskBlockFile::create(path, existing, error);
@@ -34,7 +32,7 @@ std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::st
     const auto report = makeVersionReport();
     const int failure = report ? file->append(*report) : EIO;
     if (failure == 0)
-        return std::make_unique<LogRecorder>(queue, std::move(file), path);
+        return std::make_unique<LogRecorder>(queue, std::move(file), path, std::move(notify));
     error = "\"" + path + "\" cannot be written (" + std::strerror(failure) +
             "): make room, or give another name to record to";
     std::error_code ignored;
@@ -43,8 +41,9 @@ std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::st
     return nullptr;
 }
 
-LogRecorder::LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path)
-    : _queue(queue), _file(std::move(file)), _path(std::move(path))
+LogRecorder::LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path,
+                         Notify notify)
+    : _queue(queue), _file(std::move(file)), _path(std::move(path)), _notify(std::move(notify))
 {
 }
 
@@ -59,7 +58,7 @@ void LogRecorder::channelOpened(const PropertyValue& technology)
     _hasModemMessages = technology != kTSLogChannelTechnology_IFX;
     if (_hasModemMessages || !_file || std::exchange(_hasSaidThatNothingComes, true))
         return;
-    tell("Nothing to record to \"" + _path + "\": a cell monitor has no messages of a modem.");
+    _notify("Nothing to record to \"" + _path + "\": a cell monitor has no messages of a modem.");
 }
 
 void LogRecorder::messageReceived(ByteView message)
@@ -100,15 +99,9 @@ void LogRecorder::endIfFailed(int error)
 {
     if (error == 0)
         return;
-    tell("Recording to \"" + _path + "\" has ended: " + std::strerror(error) +
-         ". What came before is kept.");
+    _notify("Recording to \"" + _path + "\" has ended: " + std::strerror(error) +
+            ". What came before is kept.");
     _file.reset();
-}
-
-void LogRecorder::tell(const std::string& line) const
-{
-    consoleLine("%s", line.c_str());
-    Screen::main().showAlert(std::make_unique<AlertView>("Recording", line, "Close"));
 }
 
 } // namespace orvane

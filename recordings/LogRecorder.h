@@ -1,12 +1,13 @@
 #pragma once
 
 #include "LogGenerator/LogChannelObserver.h"
+#include "dlf/BlockFile.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/services/MainQueue.h"
-#include "recordings/BlockFile.h"
 
 #include <chrono>
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -19,21 +20,23 @@ namespace orvane
 //
 // Each item is written at once, so that the end of the process loses none; what was written is made
 // safe from a power cut within a second. The first failure, a full disk as a rule, ends the
-// recording with one line, on the console and on the screen, and leaves the whole items in the
-// file.
+// recording with one line to the owner, and leaves the whole items in the file.
 class LogRecorder final : public LogChannelObserver
 {
 public:
     static constexpr std::chrono::milliseconds kSynchronisation{500};
 
+    // Takes one line for the user: the recording has ended, or has nothing to record.
+    using Notify = std::function<void(const std::string& line)>;
+
     // Null where the file cannot be begun; `error` then says so and what to do. The queue must
     // outlive the recorder.
     static std::unique_ptr<LogRecorder> create(MainQueue& queue, const std::string& path,
-                                               DiskBlockFile::Existing existing,
+                                               DiskBlockFile::Existing existing, Notify notify,
                                                std::string& error);
     // Records to a file that begins here; `path` is its name for people. A file that takes nothing
     // ends the recording at once.
-    LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path);
+    LogRecorder(MainQueue& queue, std::unique_ptr<BlockFile> file, std::string path, Notify notify);
     ~LogRecorder() override;
     LogRecorder(const LogRecorder&) = delete;
     LogRecorder& operator=(const LogRecorder&) = delete;
@@ -45,12 +48,12 @@ public:
 
 private:
     void synchroniseSoon();
-    void tell(const std::string& line) const;
     void endIfFailed(int error);
 
     MainQueue& _queue;
     std::unique_ptr<BlockFile> _file; // null once it failed
     std::string _path;
+    Notify _notify;
     bool _hasModemMessages = true;
     bool _hasSaidThatNothingComes = false;
     bool _isSynchronisationQueued = false;

@@ -1,7 +1,7 @@
 #include "recordings/LogSurvey.h"
 
-#include "LogGenerator/DlfTime.h"
-#include "LogGenerator/DlfWriter.h"
+#include "dlf/DlfTime.h"
+#include "dlf/DlfWriter.h"
 #include "recordings/LogSlice.h"
 
 #include <algorithm>

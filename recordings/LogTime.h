@@ -12,7 +12,7 @@ namespace orvane
 using LogTime = std::chrono::nanoseconds;
 
 // The clock of a recording: what LogTime 0 is. Of a timestamp only the whole steps of 1.25 ms count
-// (see LogGenerator/DlfTime.h), as UTC without leap seconds.
+// (see dlf/DlfTime.h), as UTC without leap seconds.
 class LogClock
 {
 public:

@@ -1,9 +1,9 @@
 #include "recordings/OpenedRecording.h"
 
+#include "dlf/FileWindow.h"
 #include "platform/base/Bytes.h"
 #include "platform/plist/PropertyList.h"
 #include "platform/services/FileSystem.h"
-#include "recordings/FileWindow.h"
 
 #include <algorithm>
 #include <string_view>

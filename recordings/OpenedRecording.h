@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/ByteSource.h"
+#include "dlf/ByteSource.h"
 #include "recordings/Snapshot.h"
 
 #include <memory>

@@ -1,8 +1,8 @@
 #include "recordings/RowPath.h"
 
 #include "platform/base/ArrayLock.h"
-#include "ui/DisplayWalk.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/DisplayWalk.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <optional>
 

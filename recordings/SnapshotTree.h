@@ -1,7 +1,7 @@
 #pragma once
 
 #include "recordings/Snapshot.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <map>
 #include <memory>

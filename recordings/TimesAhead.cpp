@@ -1,6 +1,6 @@
 #include "recordings/TimesAhead.h"
 
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfTime.h"
 #include "recordings/LogSlice.h"
 
 #include <algorithm>

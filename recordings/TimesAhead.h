@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
 #include "recordings/LogTime.h"
 
 #include <vector>

@@ -1,6 +1,6 @@
 #include "telephonyd/ReplaySource.h"
 
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfTime.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/LogMessage.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
 #include "platform/base/Bytes.h"
 #include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"

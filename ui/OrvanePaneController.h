@@ -1,8 +1,8 @@
 #pragma once
 
 #include "screens/toolkit/TableViewController.h"
-#include "ui/OrvaneModelNode.h"
 #include "ui/Shell.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <optional>
 #include <string>

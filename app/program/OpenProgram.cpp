@@ -1,13 +1,13 @@
 #include "app/program/OpenProgram.h"
 
+#include "app/RecordingApp.h"
 #include "app/program/PrintedOutput.h"
 #include "app/program/TerminalProgress.h"
 #include "platform/linux/LineReader.h"
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/SignalWatcher.h"
-#include "recordings/RecordingApp.h"
-#include "recordings/RecordingPrinter.h"
+#include "screens/print/RecordingPrinter.h"
 
 #include <chrono>
 #include <stdexcept>

@@ -1,9 +1,9 @@
 #include "app/CommandInterpreter.h"
+#include "app/PrintingPaneController.h"
 #include "app/program/FrontEnd.h"
 #include "app/program/PrintedOutput.h"
 #include "platform/linux/LineReader.h"
 #include "platform/linux/QtEventLoop.h"
-#include "screens/print/PrintingPaneController.h"
 
 #include <csignal>
 #include <optional>

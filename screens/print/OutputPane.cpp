@@ -31,10 +31,11 @@ void OutputPane::showNote(const std::string& text)
         _write(output);
 }
 
-void OutputPane::showSaved(const SnapshotResult& result)
+void OutputPane::showSaved(const std::string& path) { _write(savedOutput(path)); }
+
+void OutputPane::showAlert(const std::string& title, const std::string& message)
 {
-    _write(result.isWritten ? savedOutput(result.path)
-                            : alertOutput(kFileErrorTitle, kFileErrorMessage));
+    _write(alertOutput(title, message));
 }
 
 void OutputPane::showError(const std::string& text) { _write(errorOutput(text)); }

@@ -1,7 +1,6 @@
 #pragma once
 
-#include "ui/OrvaneModelNode.h"
-#include "ui/SnapshotFile.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <functional>
 #include <optional>
@@ -33,7 +32,9 @@ public:
 
     // What is said about the whole of what is printed, for people only.
     void showNote(const std::string& text);
-    void showSaved(const SnapshotResult& result);
+    // A snapshot was saved to this path.
+    void showSaved(const std::string& path);
+    void showAlert(const std::string& title, const std::string& message);
     void showError(const std::string& text);
 
 protected:

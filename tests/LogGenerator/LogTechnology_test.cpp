@@ -2,6 +2,7 @@
 
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
+#include "support/Paths.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>
@@ -36,7 +37,7 @@ TEST(LogTechnologyTest, TheCodesOfARecordingTellItsTechnology)
 
 TEST(LogTechnologyTest, ARealDriveIsRecognised)
 {
-    const auto file = readFile(ORVANE_TEST_DATA "/lte-drive.dlf");
+    const auto file = readFile(testDataPath("lte-drive.dlf"));
     ASSERT_TRUE(file);
     EXPECT_EQ(technologyOfLog(*file), kTSLogChannelTechnology_Varnel_LTE);
 }

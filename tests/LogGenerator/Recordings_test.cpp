@@ -1,13 +1,14 @@
 // Plays recordings through their generators. What is expected was decoded from the recordings by
 // other means than the sections.
 
-#include "LogGenerator/DlfReader.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "LogGenerator/support/SectionTest.h"
+#include "dlf/DlfReader.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/services/FileSystem.h"
+#include "support/Paths.h"
 
 #include <functional>
 
@@ -28,7 +29,7 @@ protected:
     void play(LogGenerator& generator, const std::string& name,
               const std::function<void(std::uint32_t code)>& afterItem)
     {
-        const Bytes file = readFile(std::string(ORVANE_TEST_DATA "/") + name).value_or(Bytes());
+        const Bytes file = readFile(testDataPath(name)).value_or(Bytes());
         DlfReader reader(file);
         while (const auto item = reader.next()) {
             Bytes message = {item->type};

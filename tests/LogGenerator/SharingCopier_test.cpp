@@ -1,4 +1,5 @@
 #include "LogGenerator/SharingCopier.h"
+
 #include "platform/base/PropertyValue.h"
 
 #include <gtest/gtest.h>

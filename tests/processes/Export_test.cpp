@@ -1,5 +1,6 @@
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
+#include "support/Paths.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -22,7 +23,7 @@ using ::testing::IsEmpty;
 using ::testing::SizeIs;
 using ::testing::StartsWith;
 
-constexpr const char* kDrive = ORVANE_TEST_DATA "/lte-drive.dlf";
+const std::string kDrive = testDataPath("lte-drive.dlf");
 constexpr const char* kLevel = "/Serving Cell Measurements/Measured RSRP";
 constexpr const char* kCell = "/Serving Cell Info/Physical Cell ID";
 

@@ -1,8 +1,9 @@
 // `orvane open FILE` as a user runs it.
 
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
+#include "support/Paths.h"
 #include "support/Sanitizers.h"
 #include "support/TemporaryDirectory.h"
 
@@ -24,7 +25,7 @@ using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::StartsWith;
 
-std::string recording(const std::string& name) { return ORVANE_TEST_DATA "/" + name; }
+std::string recording(const std::string& name) { return testDataPath(name); }
 
 std::unique_ptr<ChildProcess> orvane(std::vector<std::string> arguments)
 {

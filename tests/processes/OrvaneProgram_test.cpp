@@ -2,6 +2,7 @@
 #include "platform/plist/PropertyList.h"
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
+#include "support/Paths.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -62,7 +63,7 @@ protected:
     }
     [[nodiscard]] static std::string recording(const std::string& name)
     {
-        return std::string(ORVANE_TEST_DATA) + "/" + name;
+        return testDataPath(name);
     }
 
     TemporaryDirectory directory;

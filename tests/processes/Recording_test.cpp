@@ -1,7 +1,8 @@
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfWriter.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfWriter.h"
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
+#include "support/Paths.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -85,7 +86,7 @@ protected:
     [[nodiscard]] std::string root() const { return directory.path() + "/root"; }
     [[nodiscard]] Bytes recorded() const { return readFile(file).value_or(Bytes()); }
 
-    static constexpr const char* kDrive = ORVANE_TEST_DATA "/lte-drive.dlf";
+    const std::string kDrive = testDataPath("lte-drive.dlf");
     TemporaryDirectory directory;
     const std::string file = directory.path() + "/drive.dlf";
 };

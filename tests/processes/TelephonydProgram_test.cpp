@@ -1,5 +1,6 @@
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
+#include "support/Paths.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -60,7 +61,7 @@ protected:
     }
 
     TemporaryDirectory directory;
-    const std::string drive = std::string(ORVANE_TEST_DATA) + "/lte-drive.dlf";
+    const std::string drive = testDataPath("lte-drive.dlf");
 };
 
 constexpr const char* kRow = "\"name\":\"Physical Cell ID\"";

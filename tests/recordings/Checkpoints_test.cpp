@@ -1,5 +1,6 @@
-#include "platform/base/TelephonyConstants.h"
 #include "recordings/Checkpoints.h"
+
+#include "platform/base/TelephonyConstants.h"
 
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"

@@ -1,5 +1,6 @@
-#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogPlay.h"
+
+#include "platform/base/TelephonyConstants.h"
 
 #include "recordings/support/LiveView.h"
 #include "support/Recording.h"

@@ -1,15 +1,16 @@
-#include "platform/base/PropertyValue.h"
-#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogRecorder.h"
 
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfWriter.h"
+#include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
+
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
-#include "doubles/FakeScreen.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfWriter.h"
 #include "doubles/ManualMainQueue.h"
 #include "platform/services/FileSystem.h"
+#include "support/Paths.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 
@@ -87,8 +88,10 @@ protected:
     TestServices services;
     ManualMainQueue queue;
     MemoryFile::Content file;
+    std::vector<std::string> notices;
     std::unique_ptr<LogRecorder> recorder =
-        std::make_unique<LogRecorder>(queue, std::make_unique<MemoryFile>(file), "drive.dlf");
+        std::make_unique<LogRecorder>(queue, std::make_unique<MemoryFile>(file), "drive.dlf",
+                                      [this](const std::string& line) { notices.push_back(line); });
 };
 
 TEST_F(LogRecorderTest, ModemMessagesLoseTheirTypeByteAndStandEndToEnd)
@@ -180,19 +183,9 @@ TEST_F(LogRecorderTest, AFullDiskEndsTheRecordingWithOneLine)
     queue.advance(10s);
     EXPECT_EQ(file.bytes, item(kCode, 20));
     EXPECT_THAT(
-        services.console.lines,
+        notices,
         ElementsAre("Recording to \"drive.dlf\" has ended: No space left on device. What came "
                     "before is kept."));
-}
-
-TEST_F(LogRecorderTest, WhoWatchesAScreenIsToldThere)
-{
-    FakeScreen screen;
-    file.appendError = ENOSPC;
-    recorder->messageReceived(joined({{1}, item(kCode, 20)}));
-    ASSERT_TRUE(screen.alert());
-    EXPECT_EQ(screen.alert()->title(), "Recording");
-    EXPECT_EQ(screen.alert()->message(), services.console.lines.front());
 }
 
 TEST_F(LogRecorderTest, ADiskThatFailsLaterEndsTheRecordingToo)
@@ -201,7 +194,7 @@ TEST_F(LogRecorderTest, ADiskThatFailsLaterEndsTheRecordingToo)
     file.synchroniseError = EIO;
     queue.advance(999ms);
     EXPECT_FALSE(recorder->isRecording());
-    EXPECT_THAT(services.console.lines, ElementsAre(HasSubstr("Input/output error")));
+    EXPECT_THAT(notices, ElementsAre(HasSubstr("Input/output error")));
 }
 
 TEST_F(LogRecorderTest, ACellMonitorHasNothingToRecordAndThatIsSaidOnce)
@@ -210,9 +203,8 @@ TEST_F(LogRecorderTest, ACellMonitorHasNothingToRecordAndThatIsSaidOnce)
     recorder->channelOpened(kTSLogChannelTechnology_IFX);
     recorder->messageReceived(joined({{1}, item(kCode, 20)}));
     EXPECT_THAT(file.bytes, IsEmpty());
-    EXPECT_THAT(services.console.lines,
-                ElementsAre("Nothing to record to \"drive.dlf\": a cell monitor "
-                            "has no messages of a modem."));
+    EXPECT_THAT(notices, ElementsAre("Nothing to record to \"drive.dlf\": a cell monitor "
+                                     "has no messages of a modem."));
 }
 
 TEST_F(LogRecorderTest, AnotherTechnologyGoesOnInTheSameFile)
@@ -227,9 +219,11 @@ TEST_F(LogRecorderTest, AnotherTechnologyGoesOnInTheSameFile)
 class RecordedFileTest : public ::testing::Test
 {
 protected:
-    std::unique_ptr<LogRecorder> create()
+    std::unique_ptr<LogRecorder> create() { return create(DiskBlockFile::Existing::Refused); }
+    std::unique_ptr<LogRecorder> create(DiskBlockFile::Existing existing)
     {
-        return LogRecorder::create(queue, path, DiskBlockFile::Existing::Refused, error);
+        return LogRecorder::create(
+            queue, path, existing, [](const std::string&) {}, error);
     }
 
     TestServices services;
@@ -259,7 +253,7 @@ TEST_F(RecordedFileTest, AFileThatCannotBeMadeIsAnError)
 TEST_F(RecordedFileTest, ADiskThatIsFullFromTheStartIsAnError)
 {
     path = "/dev/full";
-    EXPECT_FALSE(LogRecorder::create(queue, path, DiskBlockFile::Existing::Overwritten, error));
+    EXPECT_FALSE(create(DiskBlockFile::Existing::Overwritten));
     EXPECT_THAT(error, HasSubstr("\"/dev/full\" cannot be written (No space left on device)"));
     EXPECT_TRUE(std::filesystem::exists("/dev/full"));
 }
@@ -298,8 +292,7 @@ class RecordedDriveTest : public RecordedFileTest, public ::testing::WithParamIn
 TEST_P(RecordedDriveTest, ReplaysToTheSameRows)
 {
     services.useShippedResources();
-    const auto messages =
-        messagesOf(readFile(ORVANE_TEST_DATA "/" + std::string(GetParam().file)).value());
+    const auto messages = messagesOf(readFile(testDataPath(GetParam().file)).value());
     auto recorder = create();
     ASSERT_TRUE(recorder) << error;
     recorder->channelOpened(GetParam().technology);

@@ -1,7 +1,8 @@
-#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogSurvey.h"
 
-#include "LogGenerator/VersionReport.h"
+#include "platform/base/TelephonyConstants.h"
+
+#include "dlf/VersionReport.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"
 

@@ -1,7 +1,8 @@
-#include "platform/base/TelephonyConstants.h"
 #include "recordings/LogTimeline.h"
 
-#include "recordings/FileWindow.h"
+#include "platform/base/TelephonyConstants.h"
+
+#include "dlf/FileWindow.h"
 #include "recordings/support/LiveView.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"

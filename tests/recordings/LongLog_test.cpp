@@ -1,8 +1,8 @@
 // A log of 100 MB: nothing may grow with it.
 
+#include "dlf/FileWindow.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/FileWindow.h"
 #include "recordings/LogTimeline.h"
 #include "recordings/RefreshPeriods.h"
 #include "recordings/support/LogFiles.h"

@@ -1,12 +1,14 @@
+#include "recordings/RecordingExport.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/RecordingExport.h"
 
 #include "platform/plist/PropertyList.h"
 #include "platform/services/FileSystem.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/support/LogFiles.h"
+#include "support/Paths.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 
@@ -120,7 +122,7 @@ TEST_F(RecordingExportTest, WithoutPathsEveryRowIsInEachLine)
 
 TEST_F(RecordingExportTest, UnitsAndPatternsOfAWholeDrive)
 {
-    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.file = testDataPath("lte-drive.dlf");
     request.paths = {"/Serving Cell Measurements/Measured RSRP",
                      "/Neighbor Cells List/*/Physical Cell ID"};
     EXPECT_EQ(runCsv(), "");
@@ -132,7 +134,7 @@ TEST_F(RecordingExportTest, UnitsAndPatternsOfAWholeDrive)
 
 TEST_F(RecordingExportTest, ADamagedDriveSaysHowManyBytesCouldNotBePlaced)
 {
-    request.file = ORVANE_TEST_DATA "/lte-drive-damaged.dlf";
+    request.file = testDataPath("lte-drive-damaged.dlf");
     request.paths = {kChannel};
     EXPECT_EQ(runCsv(), "");
     EXPECT_THAT(remarks, ElementsAre(HasSubstr("198 bytes could not be placed")));
@@ -140,7 +142,7 @@ TEST_F(RecordingExportTest, ADamagedDriveSaysHowManyBytesCouldNotBePlaced)
 
 TEST_F(RecordingExportTest, TheTechnologyIsFoundOrAsAsked)
 {
-    request.file = ORVANE_TEST_DATA "/utran-walk.dlf";
+    request.file = testDataPath("utran-walk.dlf");
     EXPECT_EQ(runJson(), "");
     EXPECT_THAT(written, HasSubstr("\"/RRC Info/State\":"));
     request.technology = kTSLogChannelTechnology_Varnel_LTE;
@@ -178,7 +180,7 @@ TEST_F(RecordingExportTest, WhereNoneOfThePathsOccursItFails)
 
 TEST_F(RecordingExportTest, ARecordingWithoutAnyRowSaysWhatItWasReadAs)
 {
-    request.file = ORVANE_TEST_DATA "/cdma-evening.dlf";
+    request.file = testDataPath("cdma-evening.dlf");
     request.technology = kTSLogChannelTechnology_Varnel_LTE;
     EXPECT_EQ(runCsv(), "");
     EXPECT_THAT(remarks, ElementsAre(HasSubstr(
@@ -203,7 +205,7 @@ TEST_F(RecordingExportTest, LookingForTheTechnologyTellsItsProgressAndCanBeGiven
 TEST_F(RecordingExportTest, AnImpossibleTimeIsToldAndLeavesThePeriodsAsTheyAre)
 {
     const Bytes drive = recordedFile("lte-drive.dlf");
-    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.file = testDataPath("lte-drive.dlf");
     runJson();
     const auto lines = std::count(written.begin(), written.end(), '\n');
     request.file = directory.path() + "/wild.dlf";
@@ -225,7 +227,7 @@ TEST_F(RecordingExportTest, AnImpossibleTimeIsToldAndLeavesThePeriodsAsTheyAre)
 
 TEST_F(RecordingExportTest, StopsOnceNobodyReads)
 {
-    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.file = testDataPath("lte-drive.dlf");
     linesWanted = 3;
     EXPECT_EQ(runJson(), "");
     EXPECT_EQ(std::count(written.begin(), written.end(), '\n'), 3);
@@ -234,7 +236,7 @@ TEST_F(RecordingExportTest, StopsOnceNobodyReads)
 
 TEST_F(RecordingExportTest, GivesUpWhereItIsAskedTo)
 {
-    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.file = testDataPath("lte-drive.dlf");
     request.technology = kTSLogChannelTechnology_Varnel_LTE; // not looked for in slices of its own
     slicesWanted = 3;
     EXPECT_EQ(runCsv(), "");
@@ -246,7 +248,7 @@ TEST_F(RecordingExportTest, GivesUpWhereItIsAskedTo)
 
 TEST_F(RecordingExportTest, TellsItsProgress)
 {
-    request.file = ORVANE_TEST_DATA "/lte-drive.dlf";
+    request.file = testDataPath("lte-drive.dlf");
     EXPECT_EQ(runCsv(), "");
     ASSERT_GT(progress.size(), 10U);
     EXPECT_TRUE(std::is_sorted(progress.begin(), progress.end()));

@@ -1,7 +1,8 @@
-#include "platform/base/PropertyValue.h"
 #include "recordings/RowPath.h"
 
-#include "ui/OrvaneModelNode.h"
+#include "platform/base/PropertyValue.h"
+
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "recordings/RowTable.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "recordings/SnapshotTree.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "recordings/support/LogFiles.h"
 

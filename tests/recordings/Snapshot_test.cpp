@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "recordings/Snapshot.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/LogTechnology.h"

@@ -1,4 +1,5 @@
 #include "support/Recording.h"
+#include "support/Paths.h"
 
 namespace orvane
 {
@@ -23,7 +24,7 @@ void MemoryResources::put(const std::string& fileName, std::string_view text)
     _files[fileName] = Bytes(text.begin(), text.end());
 }
 
-TestServices::TestServices() : shippedResources(ORVANE_RESOURCES)
+TestServices::TestServices() : shippedResources(shippedResourcesPath())
 {
     Services& services = Services::current();
     services.setLog(&log);

@@ -1,5 +1,6 @@
-#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/DaemonOptions.h"
+
+#include "platform/base/TelephonyConstants.h"
 
 #include <gmock/gmock.h>
 

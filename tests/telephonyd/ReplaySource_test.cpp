@@ -1,6 +1,6 @@
 #include "telephonyd/ReplaySource.h"
 
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfTime.h"
 #include "doubles/ManualMainQueue.h"
 
 #include <gmock/gmock.h>

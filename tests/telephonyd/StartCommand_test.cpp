@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "telephonyd/StartCommand.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "support/Recording.h"
 

@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "ui/OrvanePaneController.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "doubles/FakeScreen.h"
 #include "screens/toolkit/ActivityIndicator.h"

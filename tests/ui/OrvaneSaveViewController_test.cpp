@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "ui/OrvaneSaveViewController.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "doubles/FakeScreen.h"
 #include "platform/plist/PropertyList.h"

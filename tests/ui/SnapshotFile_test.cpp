@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "ui/SnapshotFile.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "platform/plist/PropertyList.h"
 #include "support/Recording.h"

@@ -4,6 +4,7 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
+#include "support/Paths.h"
 
 namespace orvane
 {
@@ -202,7 +203,7 @@ TEST(C2KRecordingTest, AnEveningIsShownThroughTheShippedTemplate)
 {
     TestServices services;
     services.useShippedResources();
-    const auto file = readFile(std::string(ORVANE_TEST_DATA) + "/cdma-evening.dlf");
+    const auto file = readFile(testDataPath("cdma-evening.dlf"));
     ASSERT_TRUE(file);
     C2KLogGenerator generator;
     generator.init();

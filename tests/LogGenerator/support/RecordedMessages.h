@@ -1,6 +1,7 @@
 #pragma once
 
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
+#include "support/Paths.h"
 
 #include <fstream>
 #include <iterator>
@@ -13,7 +14,7 @@ namespace orvane
 // The items of a recording among the tests' data as the messages that they came in, in file order.
 inline std::vector<Bytes> recordedMessages(const std::string& fileName)
 {
-    std::ifstream file(std::string(ORVANE_TEST_DATA) + "/" + fileName, std::ios::binary);
+    std::ifstream file(testDataPath(fileName), std::ios::binary);
     const std::vector<char> content{std::istreambuf_iterator<char>(file), {}};
     const Bytes bytes(content.begin(), content.end());
     std::vector<Bytes> messages;

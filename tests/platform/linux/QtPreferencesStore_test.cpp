@@ -1,5 +1,6 @@
-#include "platform/base/PropertyValue.h"
 #include "platform/linux/QtPreferencesStore.h"
+
+#include "platform/base/PropertyValue.h"
 
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"

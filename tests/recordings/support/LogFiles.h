@@ -3,6 +3,7 @@
 #include "LogGenerator/LogTechnology.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
+#include "support/Paths.h"
 
 #include <cstdint>
 #include <memory>
@@ -28,7 +29,7 @@ inline constexpr RecordedDrive kDrives[] = {
 
 inline Bytes recordedFile(const std::string& name)
 {
-    return readFile(ORVANE_TEST_DATA "/" + name).value_or(Bytes());
+    return readFile(testDataPath(name)).value_or(Bytes());
 }
 
 // A log in memory that owns its bytes.

@@ -105,8 +105,8 @@ TEST_F(JsonPaneTest, EveryObjectOfASimulatedPhoneSaysSo)
 {
     JsonPane pane = make(true);
     pane.setStatus("Connecting", true);
-    pane.showSaved({true, "/root/a.orvane"});
-    pane.showSaved({false, "/root/a.orvane"});
+    pane.showSaved("/root/a.orvane");
+    pane.showAlert("File Error", "Unable to write file to disk");
     pane.showError("no");
     EXPECT_EQ(output,
               "{\"status\":\"Connecting\",\"loading\":true,\"tree\":null,\"simulated\":true}\n"
@@ -163,8 +163,8 @@ TEST_F(TextPaneTest, MarksTheStatusOfASimulatedPhone)
 TEST_F(TextPaneTest, AnswersInWords)
 {
     TextPane pane = make();
-    pane.showSaved({true, "/root/a.orvane"});
-    pane.showSaved({false, "/root/a.orvane"});
+    pane.showSaved("/root/a.orvane");
+    pane.showAlert("File Error", "Unable to write file to disk");
     pane.showError("unknown command \"x\"");
     EXPECT_EQ(output, "Saved to /root/a.orvane\n\n"
                       "File Error: Unable to write file to disk\n\n"

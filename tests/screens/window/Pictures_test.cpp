@@ -1,10 +1,11 @@
-#include "LogGenerator/DlfReader.h"
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfReader.h"
+#include "dlf/DlfTime.h"
 #include "doubles/FakePlayback.h"
 #include "screens/window/DesktopColours.h"
 #include "screens/window/SheetWidget.h"
 #include "screens/window/ToolbarWidget.h"
 #include "screens/window/WindowedApplication.h"
+#include "support/Paths.h"
 
 #include <QLineEdit>
 #include <QTest>
@@ -47,7 +48,7 @@ protected:
     void drive(double seconds = 60)
     {
         launch();
-        const auto file = readFile(std::string(ORVANE_TEST_DATA) + "/lte-drive.dlf");
+        const auto file = readFile(testDataPath("lte-drive.dlf"));
         ASSERT_TRUE(file);
         DlfReader reader(*file);
         double start = 0;

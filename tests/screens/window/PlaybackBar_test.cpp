@@ -1,5 +1,6 @@
-#include "doubles/FakePlayback.h"
 #include "screens/window/PlaybackBar.h"
+
+#include "doubles/FakePlayback.h"
 
 #include "screens/window/FlatButton.h"
 #include "screens/window/TextLine.h"

@@ -1,5 +1,6 @@
-#include "platform/base/TelephonyConstants.h"
 #include "telephonyd/phone/CDMAScenario.h"
+
+#include "platform/base/TelephonyConstants.h"
 
 #include "telephonyd/phone/CDMATown.h"
 #include "telephonyd/support/PhoneTour.h"

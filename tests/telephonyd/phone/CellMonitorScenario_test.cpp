@@ -1,6 +1,7 @@
+#include "telephonyd/phone/CellMonitorScenario.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "telephonyd/phone/CellMonitorScenario.h"
 
 #include "telephonyd/support/PhoneTour.h"
 

@@ -1,6 +1,7 @@
+#include "telephonyd/phone/LTEScenario.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "telephonyd/phone/LTEScenario.h"
 
 #include "platform/plist/PropertyList.h"
 #include "telephonyd/phone/ServerItems.h"

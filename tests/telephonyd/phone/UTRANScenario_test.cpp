@@ -1,6 +1,7 @@
+#include "telephonyd/phone/UTRANScenario.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "telephonyd/phone/UTRANScenario.h"
 
 #include "telephonyd/phone/ServerItems.h"
 #include "telephonyd/phone/UTRANTown.h"

@@ -1,4 +1,4 @@
-#include "recordings/ServingCell.h"
+#include "insight/ServingCell.h"
 
 #include "platform/base/TelephonyConstants.h"
 

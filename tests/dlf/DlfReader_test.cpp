@@ -1,7 +1,8 @@
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
 
-#include "LogGenerator/DlfTime.h"
-#include "LogGenerator/DlfWriter.h"
+#include "dlf/DlfTime.h"
+#include "dlf/DlfWriter.h"
+#include "support/Paths.h"
 
 #include <gtest/gtest.h>
 
@@ -94,7 +95,7 @@ Bytes exported(const std::vector<std::vector<Bytes>>& snapshots)
 
 Bytes recording(const std::string& name)
 {
-    std::ifstream file(std::string(ORVANE_TEST_DATA) + "/" + name, std::ios::binary);
+    std::ifstream file(testDataPath(name), std::ios::binary);
     const std::vector<char> content{std::istreambuf_iterator<char>(file), {}};
     return {content.begin(), content.end()};
 }

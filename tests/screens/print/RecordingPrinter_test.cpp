@@ -1,6 +1,7 @@
+#include "screens/print/RecordingPrinter.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/RecordingPrinter.h"
 
 #include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"

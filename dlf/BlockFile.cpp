@@ -1,4 +1,4 @@
-#include "recordings/BlockFile.h"
+#include "dlf/BlockFile.h"
 
 #include <cerrno>
 #include <cstring>

@@ -1,6 +1,6 @@
-#include "LogGenerator/DlfReader.h"
+#include "dlf/DlfReader.h"
 
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfTime.h"
 #include "platform/base/PacketView.h"
 
 #include <algorithm>

@@ -1,5 +1,6 @@
+#include "app/RecordingPlayer.h"
+
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/RecordingPlayer.h"
 
 #include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/DlfTime.h"
+#include "dlf/DlfTime.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "recordings/BlockFile.h"
+#include "dlf/BlockFile.h"
 
 #include "platform/services/FileSystem.h"
 #include "support/TemporaryDirectory.h"

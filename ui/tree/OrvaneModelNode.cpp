@@ -1,7 +1,7 @@
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include "platform/base/ArrayLock.h"
-#include "ui/DisplayWalk.h"
+#include "ui/tree/DisplayWalk.h"
 
 #include <algorithm>
 #include <optional>

@@ -1,4 +1,4 @@
-#include "recordings/FileWindow.h"
+#include "dlf/FileWindow.h"
 
 #include "platform/services/FileSystem.h"
 #include "support/TemporaryDirectory.h"

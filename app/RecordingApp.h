@@ -1,7 +1,7 @@
 #pragma once
 
+#include "app/RecordingPlayer.h"
 #include "recordings/OpenedRecording.h"
-#include "recordings/RecordingPlayer.h"
 #include "recordings/SnapshotTree.h"
 #include "screens/toolkit/NavigationController.h"
 #include "screens/toolkit/Window.h"

@@ -1,6 +1,6 @@
-#include "LogGenerator/VersionReport.h"
+#include "dlf/VersionReport.h"
 
-#include "LogGenerator/DlfWriter.h"
+#include "dlf/DlfWriter.h"
 #include "platform/services/Services.h"
 
 #include <string>

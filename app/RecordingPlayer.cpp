@@ -1,4 +1,4 @@
-#include "recordings/RecordingPlayer.h"
+#include "app/RecordingPlayer.h"
 
 #include "recordings/TypedTime.h"
 

@@ -1,6 +1,7 @@
+#include "insight/ServingCell.h"
+
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/ServingCell.h"
 
 #include "recordings/LogPlay.h"
 #include "recordings/support/LogFiles.h"

@@ -4,7 +4,7 @@
 #include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"
 #include "screens/toolkit/Playback.h"
-#include "ui/OrvaneModelNode.h"
+#include "ui/tree/OrvaneModelNode.h"
 
 #include <chrono>
 #include <functional>

@@ -1,5 +1,6 @@
+#include "app/RecordingApp.h"
+
 #include "platform/base/PropertyValue.h"
-#include "recordings/RecordingApp.h"
 
 #include "doubles/FakeScreen.h"
 #include "doubles/ManualMainQueue.h"

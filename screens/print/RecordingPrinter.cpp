@@ -1,4 +1,4 @@
-#include "recordings/RecordingPrinter.h"
+#include "screens/print/RecordingPrinter.h"
 
 #include "platform/base/PropertyValue.h"
 

@@ -1,5 +1,6 @@
+#include "ui/tree/OrvaneModelNode.h"
+
 #include "platform/base/PropertyValue.h"
-#include "ui/OrvaneModelNode.h"
 
 #include "platform/base/ArrayLock.h"
 

@@ -1,4 +1,4 @@
-#include "LogGenerator/DlfWriter.h"
+#include "dlf/DlfWriter.h"
 
 #include <algorithm>
 #include <cstddef>

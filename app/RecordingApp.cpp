@@ -1,4 +1,4 @@
-#include "recordings/RecordingApp.h"
+#include "app/RecordingApp.h"
 
 #include "screens/toolkit/Screen.h"
 #include "ui/PaneStack.h"

@@ -1,4 +1,4 @@
-#include "ui/DisplayWalk.h"
+#include "ui/tree/DisplayWalk.h"
 
 namespace orvane
 {

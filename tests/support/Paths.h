@@ -1,0 +1,13 @@
+#pragma once
+
+#include <string>
+
+namespace orvane
+{
+
+// The path of a file below tests/data.
+std::string testDataPath(const std::string& fileName);
+// The folder of the resources that the program ships.
+std::string shippedResourcesPath();
+
+} // namespace orvane
