@@ -42,10 +42,7 @@ RecordingPlayer::RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<Byte
 
 void RecordingPlayer::readLater()
 {
-    _queue.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            read();
-    });
+    _queue.async(_lifetime.whileAlive([this] { read(); }));
 }
 
 void RecordingPlayer::read()

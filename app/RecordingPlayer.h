@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 #include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"
@@ -81,7 +82,7 @@ private:
     std::unique_ptr<Timer> _timer; // while playing
     std::size_t _speed = 0;        // index
     std::chrono::nanoseconds _playedTo{0};
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 } // namespace orvane

@@ -86,13 +86,11 @@ void LogRecorder::synchroniseSoon()
 {
     if (!_file || std::exchange(_isSynchronisationQueued, true))
         return;
-    _queue.after(kSynchronisation, [this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _queue.after(kSynchronisation, _lifetime.whileAlive([this] {
         _isSynchronisationQueued = false;
         if (_file)
             endIfFailed(_file->synchronise());
-    });
+    }));
 }
 
 void LogRecorder::endIfFailed(int error)

@@ -4,6 +4,7 @@
 #include "dlf/BlockFile.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 
 #include <chrono>
@@ -58,7 +59,7 @@ private:
     bool _hasSaidThatNothingComes = false;
     bool _isSynchronisationQueued = false;
     Bytes _item; // kept for its memory
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 } // namespace orvane

@@ -133,19 +133,19 @@ std::int32_t LogServer::openChannel(ClientId client, const std::string& clientPo
 // Afterwards, since the channel, and maybe its source, is still at work.
 void LogServer::channelEnded(ChannelNumber number)
 {
-    whileAlive(0ms, [this, number] {
+    _queue.async(_lifetime.whileAlive([this, number] {
         const auto found = _channels.find(number);
         if (found == _channels.end())
             return;
         logLine(LogPriority::Info, "%s is closed", found->second->name().c_str());
         _channels.erase(found);
-    });
+    }));
 }
 
 // Once the first messages are on their way the client may as well show them.
 void LogServer::channelStarted(ClientId client)
 {
-    whileAlive(kNotificationDelay, [this, client] { notify(client); });
+    _queue.after(kNotificationDelay, _lifetime.whileAlive([this, client] { notify(client); }));
 }
 
 void LogServer::notify(ClientId client)
@@ -157,15 +157,6 @@ void LogServer::notify(ClientId client)
                         xmlBytes(PropertyValue::dictionaryOf({
                             {kNotificationNameKey, kChannelStreamingNotification}
     })));
-}
-
-template <typename Task>
-void LogServer::whileAlive(std::chrono::nanoseconds delay, Task task)
-{
-    _queue.after(delay, [alive = std::weak_ptr(_alive), task] {
-        if (!alive.expired())
-            task();
-    });
 }
 
 } // namespace orvane

@@ -2,6 +2,7 @@
 
 #include "platform/base/Bytes.h"
 #include "platform/ports/FrameConnection.h"
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 
@@ -56,8 +57,6 @@ private:
     void channelEnded(ChannelNumber number);
     void channelStarted(ClientId client);
     void notify(ClientId client);
-    template <typename Task>
-    void whileAlive(std::chrono::nanoseconds delay, Task task);
 
     FrameTransport& _transport;
     MainQueue& _queue;
@@ -67,7 +66,7 @@ private:
     std::map<ChannelNumber, std::unique_ptr<LogChannel>> _channels;
     ClientId _lastClient = 0;
     ChannelNumber _lastChannel = 0;
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 } // namespace orvane

@@ -42,10 +42,7 @@ void ReplaySource::resume()
 
 void ReplaySource::playAfter(nanoseconds delay)
 {
-    _queue.after(delay, [this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            play();
-    });
+    _queue.after(delay, _lifetime.whileAlive([this] { play(); }));
 }
 
 void ReplaySource::play()

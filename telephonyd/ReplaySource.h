@@ -2,6 +2,7 @@
 
 #include "dlf/DlfReader.h"
 #include "platform/base/Bytes.h"
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 #include "telephonyd/phone/LogSource.h"
 
@@ -67,7 +68,7 @@ private:
     bool _hasSentInRound = false;
     bool _waitsForClient = false;
     Bytes _message; // kept for its memory
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 } // namespace orvane

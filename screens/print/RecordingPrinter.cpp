@@ -22,10 +22,7 @@ RecordingPrinter::RecordingPrinter(MainQueue& queue, OpenedRecording recording,
 
 void RecordingPrinter::goOnLater()
 {
-    _queue.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            goOn();
-    });
+    _queue.async(_lifetime.whileAlive([this] { goOn(); }));
 }
 
 void RecordingPrinter::goOn()

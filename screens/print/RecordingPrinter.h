@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/base/PropertyValue.h"
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 #include "recordings/LogSurvey.h"
 #include "recordings/OpenedRecording.h"
@@ -57,7 +58,7 @@ private:
     std::size_t _entriesPrinted = 0;
     bool _hasEnded = false;
     std::optional<std::string> _failure;
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 } // namespace orvane

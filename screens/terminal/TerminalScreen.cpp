@@ -70,12 +70,10 @@ void TerminalScreen::setNeedsUpdate()
     if (_isUpdating || _isUpdateQueued)
         return;
     _isUpdateQueued = true;
-    _queue.async([this, life = std::weak_ptr(_life)] {
-        if (life.expired())
-            return;
+    _queue.async(_lifetime.whileAlive([this] {
         _isUpdateQueued = false;
         update();
-    });
+    }));
 }
 
 void TerminalScreen::update()
@@ -164,12 +162,12 @@ void TerminalScreen::markForAMoment()
     if (_changesMarked == changes)
         return;
     _changesMarked = changes;
-    _queue.after(kMarkTime, [this, changes, life = std::weak_ptr(_life)] {
-        if (life.expired() || _changesMarked != changes)
+    _queue.after(kMarkTime, _lifetime.whileAlive([this, changes] {
+        if (_changesMarked != changes)
             return;
         _stack.forgetChanges();
         setNeedsUpdate();
-    });
+    }));
 }
 
 void TerminalScreen::turnIndicator()

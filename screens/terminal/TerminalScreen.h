@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
 #include "screens/terminal/Page.h"
 #include "screens/terminal/SaveForm.h"
@@ -75,7 +76,7 @@ private:
     int _turn = 0;
     std::unique_ptr<Timer> _indicatorTimer;
     std::size_t _changesMarked = 0;
-    std::shared_ptr<bool> _life = std::make_shared<bool>(true); // for tasks that come later
+    Lifetime _lifetime;
 };
 
 } // namespace orvane
