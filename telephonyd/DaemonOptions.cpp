@@ -3,6 +3,7 @@
 #include "LogGenerator/LogTechnology.h"
 #include "LogGenerator/TechnologyOption.h"
 #include "platform/base/CommandLine.h"
+#include "platform/base/TelephonyConstants.h"
 #include "platform/services/LogOption.h"
 
 #include <algorithm>
@@ -20,6 +21,7 @@ constexpr CommandLineOption kOptions[] = {
     {"version",       Value::None    },
     {"demo",          Value::Optional},
     {"replay",        Value::Required},
+    {"messages",      Value::Optional},
     {"technology",    Value::Required},
     {"speed",         Value::Required},
     {"loop",          Value::None    },
@@ -41,6 +43,14 @@ std::string joined(std::span<const std::string> names)
     return text;
 }
 
+void refuseReplayOptions(CommandLine& line)
+{
+    for (const char* name : {"technology", "speed", "loop"})
+        if (line.has(name))
+            line.fail(std::string("--") + name +
+                      " is for a recording: use it with --replay FILE, or leave it out");
+}
+
 void takeDemo(DaemonOptions& options, CommandLine& line, std::span<const std::string> scenarios)
 {
     const std::string scenario = line.value("demo").value_or("");
@@ -48,10 +58,17 @@ void takeDemo(DaemonOptions& options, CommandLine& line, std::span<const std::st
     if (std::find(scenarios.begin(), scenarios.end(), *options.demo) == scenarios.end())
         line.fail("there is no simulated phone \"" + *options.demo + "\": --demo takes " +
                   joined(scenarios));
-    for (const char* name : {"technology", "speed", "loop"})
-        if (line.has(name))
-            line.fail(std::string("--") + name +
-                      " is for a recording: use it with --replay FILE, or leave it out");
+    refuseReplayOptions(line);
+}
+
+void takeMessages(DaemonOptions& options, CommandLine& line)
+{
+    const std::string name = line.value("messages").value_or("");
+    options.messages = technologyNamed(name.empty() ? kDefaultScenario : name);
+    // The cell monitor's messages are property lists without log codes.
+    if (!options.messages || *options.messages == kTSLogChannelTechnology_IFX)
+        line.fail("--messages takes lte, umts, utran or cdma, not \"" + name + "\"");
+    refuseReplayOptions(line);
 }
 
 void takeReplay(DaemonOptions& options, CommandLine& line)
@@ -85,12 +102,16 @@ DaemonOptions parseDaemonOptions(std::span<const std::string> arguments,
         if (!line.words().empty())
             line.fail("\"" + line.words().front() +
                       "\" is no option: give a recording as --replay FILE");
-        if (line.has("demo") == line.has("replay"))
-            line.fail(line.has("demo") ? "--demo and --replay exclude each other: give one of them"
-                                       : "give --demo=SCENARIO or --replay FILE: there is nothing "
-                                         "to serve otherwise");
+        const int given = line.has("demo") + line.has("replay") + line.has("messages");
+        if (given != 1)
+            line.fail(given != 0
+                          ? "--demo, --replay and --messages exclude each other: give one of them"
+                          : "give --demo=SCENARIO, --replay FILE or --messages=NAME: there is "
+                            "nothing to serve otherwise");
         else if (line.has("demo"))
             takeDemo(options, line, scenarios);
+        else if (line.has("messages"))
+            takeMessages(options, line);
         else
             takeReplay(options, line);
         options.ports = line.value("ports").value_or("");
@@ -106,12 +127,17 @@ std::string daemonHelp(std::span<const std::string> scenarios)
 {
     return "Usage: telephonyd --demo=SCENARIO [OPTION...]\n"
            "       telephonyd --replay FILE [OPTION...]\n"
+           "       telephonyd --messages=NAME [OPTION...]\n"
            "A telephony server for machines without one.\n"
            "\n"
            "  --demo[=SCENARIO]         serve a simulated phone: " +
            joined(scenarios) +
            " (default lte)\n"
            "  --replay FILE             serve a recorded diagnostic log (.dlf)\n"
+           "  --messages[=NAME]         serve messages typed on standard input, one a line: a log\n"
+           "                            code and the bytes behind the message's header, such as\n"
+           "                            0xB0C2 01 DD 00 9C 18; NAME is lte, umts, utran or cdma\n"
+           "                            (default lte)\n"
            "  --technology NAME         what was recorded: " +
            technologyNames() +
            "\n"

@@ -14,9 +14,10 @@ namespace orvane
 struct DaemonOptions {
     bool wantsHelp = false;
     bool wantsVersion = false;
-    // Exactly one of the two is given.
-    std::optional<std::string> demo;   // the scenario of a simulated phone
-    std::optional<std::string> replay; // the recording to be sent again
+    // Exactly one of the three is given.
+    std::optional<std::string> demo;     // the scenario of a simulated phone
+    std::optional<std::string> replay;   // the recording to be sent again
+    std::optional<std::string> messages; // the technology constant of the messages that are typed
 
     // For a recording.
     std::optional<std::string> technology; // the constant; nothing = by the recording's log codes

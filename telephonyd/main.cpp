@@ -1,5 +1,6 @@
 #include "LogGenerator/LogTechnology.h"
 #include "platform/base/Bytes.h"
+#include "platform/linux/LineReader.h"
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtFrameTransport.h"
@@ -12,12 +13,14 @@
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/ReplaySource.h"
+#include "telephonyd/TypedMessages.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <chrono>
 #include <cstdio>
 #include <exception>
 #include <filesystem>
+#include <unistd.h>
 
 using namespace orvane;
 
@@ -69,8 +72,16 @@ int serve(const DaemonOptions& options)
     QtEventLoop loop;
     QtMainQueue queue;
     QtFrameTransport transport(directory->path());
-    LogSourceFactory factory =
-        options.demo ? phoneSourceFactory(*options.demo, queue) : replayFactory(options, queue);
+    std::unique_ptr<TypedMessages> messages;
+    std::unique_ptr<LineReader> reader;
+    LogSourceFactory factory;
+    if (options.messages) {
+        messages = std::make_unique<TypedMessages>(*options.messages, queue, complain);
+        factory = messages->sources();
+    } else {
+        factory =
+            options.demo ? phoneSourceFactory(*options.demo, queue) : replayFactory(options, queue);
+    }
     if (!factory)
         return kFailure;
     LogServer server(transport, queue, std::move(factory));
@@ -78,6 +89,15 @@ int serve(const DaemonOptions& options)
         complain(*failure);
         return kFailure;
     }
+    // Begun after the server, so that a wrong line does not hide why there is none.
+    if (messages)
+        reader = std::make_unique<LineReader>(
+            STDIN_FILENO, [&messages](std::string_view line, bool wasCut) {
+                if (wasCut)
+                    complain("a line is too long: a message of at most 32,000 bytes fits into one");
+                else
+                    messages->take(line);
+            });
     const SignalWatcher signals([&loop](int) { loop.quit(); });
     logLine(LogPriority::Notice, "Serving in %s", directory->path().c_str());
     return loop.run();

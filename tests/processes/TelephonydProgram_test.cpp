@@ -91,6 +91,21 @@ TEST_F(TelephonydProgramTest, SignalsEndItInOrderAndRemoveItsPort)
     }
 }
 
+TEST_F(TelephonydProgramTest, ATypedMessageIsOnTheScreen)
+{
+    const auto server = servingTelephonyd({"--messages=lte"});
+    server->writeLine("0xB0C2 this is not a message");
+    EXPECT_TRUE(
+        server->waitForError("telephonyd: a byte is two hexadecimal digits, not \"this\"\n"));
+    server->writeLine(
+        "0xB0C2 01 DD 00 9C 18 EC 5E 32 32 01 01 1B 00 06 10 14 00 00 00 00 00 00 00 00 00");
+    server->closeInput(); // ends nothing
+    const auto client = viewer();
+    EXPECT_TRUE(client->waitForText(R"({"name":"Physical Cell ID","value":"221"})"));
+    server->sendSignal(SIGTERM);
+    EXPECT_EQ(server->waitForEnd(), 0);
+}
+
 TEST_F(TelephonydProgramTest, UnusableArgumentsEndItWithStatusTwo)
 {
     expectRefusal({}, 2);

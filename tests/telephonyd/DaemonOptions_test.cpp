@@ -48,15 +48,28 @@ TEST(DaemonOptionsTest, ARecordingIsSentAtItsOwnPaceOnceUnlessSaid)
     EXPECT_EQ(parsed({"--replay=a.dlf", "--speed=1000"}).speed, 1000.0);
 }
 
+TEST(DaemonOptionsTest, TypedMessagesAreOfLteUnlessNamed)
+{
+    EXPECT_EQ(parsed({"--messages"}).messages, kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(parsed({"--messages=cdma"}).messages, kTSLogChannelTechnology_Varnel_CDMA);
+    EXPECT_FALSE(parsed({"--messages"}).error);
+    EXPECT_FALSE(parsed({"--messages"}).demo);
+}
+
 TEST(DaemonOptionsTest, MistakesAreNamedWithWhatToDo)
 {
     const struct {
         std::vector<std::string> arguments;
         const char* error;
     } cases[] = {
-        {{},                                 "give --demo=SCENARIO or --replay FILE"                    },
+        {{},                                 "give --demo=SCENARIO, --replay FILE or --messages=NAME"   },
         {{"--demo", "--replay=x"},           "exclude each other: give one"                             },
         {{"--demo=nope"},                    "--demo takes lte, other"                                  },
+        {{"--demo", "--messages"},           "exclude each other: give one"                             },
+        {{"--messages", "--replay=x"},       "exclude each other: give one"                             },
+        {{"--messages=gsm"},                 "--messages takes lte, umts, utran or cdma, not \"gsm\""   },
+        {{"--messages=cellmonitor"},         "--messages takes lte"                                     },
+        {{"--messages", "--loop"},           "--loop is for a recording"                                },
         {{"--demo", "--loop"},               "--loop is for a recording"                                },
         {{"--demo", "--speed=1"},            "--speed is for a recording"                               },
         {{"--demo", "--technology=lte"},     "--technology is for a recording"                          },
@@ -82,8 +95,8 @@ TEST(DaemonOptionsTest, HelpAndVersionNeedNothingElse)
     EXPECT_TRUE(parsed({"--version"}).wantsVersion);
     EXPECT_FALSE(parsed({"--version"}).error);
     const std::vector<std::string> scenarios = {"lte", "other"};
-    for (const char* option : {"--demo", "--replay", "--technology", "--speed", "--loop", "--ports",
-                               "--log ", "--log-level", "lte, other"})
+    for (const char* option : {"--demo", "--replay", "--messages", "--technology", "--speed",
+                               "--loop", "--ports", "--log ", "--log-level", "lte, other"})
         EXPECT_THAT(daemonHelp(scenarios), HasSubstr(option));
 }
 
