@@ -1,5 +1,6 @@
 #include "telephonyd/TypedMessages.h"
 
+#include "platform/services/Lifetime.h"
 #include "platform/services/Services.h"
 #include "telephonyd/phone/PacketWriter.h"
 #include "telephonyd/phone/PhoneSource.h"
@@ -167,10 +168,7 @@ public:
         _selection = selection;
         _send = std::move(send);
         if (const auto shared = _shared.lock())
-            shared->queue.async([this, alive = std::weak_ptr(_alive)] {
-                if (!alive.expired())
-                    sendKept();
-            });
+            shared->queue.async(_lifetime.whileAlive([this] { sendKept(); }));
     }
 
     // Returns whether the channel asks for the message's code.
@@ -201,7 +199,7 @@ private:
     std::weak_ptr<Shared> _shared;
     LogSelection _selection;
     Send _send;
-    std::shared_ptr<const bool> _alive = std::make_shared<const bool>(true);
+    Lifetime _lifetime;
 };
 
 TypedMessages::TypedMessages(std::string technology, MainQueue& queue, Tell tell)
