@@ -5,7 +5,7 @@ unset CMAKE_CXX_COMPILER_LAUNCHER
 copy=$scratch/copy
 program=$copy/build/release/bin/orvane
 
-# A tree with ./run and a stand-in for CMake, whose build makes a program that tells how it was
+# A tree with ./run and a stand-in for CMake. Its build makes a program that prints how it was
 # started.
 make_copy() {
     rm -rf "$copy" "$scratch/bin" "$scratch/calls"
@@ -35,6 +35,8 @@ if [ "$1" = --preset ]; then
 fi
 [ "${BUILD_STATUS:-0}" = 0 ] || exit "$BUILD_STATUS"
 mkdir -p "$2/bin"
+touch "$2/bin/telephonyd"
+chmod +x "$2/bin/telephonyd"
 cat >"$2/bin/orvane" <<'PROGRAM'
 #!/bin/bash
 echo "pid $$ in $PWD:"
@@ -67,7 +69,7 @@ start
 expect_equal "$output" "pid $pid in $scratch:"$'\n<--demo>\nread a line'
 expect_equal "$status" 7
 expect_contains "$calls" "cmake --preset release"
-expect_contains "$calls" "cmake --build $copy/build/release --target orvane"
+expect_contains "$calls" "cmake --build $copy/build/release --target orvane telephonyd"
 expect_lacks "$calls" "apt-get"
 expect_contains "$errors" "Building Orvane"
 expect_contains "$errors" "what CMake says"
@@ -94,6 +96,7 @@ expect_build "a new source" touch "$copy/app/Other.cpp"
 expect_build "a removed source" rm "$copy/app/Other.cpp"
 expect_build "a changed build description" touch "$copy/cmake/Layers.cmake"
 expect_build "the loss of the program" rm "$program"
+expect_build "the loss of the server" rm "$copy/build/release/bin/telephonyd"
 
 case_named "changed presets are configured anew, other changes not"
 find "$copy" -exec touch -d '1 hour ago' {} +
