@@ -71,6 +71,7 @@ public:
     // The generator's save contents; without a generator what the history still holds.
     PropertyValue getSaveContents();
 
+    // Returns whether both ports exist. What it made stays until destroyPorts().
     bool createPorts();
     void destroyPorts();
     [[nodiscard]] bool isConnected() const { return _recvPort && _sendPort; }

@@ -41,7 +41,8 @@ bool OrvaneModel::createPorts()
         return false;
     const std::string name = "OrvaneApp." + *uuid;
 
-    // Kept without a test: where it cannot be made, the rest goes on without it. This is meant.
+    // Deliberate: not tested here. A missing local port is reported by the result, after the other
+    // steps have logged how far they came.
     _recvPort = _environment.ports.createLocal(
         name, [this](LocalMessagePort&, std::int32_t messageId, ByteView data) {
             return messageReceived(messageId, data, this);
@@ -80,7 +81,7 @@ bool OrvaneModel::createPorts()
     }
     logError(" ***** Created ports (send=%p, recv=%p)", static_cast<void*>(_sendPort.get()),
              static_cast<void*>(_recvPort.get()));
-    return true;
+    return isConnected();
 }
 
 void OrvaneModel::destroyPorts()

@@ -315,7 +315,16 @@ TEST_F(OrvaneAppTest, ItsEndStopsTheNumericSignalStrengthAndLeavesTheScreen)
         EXPECT_NE(screen.keyWindow(), nullptr);
         EXPECT_NE(transport.openConnections(kTelephonyServerPort), 0U);
     };
+    // Then the window goes, and only then the model with its connection.
+    std::size_t connectionsWithoutWindow = 0;
+    screen.onUpdate = [&] {
+        if (!screen.keyWindow())
+            connectionsWithoutWindow = transport.openConnections(kTelephonyServerPort);
+    };
     app.applicationWillTerminate();
+    EXPECT_NE(connectionsWithoutWindow, 0U);
+    EXPECT_EQ(transport.openConnections(kTelephonyServerPort), 0U);
+    screen.onUpdate = nullptr;
     EXPECT_THAT(preferences.notes,
                 ElementsAre("set home-screen HSShowGSMRSSI false", "synchronize home-screen",
                             "notice home-screen HSShowGSMRSSI"));

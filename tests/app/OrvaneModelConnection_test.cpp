@@ -256,6 +256,84 @@ TEST_F(ConnectionTest, ConnectsAsksForTheTechnologyAndSendsTheStartCommand)
     EXPECT_EQ(observer.startsEnded, 1);
 }
 
+TEST_F(ConnectionTest, TheLineOfCreatedPortsNamesTheSendingPortFirst)
+{
+    startConnected();
+    server.closeChannels();
+    queue.advance(2s);
+    // It is the local port that the health check invalidates.
+    const auto invalidated = errorsThatStart(" ***** INVALIDATED ");
+    ASSERT_THAT(invalidated, SizeIs(1));
+    const std::string receiving = invalidated[0].substr(19, invalidated[0].rfind(" *****") - 19);
+    const auto created = errorsThatStart(" ***** Created ports ");
+    ASSERT_THAT(created, SizeIs(2));
+    EXPECT_THAT(created[0], HasSubstr(", recv=" + receiving + ")"));
+    EXPECT_THAT(created[0], ::testing::Not(HasSubstr("(send=" + receiving + ",")));
+}
+
+TEST_F(ConnectionTest, ALocalPortThatCannotBeMadeIsTriedAgain)
+{
+    transport.refuseListener("OrvaneApp.UUID-1");
+    start(model);
+    EXPECT_FALSE(model->isConnected());
+    // The other steps still ran, and the line shows which port is missing.
+    EXPECT_THAT(services.log.errors(), Contains(HasSubstr(", recv=(nil))")));
+    EXPECT_THAT(services.log.errors(), Contains("Could not create the ports necessary"));
+    EXPECT_EQ(services.log.count("Starting the display update timer"), 0U);
+    EXPECT_EQ(transport.openConnections(kTelephonyServerPort), 0U);
+    EXPECT_EQ(server.channelPort(), "") << "the sending port is closed as well";
+
+    queue.advance(5s);
+    EXPECT_TRUE(model->isConnected());
+    ASSERT_TRUE(server.sendLogMessage(servingCellPacket(77)));
+    queue.advance(2s);
+    EXPECT_EQ(shownCellId(), "77");
+}
+
+TEST_F(ConnectionTest, TheTechnologyQueryWaitsOneSecondForItsAnswer)
+{
+    server.technologyAnswer = TechnologyAnswer::None;
+    start(model);
+    EXPECT_EQ(queue.now(), 1s);
+    EXPECT_THAT(services.log.errors(),
+                Contains(" ***** Could not send the GetTechnology command (got error=-2)"));
+}
+
+TEST_F(ConnectionTest, TheTechnologyQueryWaitsOneSecondToBeTaken)
+{
+    transport.stopReading("TelephonyServer.channel-1");
+    start(model);
+    EXPECT_EQ(queue.now(), 1s);
+    EXPECT_THAT(services.log.errors(),
+                Contains(" ***** Could not send the GetTechnology command (got error=-1)"));
+}
+
+TEST_F(ConnectionTest, TheStartCommandWaitsOneSecondToBeTaken)
+{
+    server.afterTechnologyAnswer = [this] { transport.stopReading(server.channelPort()); };
+    start(model);
+    EXPECT_EQ(queue.now(), 1s);
+    EXPECT_THAT(services.log.errors(),
+                Contains(" ***** Could not send the START command (got error=-1)"));
+}
+
+TEST_F(ConnectionTest, ALogMessageThatWantsAReplyGetsOneWithoutData)
+{
+    startConnected();
+    std::string error;
+    const auto sender = transport.peerSide().connect(server.clientPort(), error);
+    ASSERT_NE(sender, nullptr) << error;
+    std::vector<std::size_t> replySizes;
+    sender->setFrameCallback([&](const FrameReader::View& frame) {
+        EXPECT_TRUE(frame.isReply);
+        replySizes.push_back(frame.data.size());
+    });
+    sender->send(0, 1, true, false, servingCellPacket(77));
+    sender->send(5, 2, true, false, servingCellPacket(78));
+    queue.runPending();
+    EXPECT_THAT(replySizes, ElementsAre(0U, 0U));
+}
+
 TEST_F(ConnectionTest, AnUnknownTechnologyIsStoredAsNoGenerator)
 {
     server.technology = "kTSSomethingElse";
@@ -390,14 +468,28 @@ TEST_F(ConnectionTest, AStartWhoseTemplatesCannotBeReadGivesOneErrorLineAndIsTri
     EXPECT_TRUE(model->isConnected());
 }
 
-TEST_F(ConnectionTest, ANotificationRefreshesAtOnce)
+TEST_F(ConnectionTest, AnyNotificationRefreshesAtOnce)
 {
     startConnected();
-    ASSERT_TRUE(server.sendLogMessage(servingCellPacket(77)));
-    server.notify("ChannelStreaming");
+    unsigned cellId = 0;
+    for (const char* name : {"ChannelStreaming", "TechnologyChanged", "Unheard of", ""}) {
+        ASSERT_TRUE(server.sendLogMessage(servingCellPacket(++cellId)));
+        server.notify(name);
+        queue.advance(10ms);
+        EXPECT_EQ(shownCellId(), std::to_string(cellId)) << name;
+    }
+    EXPECT_EQ(observer.updates, 4);
+}
+
+TEST_F(ConnectionTest, ANotificationFindsADeadChannelAtOnce)
+{
+    startConnected();
+    server.closeChannels();
+    server.notify("TechnologyChanged");
     queue.advance(10ms);
-    EXPECT_EQ(observer.updates, 1);
-    EXPECT_EQ(shownCellId(), "77");
+    EXPECT_THAT(services.log.errors(), Contains(StartsWith(" ***** INVALIDATED 0x")));
+    EXPECT_TRUE(model->isConnected());
+    EXPECT_EQ(uuids, 2);
 }
 
 TEST_F(ConnectionTest, WithoutDataARefreshLeavesTheTreeAndTheViewAlone)

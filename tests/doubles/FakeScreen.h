@@ -34,7 +34,14 @@ public:
     }
     [[nodiscard]] Size sizeWithFont(std::string_view text, const Font& font) const override;
     [[nodiscard]] std::unique_ptr<Interface> loadInterface(const std::string& name) override;
-    void setNeedsUpdate() override { ++_updateCount; }
+    void setNeedsUpdate() override
+    {
+        ++_updateCount;
+        if (onUpdate)
+            onUpdate();
+    }
+    // Called for each change, while what changes is still at work.
+    std::function<void()> onUpdate;
 
     // How often something has changed.
     [[nodiscard]] int updateCount() const { return _updateCount; }

@@ -46,7 +46,7 @@ class LoopbackTransport::Network
 public:
     std::shared_ptr<LoopbackListening> listen(const std::string& name, ManualMainQueue& queue)
     {
-        if (hasListener(name))
+        if (hasListener(name) || _ports[name].refusesListener)
             return nullptr;
         const auto listening = std::make_shared<LoopbackListening>(queue);
         _ports[name].listening = listening;
@@ -95,6 +95,11 @@ public:
     // The other settings are kept by the name, also before anything listens there.
     void refuse(const std::string& name, bool refuses) { _ports[name].refuses = refuses; }
 
+    void refuseListener(const std::string& name, bool refuses)
+    {
+        _ports[name].refusesListener = refuses;
+    }
+
     void setRoom(const std::string& name, std::optional<std::size_t> room)
     {
         _ports[name].room = room;
@@ -137,6 +142,7 @@ private:
     struct Port {
         std::weak_ptr<LoopbackListening> listening;
         bool refuses = false;
+        bool refusesListener = false;
         std::optional<std::size_t> room; // nothing = it reads
         std::optional<std::size_t> roomFromPort;
         std::vector<Connection> connections;
@@ -235,6 +241,11 @@ std::size_t LoopbackTransport::openConnections(const std::string& name) const
 void LoopbackTransport::refuseConnections(const std::string& name, bool refuse)
 {
     _network->refuse(name, refuse);
+}
+
+void LoopbackTransport::refuseListener(const std::string& name, bool refuse)
+{
+    _network->refuseListener(name, refuse);
 }
 
 void LoopbackTransport::stopReading(const std::string& name, std::size_t room)

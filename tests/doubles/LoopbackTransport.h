@@ -44,6 +44,8 @@ public:
     [[nodiscard]] std::size_t openConnections(const std::string& name) const;
     // Connections to the name fail from here on although something listens, or no longer do.
     void refuseConnections(const std::string& name, bool refuse = true);
+    // Nobody can listen on the name from here on, or somebody can again.
+    void refuseListener(const std::string& name, bool refuse = true);
     // The port of the name no longer reads: of what is sent to it from here on, `room` more bytes a
     // connection are taken, the rest stays unsent with the sender.
     void stopReading(const std::string& name, std::size_t room = 0);
