@@ -12,10 +12,10 @@
 #include "app/program/WindowFrontEnd.h"
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/QtPreferencesStore.h"
 #include "platform/linux/SignalWatcher.h"
+#include "platform/linux/SocketTransport.h"
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
@@ -71,7 +71,7 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
           const std::string& portsDirectory, const std::string& root)
 {
     QtMainQueue queue;
-    QtFrameTransport transport(portsDirectory);
+    SocketTransport transport(portsDirectory);
     FramePorts ports(transport, queue);
     FrameTelephonyServer server(transport, ports, queue);
     const FileSystem files(root);

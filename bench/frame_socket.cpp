@@ -3,8 +3,8 @@
 
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtMainQueue.h"
+#include "platform/linux/SocketTransport.h"
 
 #include <benchmark/benchmark.h>
 
@@ -73,7 +73,7 @@ private:
         _connection->send(0, _left, false, _request == Echo, _request == Large ? _large : _small);
     }
 
-    QtFrameTransport _transport;
+    SocketTransport _transport;
     QtMainQueue _queue;
     std::unique_ptr<FrameListener> _listener;
     std::unique_ptr<FrameConnection> _connection;
@@ -146,7 +146,7 @@ public:
 
 private:
     QtEventLoop _loop;
-    QtFrameTransport _transport;
+    SocketTransport _transport;
     std::unique_ptr<FrameConnection> _connection;
     std::uint32_t _received = 0;
 };

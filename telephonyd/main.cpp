@@ -3,10 +3,10 @@
 #include "platform/linux/LineReader.h"
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/ResourceDirectory.h"
 #include "platform/linux/SignalWatcher.h"
+#include "platform/linux/SocketTransport.h"
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
@@ -71,7 +71,7 @@ int serve(const DaemonOptions& options)
     }
     QtEventLoop loop;
     QtMainQueue queue;
-    QtFrameTransport transport(directory->path());
+    SocketTransport transport(directory->path());
     std::unique_ptr<TypedMessages> messages;
     std::unique_ptr<LineReader> reader;
     LogSourceFactory factory;

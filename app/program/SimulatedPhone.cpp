@@ -1,7 +1,7 @@
 #include "app/program/SimulatedPhone.h"
 
 #include "app/OrvaneApp.h"
-#include "platform/linux/QtFrameTransport.h"
+#include "platform/linux/SocketTransport.h"
 #include "platform/services/FileSystem.h"
 #include "telephonyd/LogServer.h"
 #include "telephonyd/phone/Scenarios.h"
@@ -22,7 +22,7 @@ struct Parts {
         : transport(directory), server(transport, queue, phoneSourceFactory(scenario, queue))
     {
     }
-    QtFrameTransport transport;
+    SocketTransport transport;
     LogServer server;
 };
 

@@ -15,7 +15,7 @@
 namespace orvane
 {
 
-// What is behind a QtFrameConnection. Apart from it because a callback may destroy the connection:
+// What is behind a SocketConnection. Apart from it because a callback may destroy the connection:
 // whatever calls one keeps the stream until it has returned.
 class FrameStream : public std::enable_shared_from_this<FrameStream>
 {

@@ -1,8 +1,8 @@
 #include "platform/linux/EventThread.h"
 
 #include "platform/linux/PortsDirectory.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtTest.h"
+#include "platform/linux/SocketTransport.h"
 
 #include <atomic>
 #include <stdexcept>
@@ -74,7 +74,7 @@ struct Answerer {
             });
         });
     }
-    QtFrameTransport transport;
+    SocketTransport transport;
     std::unique_ptr<FrameListener> listener;
     std::unique_ptr<FrameConnection> connection;
 };
@@ -84,7 +84,7 @@ TEST_F(EventThreadTest, ThreadsTalkOverPorts)
     const PrivatePortsDirectory directory;
     const EventThread thread(
         [&](MainQueue&) { return std::make_shared<Answerer>(directory.path()); });
-    QtFrameTransport transport(directory.path());
+    SocketTransport transport(directory.path());
     std::string error;
     const auto connection = transport.connect("Answerer", error);
     ASSERT_TRUE(connection) << error;

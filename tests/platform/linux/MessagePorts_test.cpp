@@ -28,7 +28,7 @@ struct Reverser {
         if (port)
             port->setDispatchQueue(queue);
     }
-    QtFrameTransport transport;
+    SocketTransport transport;
     FramePorts ports;
     std::unique_ptr<LocalMessagePort> port;
 };

@@ -2,8 +2,8 @@
 
 #include "platform/linux/FileDescriptor.h"
 #include "platform/linux/PortsDirectory.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtTest.h"
+#include "platform/linux/SocketTransport.h"
 #include "platform/linux/UnixSocket.h"
 #include "support/Recording.h"
 
@@ -61,7 +61,7 @@ protected:
 
     RecordingLog log;
     PrivatePortsDirectory directory;
-    QtFrameTransport transport{directory.path()};
+    SocketTransport transport{directory.path()};
     std::string error;
 };
 

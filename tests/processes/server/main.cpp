@@ -5,8 +5,8 @@
 #include "doubles/ScriptedTelephonyServer.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/linux/QtEventLoop.h"
-#include "platform/linux/QtFrameTransport.h"
 #include "platform/linux/QtMainQueue.h"
+#include "platform/linux/SocketTransport.h"
 
 #include <cstdio>
 #include <cstdlib>
@@ -68,7 +68,7 @@ int main(int argc, char** argv)
     const std::string_view mode = argv[2];
     QtEventLoop loop;
     QtMainQueue queue;
-    QtFrameTransport transport(argv[1]);
+    SocketTransport transport(argv[1]);
     ScriptedTelephonyServer server(transport, queue);
     if (!arrange(server, mode))
         return 2;

@@ -7,20 +7,20 @@
 namespace orvane
 {
 
-// Frames over a connected socket that does not block. What QtFrameTransport makes.
+// Frames over a connected socket that does not block. What SocketTransport makes.
 //
 // A wake-up of the event loop reads one block, so that timers run between the blocks of a peer that
 // never pauses. The frames sent in one turn of the loop are written together at its end, earlier
 // once they are many: in a turn of its own a frame waits no longer for that than for a write of its
 // own, and under load one write carries hundreds.
-class QtFrameConnection final : public FrameConnection
+class SocketConnection final : public FrameConnection
 {
 public:
-    explicit QtFrameConnection(FileDescriptor socket);
+    explicit SocketConnection(FileDescriptor socket);
     // close().
-    ~QtFrameConnection() override;
-    QtFrameConnection(const QtFrameConnection&) = delete;
-    QtFrameConnection& operator=(const QtFrameConnection&) = delete;
+    ~SocketConnection() override;
+    SocketConnection(const SocketConnection&) = delete;
+    SocketConnection& operator=(const SocketConnection&) = delete;
 
     void setFrameCallback(std::function<void(const FrameReader::View&)> callback) override;
     void setClosedCallback(std::function<void()> callback) override;

@@ -1,4 +1,4 @@
-#include "platform/linux/QtFrameConnection.h"
+#include "platform/linux/SocketConnection.h"
 
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/TransportTest.h"
@@ -16,10 +16,10 @@ namespace
 using namespace std::chrono_literals;
 using SteadyClock = std::chrono::steady_clock;
 
-class QtFrameConnectionTest : public TransportTest
+class SocketConnectionTest : public TransportTest
 {
 protected:
-    QtFrameConnectionTest()
+    SocketConnectionTest()
     {
         int ends[2];
         EXPECT_EQ(::socketpair(AF_UNIX, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0, ends), 0);
@@ -29,13 +29,13 @@ protected:
 
     void makeHere()
     {
-        here = std::make_unique<QtFrameConnection>(std::move(plainHere));
+        here = std::make_unique<SocketConnection>(std::move(plainHere));
         here->setClosedCallback([this] { ++closed; });
     }
     void makeBoth()
     {
         makeHere();
-        there = std::make_unique<QtFrameConnection>(std::move(plainThere));
+        there = std::make_unique<SocketConnection>(std::move(plainThere));
         there->setFrameCallback(recordTo(atThere));
         here->setFrameCallback(recordTo(atHere));
     }
@@ -82,7 +82,7 @@ protected:
     int closed = 0;
 };
 
-TEST_F(QtFrameConnectionTest, FramesArriveInOrderWithAllTheirFields)
+TEST_F(SocketConnectionTest, FramesArriveInOrderWithAllTheirFields)
 {
     makeBoth();
     const std::vector<ReceivedFrame> sent{
@@ -100,7 +100,7 @@ TEST_F(QtFrameConnectionTest, FramesArriveInOrderWithAllTheirFields)
     EXPECT_TRUE(runUntil([&] { return atHere.size() == 1; }));
 }
 
-TEST_F(QtFrameConnectionTest, NoCallbackComesFromWithinACallOfTheOwner)
+TEST_F(SocketConnectionTest, NoCallbackComesFromWithinACallOfTheOwner)
 {
     makeHere();
     writePlainly(frameBytes(1));
@@ -116,7 +116,7 @@ TEST_F(QtFrameConnectionTest, NoCallbackComesFromWithinACallOfTheOwner)
     EXPECT_EQ(calls, 2);
 }
 
-TEST_F(QtFrameConnectionTest, FramesThatCameBeforeTheCloseAreDeliveredBeforeIt)
+TEST_F(SocketConnectionTest, FramesThatCameBeforeTheCloseAreDeliveredBeforeIt)
 {
     makeHere();
     Bytes frames;
@@ -138,7 +138,7 @@ TEST_F(QtFrameConnectionTest, FramesThatCameBeforeTheCloseAreDeliveredBeforeIt)
     EXPECT_EQ(closed, 1);
 }
 
-TEST_F(QtFrameConnectionTest, AFrameCutShortByTheCloseIsDropped)
+TEST_F(SocketConnectionTest, AFrameCutShortByTheCloseIsDropped)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -152,7 +152,7 @@ TEST_F(QtFrameConnectionTest, AFrameCutShortByTheCloseIsDropped)
     EXPECT_EQ(atHere[0].messageId, 1);
 }
 
-TEST_F(QtFrameConnectionTest, AFrameMayComeByteByByte)
+TEST_F(SocketConnectionTest, AFrameMayComeByteByByte)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -166,7 +166,7 @@ TEST_F(QtFrameConnectionTest, AFrameMayComeByteByByte)
     EXPECT_EQ(atHere[0].data, Bytes(5, 0x33));
 }
 
-TEST_F(QtFrameConnectionTest, NothingComesAfterClose)
+TEST_F(SocketConnectionTest, NothingComesAfterClose)
 {
     makeBoth();
     int closedThere = 0;
@@ -183,7 +183,7 @@ TEST_F(QtFrameConnectionTest, NothingComesAfterClose)
     EXPECT_EQ(closed, 0);
 }
 
-TEST_F(QtFrameConnectionTest, AFrameOfTheLargestSizePasses)
+TEST_F(SocketConnectionTest, AFrameOfTheLargestSizePasses)
 {
     makeBoth();
     here->send(1, 0, false, false, Bytes(kFrameDataLimit, 0x77));
@@ -196,7 +196,7 @@ TEST_F(QtFrameConnectionTest, AFrameOfTheLargestSizePasses)
     EXPECT_TRUE(here->isOpen());
 }
 
-TEST_F(QtFrameConnectionTest, AnAnnouncedLengthAboveTheLimitEndsTheConnection)
+TEST_F(SocketConnectionTest, AnAnnouncedLengthAboveTheLimitEndsTheConnection)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -213,7 +213,7 @@ TEST_F(QtFrameConnectionTest, AnAnnouncedLengthAboveTheLimitEndsTheConnection)
     EXPECT_EQ(::recv(plainThere.get(), &byte, 1, 0), 0) << "the peer sees the end";
 }
 
-TEST_F(QtFrameConnectionTest, WhatThePeerDoesNotTakeIsQueuedAndSentAsItReads)
+TEST_F(SocketConnectionTest, WhatThePeerDoesNotTakeIsQueuedAndSentAsItReads)
 {
     makeHere();
     const int blockedAt = sendUntilBlocked(*here, 10000);
@@ -229,7 +229,7 @@ TEST_F(QtFrameConnectionTest, WhatThePeerDoesNotTakeIsQueuedAndSentAsItReads)
         lastQueued = here->queuedBytes();
     });
 
-    there = std::make_unique<QtFrameConnection>(std::move(plainThere));
+    there = std::make_unique<SocketConnection>(std::move(plainThere));
     std::int32_t expected = 0;
     there->setFrameCallback([&](const FrameReader::View& frame) {
         EXPECT_EQ(frame.messageId, expected);
@@ -242,7 +242,7 @@ TEST_F(QtFrameConnectionTest, WhatThePeerDoesNotTakeIsQueuedAndSentAsItReads)
     EXPECT_EQ(lastQueued, 0U);
 }
 
-TEST_F(QtFrameConnectionTest, TheLastFrameCanBeWithdrawnWhileNoneOfItIsWritten)
+TEST_F(SocketConnectionTest, TheLastFrameCanBeWithdrawnWhileNoneOfItIsWritten)
 {
     makeHere();
     EXPECT_FALSE(here->withdrawLast());
@@ -254,7 +254,7 @@ TEST_F(QtFrameConnectionTest, TheLastFrameCanBeWithdrawnWhileNoneOfItIsWritten)
     EXPECT_EQ(here->queuedBytes(), queued);
     EXPECT_FALSE(here->withdrawLast());
 
-    there = std::make_unique<QtFrameConnection>(std::move(plainThere));
+    there = std::make_unique<SocketConnection>(std::move(plainThere));
     there->setFrameCallback(recordTo(atThere));
     here->send(78, 0, false, false, {});
     EXPECT_TRUE(runUntil([&] { return !atThere.empty() && atThere.back().messageId == 78; }));
@@ -263,7 +263,7 @@ TEST_F(QtFrameConnectionTest, TheLastFrameCanBeWithdrawnWhileNoneOfItIsWritten)
     EXPECT_FALSE(here->withdrawLast()) << "it is written";
 }
 
-TEST_F(QtFrameConnectionTest, AFrameOfWhichSomeIsWrittenCannotBeWithdrawn)
+TEST_F(SocketConnectionTest, AFrameOfWhichSomeIsWrittenCannotBeWithdrawn)
 {
     makeHere();
     here->send(1, 0, false, false, Bytes(4000000));
@@ -273,7 +273,7 @@ TEST_F(QtFrameConnectionTest, AFrameOfWhichSomeIsWrittenCannotBeWithdrawn)
     EXPECT_FALSE(here->withdrawLast());
 }
 
-TEST_F(QtFrameConnectionTest, AFloodLeavesTimersTheirTurn)
+TEST_F(SocketConnectionTest, AFloodLeavesTimersTheirTurn)
 {
     makeBoth();
     bool isOver = false;
@@ -294,10 +294,10 @@ TEST_F(QtFrameConnectionTest, AFloodLeavesTimersTheirTurn)
     timer->invalidate();
 }
 
-TEST_F(QtFrameConnectionTest, FramesWaitForACallbackAndThePeerWithTheRest)
+TEST_F(SocketConnectionTest, FramesWaitForACallbackAndThePeerWithTheRest)
 {
     makeHere();
-    there = std::make_unique<QtFrameConnection>(std::move(plainThere));
+    there = std::make_unique<SocketConnection>(std::move(plainThere));
     int sent = sendUntilBlocked(*there, 10000);
     for (int i = 0; i < 100; ++i)
         there->send(sent++, 0, false, false, Bytes(10000));
@@ -310,7 +310,7 @@ TEST_F(QtFrameConnectionTest, FramesWaitForACallbackAndThePeerWithTheRest)
     EXPECT_TRUE(runUntil([&] { return expected == sent; }));
 }
 
-TEST_F(QtFrameConnectionTest, FramesThatWaitForACallbackOutlastTheClose)
+TEST_F(SocketConnectionTest, FramesThatWaitForACallbackOutlastTheClose)
 {
     makeHere();
     writePlainly(frameBytes(1));
@@ -323,7 +323,7 @@ TEST_F(QtFrameConnectionTest, FramesThatWaitForACallbackOutlastTheClose)
     EXPECT_EQ(atHere.size(), 1U);
 }
 
-TEST_F(QtFrameConnectionTest, AClosedCallbackThatComesLateIsStillCalled)
+TEST_F(SocketConnectionTest, AClosedCallbackThatComesLateIsStillCalled)
 {
     makeHere();
     here->setClosedCallback({});
@@ -334,12 +334,12 @@ TEST_F(QtFrameConnectionTest, AClosedCallbackThatComesLateIsStillCalled)
     EXPECT_TRUE(runUntil([&] { return closed == 1; }));
 }
 
-TEST_F(QtFrameConnectionTest, EveryCallbackMayDestroyTheConnection)
+TEST_F(SocketConnectionTest, EveryCallbackMayDestroyTheConnection)
 {
     for (const std::string which : {"frame", "closed", "drained", "waiting", "closed waiting"}) {
         int ends[2];
         ASSERT_EQ(::socketpair(AF_UNIX, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0, ends), 0);
-        here = std::make_unique<QtFrameConnection>(FileDescriptor(ends[0]));
+        here = std::make_unique<SocketConnection>(FileDescriptor(ends[0]));
         plainThere = FileDescriptor(ends[1]);
         int calls = 0;
         const auto destroy = [&, captured = std::string(100, 'x')] {
@@ -374,7 +374,7 @@ TEST_F(QtFrameConnectionTest, EveryCallbackMayDestroyTheConnection)
     }
 }
 
-TEST_F(QtFrameConnectionTest, APeerThatIsGoneRaisesNoSignal)
+TEST_F(SocketConnectionTest, APeerThatIsGoneRaisesNoSignal)
 {
     makeHere();
     here->setFrameCallback([](const FrameReader::View&) {});
@@ -385,7 +385,7 @@ TEST_F(QtFrameConnectionTest, APeerThatIsGoneRaisesNoSignal)
     std::signal(SIGPIPE, before);
 }
 
-TEST_F(QtFrameConnectionTest, APeerThatOnlyStopsReadingCountsAsClosed)
+TEST_F(SocketConnectionTest, APeerThatOnlyStopsReadingCountsAsClosed)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -396,11 +396,11 @@ TEST_F(QtFrameConnectionTest, APeerThatOnlyStopsReadingCountsAsClosed)
     EXPECT_EQ(atHere.size(), 1U);
 }
 
-class QtFrameConnectionWaitTest : public QtFrameConnectionTest
+class SocketConnectionWaitTest : public SocketConnectionTest
 {
 };
 
-TEST_F(QtFrameConnectionWaitTest, WaitingServesThisConnectionAlone)
+TEST_F(SocketConnectionWaitTest, WaitingServesThisConnectionAlone)
 {
     makeBoth();
     QtMainQueue queue;
@@ -415,7 +415,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingServesThisConnectionAlone)
     EXPECT_TRUE(runUntil([&] { return atThere.size() == 1; })) << "the wait has sent the request";
 }
 
-TEST_F(QtFrameConnectionWaitTest, WaitingEndsWithTheTime)
+TEST_F(SocketConnectionWaitTest, WaitingEndsWithTheTime)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -430,7 +430,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingEndsWithTheTime)
     EXPECT_TRUE(here->isOpen());
 }
 
-TEST_F(QtFrameConnectionWaitTest, WaitingEndsWithTheTimeWhateverThePeerSends)
+TEST_F(SocketConnectionWaitTest, WaitingEndsWithTheTimeWhateverThePeerSends)
 {
     makeHere();
     std::size_t received = 0;
@@ -443,7 +443,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingEndsWithTheTimeWhateverThePeerSends)
     EXPECT_GT(received, 1U);
 }
 
-TEST_F(QtFrameConnectionWaitTest, WaitingStopsAtTheFrameThatWasWaitedFor)
+TEST_F(SocketConnectionWaitTest, WaitingStopsAtTheFrameThatWasWaitedFor)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -454,7 +454,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingStopsAtTheFrameThatWasWaitedFor)
     EXPECT_TRUE(runUntil([&] { return atHere.size() == 5; })) << "the others come from the loop";
 }
 
-TEST_F(QtFrameConnectionWaitTest, WaitingEndsWhenThePeerClosesAndTheCallbackComesAfterwards)
+TEST_F(SocketConnectionWaitTest, WaitingEndsWhenThePeerClosesAndTheCallbackComesAfterwards)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -469,7 +469,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingEndsWhenThePeerClosesAndTheCallbackCome
     EXPECT_FALSE(here->waitUntil([] { return false; }, 30s));
 }
 
-TEST_F(QtFrameConnectionWaitTest, AReplyThatCameBeforeThePeerWentCounts)
+TEST_F(SocketConnectionWaitTest, AReplyThatCameBeforeThePeerWentCounts)
 {
     makeHere();
     here->setFrameCallback(recordTo(atHere));
@@ -479,7 +479,7 @@ TEST_F(QtFrameConnectionWaitTest, AReplyThatCameBeforeThePeerWentCounts)
     EXPECT_TRUE(here->waitUntil([&] { return atHere.size() == 1; }, 30s));
 }
 
-TEST_F(QtFrameConnectionWaitTest, WaitingSendsWhatIsQueued)
+TEST_F(SocketConnectionWaitTest, WaitingSendsWhatIsQueued)
 {
     makeHere();
     int drained = 0;
@@ -502,7 +502,7 @@ TEST_F(QtFrameConnectionWaitTest, WaitingSendsWhatIsQueued)
     EXPECT_TRUE(runUntil([&] { return drained > 0; }));
 }
 
-TEST_F(QtFrameConnectionWaitTest, FramesThatCallbacksSendLeaveDuringTheWait)
+TEST_F(SocketConnectionWaitTest, FramesThatCallbacksSendLeaveDuringTheWait)
 {
     makeHere();
     here->setFrameCallback([&](const FrameReader::View& frame) {
@@ -524,7 +524,7 @@ TEST_F(QtFrameConnectionWaitTest, FramesThatCallbacksSendLeaveDuringTheWait)
     EXPECT_EQ(reply[4], 2);
 }
 
-TEST_F(QtFrameConnectionWaitTest, AFrameStaysValidWhileItsCallbackWaitsForAnother)
+TEST_F(SocketConnectionWaitTest, AFrameStaysValidWhileItsCallbackWaitsForAnother)
 {
     makeHere();
     here->setFrameCallback([&](const FrameReader::View& frame) {

@@ -1,4 +1,4 @@
-#include "platform/linux/QtFrameTransport.h"
+#include "platform/linux/SocketTransport.h"
 
 #include "platform/linux/TransportTest.h"
 
@@ -14,7 +14,7 @@ namespace orvane
 namespace
 {
 
-class QtFrameTransportTest : public TransportTest
+class SocketTransportTest : public TransportTest
 {
 protected:
     // A socket file as a program leaves it that did not end well.
@@ -36,7 +36,7 @@ protected:
     }
 };
 
-TEST_F(QtFrameTransportTest, AListenersSocketIsThereAsLongAsItIs)
+TEST_F(SocketTransportTest, AListenersSocketIsThereAsLongAsItIs)
 {
     auto listener = listen("TelephonyServer");
     ASSERT_TRUE(listener);
@@ -49,7 +49,7 @@ TEST_F(QtFrameTransportTest, AListenersSocketIsThereAsLongAsItIs)
                          " cannot be reached: No such file or directory");
 }
 
-TEST_F(QtFrameTransportTest, AStaleSocketIsReplaced)
+TEST_F(SocketTransportTest, AStaleSocketIsReplaced)
 {
     leaveStaleSocket("Port");
     EXPECT_FALSE(transport.connect("Port", error));
@@ -59,7 +59,7 @@ TEST_F(QtFrameTransportTest, AStaleSocketIsReplaced)
     EXPECT_TRUE(isServed(*listener, "Port"));
 }
 
-TEST_F(QtFrameTransportTest, ALivePortMakesListeningFailAndKeepsServing)
+TEST_F(SocketTransportTest, ALivePortMakesListeningFailAndKeepsServing)
 {
     const auto first = listen("Port");
     ASSERT_TRUE(first);
@@ -70,7 +70,7 @@ TEST_F(QtFrameTransportTest, ALivePortMakesListeningFailAndKeepsServing)
     EXPECT_TRUE(isServed(*first, "Port"));
 }
 
-TEST_F(QtFrameTransportTest, WhatIsNoSocketIsLeftAlone)
+TEST_F(SocketTransportTest, WhatIsNoSocketIsLeftAlone)
 {
     std::ofstream(pathOf("File")) << "precious";
     std::filesystem::create_directory(pathOf("Directory"));
@@ -83,7 +83,7 @@ TEST_F(QtFrameTransportTest, WhatIsNoSocketIsLeftAlone)
     }
 }
 
-TEST_F(QtFrameTransportTest, NamesThatAreNoneAreRefused)
+TEST_F(SocketTransportTest, NamesThatAreNoneAreRefused)
 {
     for (const std::string& name :
          {std::string(), std::string("."), std::string(".."), std::string("../Port"),
@@ -97,14 +97,14 @@ TEST_F(QtFrameTransportTest, NamesThatAreNoneAreRefused)
     EXPECT_TRUE(listen(std::string(64, 'a')));
 }
 
-TEST_F(QtFrameTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
+TEST_F(SocketTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
 {
     // 107 bytes are what an address holds, beside the one that ends it.
     for (const std::size_t length : {107U, 108U, 250U}) {
         const std::size_t folder = length - pathOf("").size() - std::string("/P").size();
         const std::string deep = pathOf(std::string(folder, 'd'));
         std::filesystem::create_directory(deep);
-        QtFrameTransport deepTransport(deep);
+        SocketTransport deepTransport(deep);
         const std::string path = deep + "/P";
         ASSERT_EQ(path.size(), length);
         const auto listener = deepTransport.listen("P", error);
@@ -125,7 +125,7 @@ TEST_F(QtFrameTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
     }
 }
 
-TEST_F(QtFrameTransportTest, AListenerLeavesASocketThatHasTakenItsPlace)
+TEST_F(SocketTransportTest, AListenerLeavesASocketThatHasTakenItsPlace)
 {
     auto first = listen("Port");
     std::filesystem::remove(pathOf("Port"));
@@ -135,7 +135,7 @@ TEST_F(QtFrameTransportTest, AListenerLeavesASocketThatHasTakenItsPlace)
     EXPECT_TRUE(isServed(*second, "Port"));
 }
 
-TEST_F(QtFrameTransportTest, ADirectoryThatIsGoneIsAnError)
+TEST_F(SocketTransportTest, ADirectoryThatIsGoneIsAnError)
 {
     std::filesystem::remove(directory.path());
     EXPECT_EQ(refusal("Port"), "The ports directory " + directory.path() +
@@ -143,7 +143,7 @@ TEST_F(QtFrameTransportTest, ADirectoryThatIsGoneIsAnError)
     EXPECT_FALSE(transport.connect("Port", error));
 }
 
-TEST_F(QtFrameTransportTest, CallersWaitForAConnectionCallback)
+TEST_F(SocketTransportTest, CallersWaitForAConnectionCallback)
 {
     const auto listener = listen("Port");
     const auto caller = transport.connect("Port", error);
@@ -160,7 +160,7 @@ TEST_F(QtFrameTransportTest, CallersWaitForAConnectionCallback)
     EXPECT_TRUE(runUntil([&] { return received == 5; }));
 }
 
-TEST_F(QtFrameTransportTest, TheConnectionCallbackMayDestroyTheListener)
+TEST_F(SocketTransportTest, TheConnectionCallbackMayDestroyTheListener)
 {
     auto listener = listen("Port");
     bool wasCalled = false;
@@ -177,7 +177,7 @@ TEST_F(QtFrameTransportTest, TheConnectionCallbackMayDestroyTheListener)
     EXPECT_TRUE(std::filesystem::is_empty(directory.path()));
 }
 
-TEST_F(QtFrameTransportTest, SocketsAreNotInherited)
+TEST_F(SocketTransportTest, SocketsAreNotInherited)
 {
     const auto listener = listen("Port");
     const auto connection = transport.connect("Port", error);
@@ -205,7 +205,7 @@ TEST_F(QtFrameTransportTest, SocketsAreNotInherited)
 #define ORVANE_UNDEFINED_SANITIZER 0
 #endif
 #if !ORVANE_UNDEFINED_SANITIZER
-TEST_F(QtFrameTransportTest, ACallerWaitsUntilThereIsADescriptorForIt)
+TEST_F(SocketTransportTest, ACallerWaitsUntilThereIsADescriptorForIt)
 {
     const auto listener = listen("Port");
     int accepted = 0;
@@ -241,7 +241,7 @@ public:
     OtherUser& operator=(const OtherUser&) = delete;
 };
 
-TEST_F(QtFrameTransportTest, ACallerOfAnotherUserIsRefused)
+TEST_F(SocketTransportTest, ACallerOfAnotherUserIsRefused)
 {
     if (::geteuid() != 0)
         GTEST_SKIP() << "only root can call as somebody else";
@@ -260,7 +260,7 @@ TEST_F(QtFrameTransportTest, ACallerOfAnotherUserIsRefused)
               std::vector<std::string>{"A connection with a process of user 65534 is refused\n"});
 }
 
-TEST_F(QtFrameTransportTest, AListenerOfAnotherUserIsRefused)
+TEST_F(SocketTransportTest, AListenerOfAnotherUserIsRefused)
 {
     if (::geteuid() != 0)
         GTEST_SKIP() << "only root can listen as somebody else";

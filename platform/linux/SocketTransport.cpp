@@ -1,9 +1,9 @@
-#include "platform/linux/QtFrameTransport.h"
+#include "platform/linux/SocketTransport.h"
 
 #include "platform/linux/DescriptorWatcher.h"
 #include "platform/linux/PortSocket.h"
-#include "platform/linux/QtFrameConnection.h"
 #include "platform/linux/QtMainQueue.h"
+#include "platform/linux/SocketConnection.h"
 #include "platform/linux/UnixSocket.h"
 #include "platform/ports/MessagePort.h"
 #include "platform/services/SystemLog.h"
@@ -19,15 +19,15 @@ namespace
 using ConnectionCallback = std::function<void(std::unique_ptr<FrameConnection>)>;
 
 // Callers wait in the socket until there is a connection callback.
-class QtFrameListener final : public FrameListener
+class SocketListener final : public FrameListener
 {
 public:
-    explicit QtFrameListener(PortSocket socket) : _state(std::make_shared<State>(std::move(socket)))
+    explicit SocketListener(PortSocket socket) : _state(std::make_shared<State>(std::move(socket)))
     {
     }
-    ~QtFrameListener() override { setConnectionCallback({}); }
-    QtFrameListener(const QtFrameListener&) = delete;
-    QtFrameListener& operator=(const QtFrameListener&) = delete;
+    ~SocketListener() override { setConnectionCallback({}); }
+    SocketListener(const SocketListener&) = delete;
+    SocketListener& operator=(const SocketListener&) = delete;
 
     void setConnectionCallback(ConnectionCallback callback) override
     {
@@ -59,7 +59,7 @@ private:
                 return;
             enlargeBuffers(accepted.get());
             const auto call = callback; // it may set another
-            call(std::make_unique<QtFrameConnection>(std::move(accepted)));
+            call(std::make_unique<SocketConnection>(std::move(accepted)));
         }
 
         // A process that has run out of descriptors would be told of the same caller for ever.
@@ -93,18 +93,18 @@ bool isUsable(const std::string& name, std::string& error)
 
 } // namespace
 
-std::unique_ptr<FrameListener> QtFrameTransport::listen(const std::string& name, std::string& error)
+std::unique_ptr<FrameListener> SocketTransport::listen(const std::string& name, std::string& error)
 {
     if (!isUsable(name, error))
         return nullptr;
     auto socket = PortSocket::claim(_directory, name, error);
     if (!socket)
         return nullptr;
-    return std::make_unique<QtFrameListener>(std::move(*socket));
+    return std::make_unique<SocketListener>(std::move(*socket));
 }
 
-std::unique_ptr<FrameConnection> QtFrameTransport::connect(const std::string& name,
-                                                           std::string& error)
+std::unique_ptr<FrameConnection> SocketTransport::connect(const std::string& name,
+                                                          std::string& error)
 {
     if (!isUsable(name, error))
         return nullptr;
@@ -122,7 +122,7 @@ std::unique_ptr<FrameConnection> QtFrameTransport::connect(const std::string& na
         error = "The port " + path + " belongs to another user.";
         return nullptr;
     }
-    return std::make_unique<QtFrameConnection>(std::move(socket));
+    return std::make_unique<SocketConnection>(std::move(socket));
 }
 
 } // namespace orvane
