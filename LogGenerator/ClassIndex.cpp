@@ -10,6 +10,20 @@ namespace orvane
 
 ClassIndex::~ClassIndex() { consoleLine("Deallocing ClassIndex"); }
 
+void ClassIndex::init()
+{
+    for (Field* field : _fields) {
+        field->_section = field->make();
+        field->_section->initWithDict(classDict, codeDictionary);
+    }
+}
+
+void ClassIndex::releaseSections()
+{
+    for (Field* field : _fields)
+        field->_section.reset();
+}
+
 Base* ClassIndex::getClass(std::string_view name) const
 {
     Base* const* section = classDict.find(name);

@@ -10,7 +10,7 @@ namespace orvane
 {
 
 // The registry through which a generator finds the sections for a log code and for a template key.
-// Each technology has a subclass whose `init` makes its sections.
+// Each technology has a subclass with one `Owned` field for each section.
 class ClassIndex
 {
 public:
@@ -18,6 +18,9 @@ public:
     virtual ~ClassIndex();
     ClassIndex(const ClassIndex&) = delete;
     ClassIndex& operator=(const ClassIndex&) = delete;
+
+    // Makes and registers the sections, in the order of the subclass's fields.
+    void init();
 
     // The section of that name, or null.
     [[nodiscard]] Base* getClass(std::string_view name) const;
@@ -31,17 +34,44 @@ public:
     [[nodiscard]] const ClassDictionary& sections() const { return classDict; }
 
 protected:
-    // Makes a section and registers it.
-    template <typename Section>
-    std::unique_ptr<Section> make()
+    // A field of a subclass, which owns one section from init() to releaseSections().
+    class Field
     {
-        auto section = std::make_unique<Section>();
-        section->initWithDict(classDict, codeDictionary);
-        return section;
-    }
+    public:
+        explicit Field(ClassIndex& index) { index._fields.push_back(this); }
+        virtual ~Field() = default;
+        Field(const Field&) = delete;
+        Field& operator=(const Field&) = delete;
+
+    private:
+        friend class ClassIndex;
+        [[nodiscard]] virtual std::unique_ptr<Base> make() const = 0;
+
+        std::unique_ptr<Base> _section;
+    };
+
+    template <typename Section>
+    class Owned final : public Field
+    {
+    public:
+        using Field::Field;
+
+    private:
+        [[nodiscard]] std::unique_ptr<Base> make() const override
+        {
+            return std::make_unique<Section>();
+        }
+    };
+
+    // For a subclass's destructor: releases the sections in the order of the fields, which C++
+    // would destroy in the opposite order.
+    void releaseSections();
 
     ClassDictionary classDict;
     CodeDictionary codeDictionary;
+
+private:
+    std::vector<Field*> _fields;
 };
 
 } // namespace orvane

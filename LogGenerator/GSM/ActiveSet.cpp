@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/ActiveSet.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/GainControl.h"
 #include "LogGenerator/GSM/LogCodes.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/CellChangeCounters.h"
+#include "LogGenerator/GSM/Sections.h"
 
 namespace orvane
 {

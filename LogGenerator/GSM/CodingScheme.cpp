@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/CodingScheme.h"
+#include "LogGenerator/GSM/Sections.h"
 
 namespace orvane
 {

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/EquivalentPLMNList.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/LogCodes.h"
 #include "platform/base/PropertyValue.h"

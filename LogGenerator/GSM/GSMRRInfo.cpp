@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/GSMRRInfo.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/GSM/LogCodes.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/GSMServingCell.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/Cells.h"
 #include "LogGenerator/GSM/LogCodes.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/NonRankedGSMSet.h"
+#include "LogGenerator/GSM/Sections.h"
 
 namespace orvane
 {

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/ProcessCS.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/LogCodes.h"
 #include "LogGenerator/GSM/NasTables.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"

@@ -1,32 +1,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/GSM/ActiveSet.h"
-#include "LogGenerator/GSM/BLER.h"
-#include "LogGenerator/GSM/CellChangeCounters.h"
-#include "LogGenerator/GSM/CodingScheme.h"
-#include "LogGenerator/GSM/DetectedSet.h"
-#include "LogGenerator/GSM/EquivalentPLMNList.h"
-#include "LogGenerator/GSM/GPRSInformation.h"
-#include "LogGenerator/GSM/GSMRRInfo.h"
-#include "LogGenerator/GSM/GSMServingCell.h"
-#include "LogGenerator/GSM/GSMSet.h"
-#include "LogGenerator/GSM/HSDPAInformation.h"
-#include "LogGenerator/GSM/MobileAllocation.h"
-#include "LogGenerator/GSM/MonitoredSet.h"
-#include "LogGenerator/GSM/NeighboringCells.h"
-#include "LogGenerator/GSM/NonRankedGSMSet.h"
-#include "LogGenerator/GSM/NonRankedUMTSSet.h"
-#include "LogGenerator/GSM/PDPContextList.h"
-#include "LogGenerator/GSM/ProcessCO.h"
-#include "LogGenerator/GSM/ProcessCS.h"
-#include "LogGenerator/GSM/ProcessPS.h"
-#include "LogGenerator/GSM/ServingPLMN.h"
-#include "LogGenerator/GSM/SimInfo.h"
-#include "LogGenerator/GSM/UMTSRRInfo.h"
-#include "LogGenerator/GSM/UMTSRRMeasurement.h"
-#include "LogGenerator/GSM/UMTSSet.h"
-#include "LogGenerator/GSM/VirtualActiveSet.h"
+#include "LogGenerator/GSM/Sections.h"
+#include "platform/services/Console.h"
 
 namespace orvane
 {
@@ -35,37 +11,39 @@ namespace orvane
 class VRN_GSMClassIndex final : public ClassIndex
 {
 public:
-    ~VRN_GSMClassIndex() override;
-    // Makes and registers the sections.
-    void init();
+    ~VRN_GSMClassIndex() override
+    {
+        consoleLine("Deallocing VRN_GSMClassIndex");
+        releaseSections();
+    }
 
 private:
-    std::unique_ptr<ActiveSet> objActiveSet;
-    std::unique_ptr<CodingScheme> objCodingScheme;
-    std::unique_ptr<GPRSInformation> objGPRSInformation;
-    std::unique_ptr<GSMServingCell> objGSMServingCell;
-    std::unique_ptr<MobileAllocation> objMobileAllocation;
-    std::unique_ptr<NeighboringCells> objNeighboringCells;
-    std::unique_ptr<PDPContextList> objPDPContextList;
-    std::unique_ptr<ProcessPS> objProcessPS;
-    std::unique_ptr<UMTSRRMeasurement> objUMTSRRMeasurement;
-    std::unique_ptr<CellChangeCounters> objCellChangeCounter;
-    std::unique_ptr<DetectedSet> objDetectedSet;
-    std::unique_ptr<GSMSet> objGSMSet;
-    std::unique_ptr<NonRankedGSMSet> objNonRankedGSMSet;
-    std::unique_ptr<ProcessCO> objProcessCO;
-    std::unique_ptr<ServingPLMN> objServingPLMN;
-    std::unique_ptr<UMTSSet> objUMTSSet;
-    std::unique_ptr<EquivalentPLMNList> objEquivalentPLMNList;
-    std::unique_ptr<GSMRRInfo> objGSMRRInfo;
-    std::unique_ptr<MonitoredSet> objMonitoredSet;
-    std::unique_ptr<NonRankedUMTSSet> objNonRankedUMTSSet;
-    std::unique_ptr<ProcessCS> objProcessCS;
-    std::unique_ptr<UMTSRRInfo> objUMTSRRInfo;
-    std::unique_ptr<BLER> objBLER;
-    std::unique_ptr<VirtualActiveSet> objVirtualActiveSet;
-    std::unique_ptr<SimInfo> objSimInfo;
-    std::unique_ptr<HSDPAInformation> objHSDPAInformation;
+    Owned<ActiveSet> objActiveSet{*this};
+    Owned<CodingScheme> objCodingScheme{*this};
+    Owned<GPRSInformation> objGPRSInformation{*this};
+    Owned<GSMServingCell> objGSMServingCell{*this};
+    Owned<MobileAllocation> objMobileAllocation{*this};
+    Owned<NeighboringCells> objNeighboringCells{*this};
+    Owned<PDPContextList> objPDPContextList{*this};
+    Owned<ProcessPS> objProcessPS{*this};
+    Owned<UMTSRRMeasurement> objUMTSRRMeasurement{*this};
+    Owned<CellChangeCounters> objCellChangeCounter{*this};
+    Owned<DetectedSet> objDetectedSet{*this};
+    Owned<GSMSet> objGSMSet{*this};
+    Owned<NonRankedGSMSet> objNonRankedGSMSet{*this};
+    Owned<ProcessCO> objProcessCO{*this};
+    Owned<ServingPLMN> objServingPLMN{*this};
+    Owned<UMTSSet> objUMTSSet{*this};
+    Owned<EquivalentPLMNList> objEquivalentPLMNList{*this};
+    Owned<GSMRRInfo> objGSMRRInfo{*this};
+    Owned<MonitoredSet> objMonitoredSet{*this};
+    Owned<NonRankedUMTSSet> objNonRankedUMTSSet{*this};
+    Owned<ProcessCS> objProcessCS{*this};
+    Owned<UMTSRRInfo> objUMTSRRInfo{*this};
+    Owned<BLER> objBLER{*this};
+    Owned<VirtualActiveSet> objVirtualActiveSet{*this};
+    Owned<SimInfo> objSimInfo{*this};
+    Owned<HSDPAInformation> objHSDPAInformation{*this};
 };
 
 } // namespace orvane

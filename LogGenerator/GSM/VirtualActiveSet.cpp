@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/VirtualActiveSet.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/AlwaysEmptySet.h"
 

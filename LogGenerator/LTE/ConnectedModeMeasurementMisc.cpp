@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/LTE/LTEFormats.h"
 #include "LogGenerator/LTE/LogCodes.h"

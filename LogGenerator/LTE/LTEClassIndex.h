@@ -1,17 +1,9 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/GSM/PDPContextList.h"
-#include "LogGenerator/GSM/SimInfo.h"
-#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
-#include "LogGenerator/LTE/DetectedCells.h"
-#include "LogGenerator/LTE/LTEServingCellInfo.h"
-#include "LogGenerator/LTE/MeasuredNeighborCells.h"
-#include "LogGenerator/LTE/NeighborCellsList.h"
-#include "LogGenerator/LTE/NeighborMeasurementMisc.h"
-#include "LogGenerator/LTE/ReselectionCandidatesList.h"
-#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
-#include "LogGenerator/LTE/ServingCellMeasurement.h"
+#include "LogGenerator/GSM/Sections.h"
+#include "LogGenerator/LTE/Sections.h"
+#include "platform/services/Console.h"
 
 namespace orvane
 {
@@ -20,22 +12,24 @@ namespace orvane
 class LTEClassIndex final : public ClassIndex
 {
 public:
-    ~LTEClassIndex() override;
-    // Makes and registers the sections.
-    void init();
+    ~LTEClassIndex() override
+    {
+        consoleLine("Deallocing LTEClassIndex");
+        releaseSections();
+    }
 
 private:
-    std::unique_ptr<LTEServingCellInfo> objLTEServingCellInfo;
-    std::unique_ptr<ConnectedModeMeasurementMisc> objConnectedModeMeasurementMisc;
-    std::unique_ptr<MeasuredNeighborCells> objMeasuredNeighborCells;
-    std::unique_ptr<DetectedCells> objDetectedCells;
-    std::unique_ptr<ServingCellMeasurement> objServingCellMeasurement;
-    std::unique_ptr<NeighborMeasurementMisc> objNeighborMeasurementMisc;
-    std::unique_ptr<NeighborCellsList> objNeighborCellsList;
-    std::unique_ptr<ReselectionCandidatesMisc> objReselectionCandidatesMisc;
-    std::unique_ptr<ReselectionCandidatesList> objReselectionCandidatesList;
-    std::unique_ptr<SimInfo> objSimInfo;
-    std::unique_ptr<PDPContextList> objPDPContextList;
+    Owned<LTEServingCellInfo> objLTEServingCellInfo{*this};
+    Owned<ConnectedModeMeasurementMisc> objConnectedModeMeasurementMisc{*this};
+    Owned<MeasuredNeighborCells> objMeasuredNeighborCells{*this};
+    Owned<DetectedCells> objDetectedCells{*this};
+    Owned<ServingCellMeasurement> objServingCellMeasurement{*this};
+    Owned<NeighborMeasurementMisc> objNeighborMeasurementMisc{*this};
+    Owned<NeighborCellsList> objNeighborCellsList{*this};
+    Owned<ReselectionCandidatesMisc> objReselectionCandidatesMisc{*this};
+    Owned<ReselectionCandidatesList> objReselectionCandidatesList{*this};
+    Owned<SimInfo> objSimInfo{*this};
+    Owned<PDPContextList> objPDPContextList{*this};
 };
 
 } // namespace orvane

@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/LTEServingCellInfo.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "platform/base/PropertyValue.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/NeighborCellsList.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LTEFormats.h"

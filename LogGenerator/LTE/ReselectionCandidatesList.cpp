@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/ReselectionCandidatesList.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LogCodes.h"

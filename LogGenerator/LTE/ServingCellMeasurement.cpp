@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/ServingCellMeasurement.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/LTE/LTEFormats.h"

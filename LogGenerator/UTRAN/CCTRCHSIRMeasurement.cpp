@@ -1,4 +1,4 @@
-#include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 #include "LogGenerator/Formats.h"
 #include "LogGenerator/UTRAN/TransportChannels.h"

@@ -1,14 +1,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/GSM/PDPContextList.h"
-#include "LogGenerator/GSM/SimInfo.h"
-#include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
-#include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
-#include "LogGenerator/UTRAN/RRC_State.h"
-#include "LogGenerator/UTRAN/TRCHBLERMeasurement.h"
-#include "LogGenerator/UTRAN/UTRANNeighbhorMeasurements.h"
-#include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
+#include "LogGenerator/GSM/Sections.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 namespace orvane
 {
@@ -17,19 +11,17 @@ namespace orvane
 class UTRANClassIndex final : public ClassIndex
 {
 public:
-    ~UTRANClassIndex() override;
-    // Makes and registers the sections.
-    void init();
+    ~UTRANClassIndex() override { releaseSections(); }
 
 private:
-    std::unique_ptr<RRC_State> rrc_state;
-    std::unique_ptr<UTRANServingCellInfo> servingCellInfo;
-    std::unique_ptr<UTRANNeighbhorMeasurements> tdMeasurements;
-    std::unique_ptr<GSMNeighbhorMeasurements> gsmMeasurements;
-    std::unique_ptr<TRCHBLERMeasurement> trchMeasurements;
-    std::unique_ptr<CCTRCHSIRMeasurement> cctrchMeasurements;
-    std::unique_ptr<PDPContextList> pdpList;
-    std::unique_ptr<SimInfo> simInfo;
+    Owned<RRC_State> rrc_state{*this};
+    Owned<UTRANServingCellInfo> servingCellInfo{*this};
+    Owned<UTRANNeighbhorMeasurements> tdMeasurements{*this};
+    Owned<GSMNeighbhorMeasurements> gsmMeasurements{*this};
+    Owned<TRCHBLERMeasurement> trchMeasurements{*this};
+    Owned<CCTRCHSIRMeasurement> cctrchMeasurements{*this};
+    Owned<PDPContextList> pdpList{*this};
+    Owned<SimInfo> simInfo{*this};
 };
 
 } // namespace orvane

@@ -1,4 +1,4 @@
-#include "LogGenerator/UTRAN/UTRANNeighbhorMeasurements.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 #include "LogGenerator/Formats.h"
 

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/MonitoredSet.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 

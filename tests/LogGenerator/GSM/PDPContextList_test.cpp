@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/PDPContextList.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 #include "platform/base/PropertyValue.h"

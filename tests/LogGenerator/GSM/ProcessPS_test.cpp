@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/ProcessPS.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/GSM/NasNames.h"
 #include "LogGenerator/support/SectionTest.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/UMTSRRInfo.h"
+#include "LogGenerator/GSM/Sections.h"
 
 #include "LogGenerator/support/CellRecord.h"
 #include "LogGenerator/support/SectionTest.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 

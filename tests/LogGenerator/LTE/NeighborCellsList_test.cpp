@@ -1,4 +1,4 @@
-#include "LogGenerator/LTE/NeighborCellsList.h"
+#include "LogGenerator/LTE/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 #include "platform/base/PropertyValue.h"

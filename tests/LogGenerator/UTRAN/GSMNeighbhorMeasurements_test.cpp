@@ -1,4 +1,4 @@
-#include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 #include "platform/base/PropertyValue.h"

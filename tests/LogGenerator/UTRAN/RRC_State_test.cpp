@@ -1,4 +1,4 @@
-#include "LogGenerator/UTRAN/RRC_State.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 #include "LogGenerator/support/SectionTest.h"
 #include "platform/base/PropertyValue.h"

@@ -1,4 +1,4 @@
-#include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
+#include "LogGenerator/UTRAN/Sections.h"
 
 #include "LogGenerator/support/CellRecord.h"
 #include "LogGenerator/support/SectionTest.h"
