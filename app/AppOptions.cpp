@@ -1,10 +1,7 @@
 #include "app/AppOptions.h"
 
-#include "LogGenerator/LogTechnology.h"
-#include "LogGenerator/TechnologyOption.h"
-#include "app/ExportOptions.h"
-#include "platform/base/CommandLine.h"
-#include "platform/services/LogOption.h"
+#include "platform/base/CommandHelp.h"
+#include "platform/base/Technology.h"
 
 #include <algorithm>
 
@@ -14,111 +11,152 @@ namespace orvane
 namespace
 {
 
-using Value = CommandLineOption::Value;
+constexpr CommandLineCommand kCommands[] = {
+    {"",       "[OPTION...]",                       R"(
+Shows what the modem knows about the radio network, from this machine's telephony server or from
+FILE, a recorded diagnostic log (.dlf) or a saved snapshot (.orvane).)",
+     R"(
+With text and json, lines on standard input are commands: "save DESCRIPTION" saves a snapshot where
+saving is offered, "quit" ends the program.)"                                                   },
+    {"open",   "open FILE [OPTION...]",             "",  ""},
+    {"export", "export FILE [OPTION...] [PATH...]", R"(
+Writes rows of a recording to standard output, one line a refresh period.
 
-constexpr CommandLineOption kOptions[] = {
-    {"help",          Value::None    },
-    {"version",       Value::None    },
-    {"demo",          Value::Optional},
-    {"ui",            Value::Required},
-    {"technology",    Value::Required},
-    {"ports",         Value::Required},
-    {"root",          Value::Required},
-    {"refresh",       Value::Required},
-    {"fullscreen",    Value::None    },
-    {"record",        Value::Required},
-    {"force",         Value::None    },
-    {kLogOption,      Value::Required},
-    {kLogLevelOption, Value::Required},
+FILE is a diagnostic log (.dlf) or a saved snapshot (.orvane), which gives a line for each of its
+entries. A PATH is that of a row, as in "/Serving Cell Info/Cell Identity", or of a group for all
+its rows; * stands for any name, such as the elements of a list. Without a PATH, every row is
+written.)",
+     ""                                                    },
 };
 
-constexpr const char* kOpenCommand = "open";
-constexpr const char* kDefaultScenario = "lte";
-constexpr double kShortestRefresh = 0.01;
-constexpr double kLongestRefresh = 86400;
+constexpr unsigned bit(AppCommand command) { return 1U << static_cast<unsigned>(command); }
 
-std::string joined(std::span<const std::string> names)
+constexpr CommandSet kLive{bit(AppCommand::Live),
+                           "is for the live view: a recording is read without it"};
+constexpr CommandSet kScreens{bit(AppCommand::Live) | bit(AppCommand::Open),
+                              "is for the live view and orvane open: leave it out"};
+constexpr CommandSet kRecordings{bit(AppCommand::Open) | bit(AppCommand::Export),
+                                 "is for recordings: orvane open FILE --technology NAME"};
+constexpr CommandSet kExport{bit(AppCommand::Export),
+                             "is for recordings that are exported: orvane export FILE"};
+
+using AppOption = Option<AppOptions>;
+
+constexpr AppOption kOptions[] = {
+    AppOption(
+        {"demo", "[SCENARIO]", "attach to a simulated phone: {} (default lte)", kLive},
+        [](AppOptions& options, const GivenOption& given) { options.demo = given.textOrFirst(); }),
+    AppOption(
+        {"ui", "window|terminal|text|json",
+         "how to show it (default: a window where there is a display, else the terminal where "
+         "standard output is one, else text)",
+         kScreens},
+        [](AppOptions& options, const GivenOption& given) {
+            options.frontEnd = static_cast<FrontEndKind>(given.choice());
+        }),
+    AppOption({"fullscreen", "", "let the window fill the screen", kScreens},
+              &AppOptions::isFullScreen),
+    AppOption({"ports", "DIR",
+               "where the telephony server's ports are (default $ORVANE_PORTS, "
+               "$XDG_RUNTIME_DIR/telephony or /tmp/telephony-UID)",
+               kLive},
+              &AppOptions::ports),
+    AppOption({"root", "DIR", "take the log folder and the install marker below DIR", kLive},
+              &AppOptions::root),
+    AppOption({"refresh", "SECONDS", "the refresh period (default 2.0)", kScreens, 0.01, 86400},
+              &AppOptions::refreshInterval),
+    AppOption(
+        {"format", "csv|jsonl",
+         "a header and a column a row, or a JSON object a line (default csv with a PATH, else "
+         "jsonl)",
+         kExport},
+        [](AppOptions& options, const GivenOption& given) {
+            options.format = static_cast<ExportFormat>(given.choice());
+        }),
+    AppOption({"every", "SECONDS", "the refresh period (default 2.0)", kExport, 0.001, 86400},
+              &AppOptions::refreshInterval),
+    AppOption({"list", "", "print the paths that occur", kExport}, &AppOptions::listsPaths),
+    AppOption({"technology", "NAME",
+               "what FILE is a recording of: {} (default: by the log codes in it)", kRecordings},
+              [](AppOptions& options, const GivenOption& given) {
+                  options.technology = technologyNamed(given.text());
+              }),
+    AppOption(
+        {"record", "FILE", "write every message of the modem to FILE, a diagnostic log", kLive},
+        &AppOptions::record),
+    AppOption({"force", "", "overwrite FILE if it already exists", kLive},
+              &AppOptions::overwritesRecord),
+    kLogOption<AppOptions>,
+    kLogLevelOption<AppOptions>,
+    kHelpOption<AppOptions>,
+    kVersionOption<AppOptions>,
+};
+
+std::vector<CommandLineOption> describedOptions()
 {
-    std::string text;
-    for (const std::string& name : names)
-        text += (text.empty() ? "" : ", ") + name;
-    return text;
+    return {std::begin(kOptions), std::end(kOptions)};
 }
 
-struct FrontEndName {
-    const char* name;
-    FrontEndKind kind;
-};
-
-constexpr FrontEndName kFrontEnds[] = {
-    {"window",   FrontEndKind::Window  },
-    {"terminal", FrontEndKind::Terminal},
-    {"text",     FrontEndKind::Text    },
-    {"json",     FrontEndKind::Json    },
-};
-
-void takeFrontEnd(AppOptions& options, CommandLine& line)
+// The command that the first word names; the live view where it names none.
+AppCommand commandOf(const std::vector<std::string>& words)
 {
-    const std::optional<std::string> name = line.value("ui");
-    if (!name)
-        return;
-    for (const FrontEndName& known : kFrontEnds)
-        if (*name == known.name)
-            options.frontEnd = known.kind;
-    if (!options.frontEnd)
-        line.fail("--ui takes window, terminal, text or json, not \"" + *name + "\"");
+    const auto found =
+        words.empty() ? std::end(kCommands)
+                      : std::find_if(std::begin(kCommands), std::end(kCommands),
+                                     [&](const auto& each) { return each.name == words.front(); });
+    return found == std::end(kCommands) ? AppCommand::Live
+                                        : static_cast<AppCommand>(found - std::begin(kCommands));
 }
 
-void takeOpen(AppOptions& options, CommandLine& line)
+void takeWords(AppOptions& options, std::vector<std::string> words,
+               std::span<const std::string> scenarios)
 {
-    if (line.words().size() != 2 || line.words().back().empty()) {
-        line.fail("open needs the name of one recording: orvane open FILE");
-        return;
+    if (options.command == AppCommand::Live) {
+        if (words.empty())
+            return;
+        const std::string& word = words.front();
+        const bool isScenario =
+            std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end();
+        throw UsageError(
+            "\"" + word + "\" is not a command: " +
+            (isScenario ? "for the simulated phone write --demo=" + word : "see orvane --help"));
     }
-    options.open = line.words().back();
-    options.technology = technologyFromOption(line);
-    for (const char* live : {"demo", "ports", "root", "record", "force"})
-        if (line.has(live))
-            line.fail(std::string("--") + live +
-                      " is for the live view: a recording is opened without it");
+    words.erase(words.begin());
+    if (words.empty() || words.front().empty() ||
+        (options.command == AppCommand::Open && words.size() > 1))
+        throw UsageError(options.command == AppCommand::Open
+                             ? "open needs the name of one recording: orvane open FILE"
+                             : "export needs the name of a recording: orvane export FILE "
+                               "[PATH...]");
+    options.file = words.front();
+    options.paths.assign(words.begin() + 1, words.end());
+    if (std::find(options.paths.begin(), options.paths.end(), "") != options.paths.end())
+        throw UsageError("a PATH cannot be empty: see orvane export --list FILE");
 }
 
-void takeWords(AppOptions& options, CommandLine& line, std::span<const std::string> scenarios)
+void parse(AppOptions& options, std::span<const std::string> arguments,
+           std::span<const std::string> scenarios)
 {
-    if (line.words().empty())
+    const CommandLine line(describedOptions(), arguments, commonValueNames(scenarios));
+    options.command = commandOf(line.words());
+    options.wantsHelp = line.has("help");
+    options.wantsVersion = line.has("version");
+    if (options.wantsHelp || options.wantsVersion)
         return;
-    const std::string& word = line.words().front();
-    if (word == kOpenCommand)
-        takeOpen(options, line);
-    else if (word == kExportCommand)
-        line.fail("export must be the first word: orvane export FILE [OPTION...] [PATH...]");
-    else if (std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end())
-        line.fail("\"" + word + "\" is no command: for the simulated phone write --demo=" + word);
-    else
-        line.fail("\"" + word + "\" is no command: see orvane --help");
-}
-
-void takeDemo(AppOptions& options, CommandLine& line, std::span<const std::string> scenarios)
-{
-    if (!line.has("demo"))
-        return;
-    const std::string scenario = line.value("demo").value_or("");
-    options.demo = scenario.empty() ? kDefaultScenario : scenario;
-    if (std::find(scenarios.begin(), scenarios.end(), *options.demo) == scenarios.end())
-        line.fail("there is no simulated phone \"" + *options.demo + "\": --demo takes " +
-                  joined(scenarios));
-    if (line.has("ports"))
-        line.fail("--ports cannot be used with --demo, which has a private directory of its own");
-}
-
-void takeRecord(AppOptions& options, CommandLine& line)
-{
-    options.record = line.value("record");
-    options.overwritesRecord = line.has("force");
-    if (options.record && options.record->empty())
-        line.fail("--record needs the name of a file");
+    takeWords(options, line.words(), scenarios);
+    line.checkCommand(static_cast<std::size_t>(options.command));
+    if (!options.paths.empty())
+        options.format = ExportFormat::Csv;
+    line.storeIn(options, kOptions);
+    if (options.demo && line.has("ports"))
+        throw UsageError("--ports cannot be used with --demo, which has a private directory of its "
+                         "own");
     if (options.overwritesRecord && !options.record)
-        line.fail("--force is for --record FILE, which is not given");
+        throw UsageError("--force is for --record FILE, which is not given");
+    if (options.listsPaths && line.has("format"))
+        throw UsageError("--list has no --format: its lines are paths");
+    if (options.listsPaths)
+        options.format = ExportFormat::PathList;
 }
 
 } // namespace
@@ -126,32 +164,12 @@ void takeRecord(AppOptions& options, CommandLine& line)
 AppOptions parseAppOptions(std::span<const std::string> arguments,
                            std::span<const std::string> scenarios)
 {
-    CommandLine line(kOptions, arguments);
     AppOptions options;
-    if (!line.error()) {
-        options.wantsHelp = line.has("help");
-        options.wantsVersion = line.has("version");
-        if (options.wantsHelp || options.wantsVersion)
-            return options;
-        takeWords(options, line, scenarios);
-        if (line.has("technology") && !options.open)
-            line.fail("--technology is for recordings: orvane open FILE --technology NAME");
-        takeFrontEnd(options, line);
-        options.isFullScreen = line.has("fullscreen");
-        takeDemo(options, line, scenarios);
-        takeRecord(options, line);
-        options.ports = line.value("ports").value_or("");
-        if (line.has("ports") && options.ports.empty())
-            line.fail("--ports needs the name of a directory");
-        options.root = line.value("root");
-        if (options.root && options.root->empty())
-            line.fail("--root needs the name of a directory");
-        if (const auto seconds = line.number("refresh", kShortestRefresh, kLongestRefresh))
-            options.refreshInterval = std::chrono::duration_cast<std::chrono::nanoseconds>(
-                std::chrono::duration<double>(*seconds));
-        options.log = logFromOptions(line, "orvane");
+    try {
+        parse(options, arguments, scenarios);
+    } catch (const UsageError& error) {
+        options.error = error.what();
     }
-    options.error = line.error();
     return options;
 }
 
@@ -162,47 +180,10 @@ FrontEndKind defaultFrontEnd(bool hasDisplay, bool hasTerminal)
     return hasTerminal ? FrontEndKind::Terminal : FrontEndKind::Text;
 }
 
-std::string appHelp(std::span<const std::string> scenarios)
+std::string appHelp(AppCommand command, std::span<const std::string> scenarios)
 {
-    return "Usage: orvane [OPTION...]\n"
-           "       orvane open FILE [OPTION...]\n"
-           "       orvane export FILE [OPTION...] [PATH...]    (see orvane export --help)\n"
-           "Shows what the modem knows about the radio network, from this machine's telephony "
-           "server\n"
-           "or from FILE, a recorded diagnostic log (.dlf) or a saved snapshot (.orvane).\n"
-           "\n"
-           "  --demo[=SCENARIO]         attach to a simulated phone: " +
-           joined(scenarios) +
-           "\n"
-           "                            (default lte)\n"
-           "  --ui window|terminal|text|json\n"
-           "                            how to show it (default: a window where there is a "
-           "display,\n"
-           "                            else the terminal where standard output is one, else "
-           "text)\n"
-           "  --fullscreen              let the window fill the screen\n"
-           "  --ports DIR               where the telephony server's ports are (default\n"
-           "                            $ORVANE_PORTS, $XDG_RUNTIME_DIR/telephony or\n"
-           "                            /tmp/telephony-UID)\n"
-           "  --root DIR                take the log folder and the install marker below DIR\n"
-           "  --refresh SECONDS         the refresh period (default 2.0)\n"
-           "  --technology NAME         what FILE is a recording of: " +
-           technologyNames() +
-           "\n"
-           "                            (default: by the log codes in it)\n"
-           "  --record FILE             write every message of the modem to FILE, a diagnostic "
-           "log\n"
-           "  --force                   overwrite FILE where it is there already\n" +
-           kLogOptionsHelp +
-           "  --help                    show this\n"
-           "  --version                 show the version\n"
-           "\n"
-           "With text and json, lines on standard input are commands: \"save DESCRIPTION\" saves "
-           "a\n"
-           "snapshot where saving is offered, \"quit\" ends the program.\n"
-           "\n"
-           "Exit status: 0 after a normal end, 2 for unusable arguments, 1 for any other "
-           "failure.\n";
+    return helpText("orvane", kCommands, static_cast<std::size_t>(command), describedOptions(),
+                    commonValueNames(scenarios));
 }
 
 } // namespace orvane

@@ -1,46 +1,61 @@
 #pragma once
 
-#include "platform/services/SystemLog.h"
+#include "platform/services/CommonOptions.h"
 
 #include <chrono>
-#include <memory>
 #include <optional>
 #include <span>
 #include <string>
+#include <vector>
 
 namespace orvane
 {
 
+// In the order of the program's tables.
+enum class AppCommand { Live, Open, Export };
 enum class FrontEndKind { Window, Terminal, Text, Json };
+enum class ExportFormat { Csv, JsonLines, PathList };
 
 // What the command line asks `orvane` for.
 struct AppOptions {
-    bool wantsHelp = false;
+    AppCommand command = AppCommand::Live;
+    bool wantsHelp = false; // on the command
     bool wantsVersion = false;
-    std::optional<std::string> demo;      // the scenario of a simulated phone
-    std::optional<FrontEndKind> frontEnd; // nothing where not given
+    LogChoice log;
+
+    // Of the live view and of a recording that is opened.
+    std::optional<FrontEndKind> frontEnd;
     bool isFullScreen = false;
-    std::string ports;               // empty where not given
-    std::optional<std::string> root; // nothing where not given
+    // Also what --every of an export asks for.
     std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
-    std::optional<std::string> open;       // a recording, instead of the live view
-    std::optional<std::string> technology; // its technology constant; nothing where not given
-    std::optional<std::string> record;     // the file to record to
-    bool overwritesRecord = false;         // also where it is there already
-    std::unique_ptr<SystemLog> log;
+
+    // Of the live view.
+    std::optional<std::string> demo; // the scenario of a simulated phone
+    std::string ports;               // empty where not given
+    std::optional<std::string> root;
+    std::optional<std::string> record; // the file to record to
+    bool overwritesRecord = false;     // even if it already exists
+
+    // Of a recording that is opened or exported.
+    std::string file;
+    std::optional<std::string> technology; // its technology constant
+    ExportFormat format = ExportFormat::JsonLines;
+    bool listsPaths = false;
+    std::vector<std::string> paths; // none: every row
 
     // One line that says what is wrong and what to do; then nothing else counts.
     std::optional<std::string> error;
 };
 
-// `arguments` are those after the program's name; `scenarios` the simulated phones that there are.
+// `arguments` are those after the program's name; `scenarios` are the simulated phones, the default
+// first.
 AppOptions parseAppOptions(std::span<const std::string> arguments,
                            std::span<const std::string> scenarios);
 
 // The front end where none is asked for.
 FrontEndKind defaultFrontEnd(bool hasDisplay, bool hasTerminal);
 
-// The text of --help.
-std::string appHelp(std::span<const std::string> scenarios);
+// The text of --help on that command.
+std::string appHelp(AppCommand command, std::span<const std::string> scenarios);
 
 } // namespace orvane

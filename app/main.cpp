@@ -1,5 +1,4 @@
 #include "app/AppOptions.h"
-#include "app/ExportOptions.h"
 #include "app/OrvaneApp.h"
 #include "app/RecordingNotice.h"
 #include "app/program/Display.h"
@@ -97,7 +96,7 @@ int run(const AppOptions& options, FrontEndKind kind)
     if (kind == FrontEndKind::Window)
         windowApplication.emplace();
     QtEventLoop loop;
-    if (options.open)
+    if (options.command == AppCommand::Open)
         return kind == FrontEndKind::Text || kind == FrontEndKind::Json
                    ? printRecording(options, kind, loop)
                    : browseRecording(options, makeFrontEnd(kind, options, loop), loop);
@@ -127,8 +126,6 @@ int main(int argc, char** argv)
 {
     prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-    if (!arguments.empty() && arguments.front() == kExportCommand)
-        return runExport(std::span(arguments).subspan(1));
     const std::vector<std::string> scenarios = scenarioNames();
     const AppOptions options = parseAppOptions(arguments, scenarios);
     if (options.error) {
@@ -136,7 +133,7 @@ int main(int argc, char** argv)
         return kUnusableArguments;
     }
     if (options.wantsHelp) {
-        std::fputs(appHelp(scenarios).c_str(), stdout);
+        std::fputs(appHelp(options.command, scenarios).c_str(), stdout);
         return 0;
     }
     if (options.wantsVersion) {
@@ -144,13 +141,15 @@ int main(int argc, char** argv)
         return 0;
     }
 
+    const bool isExport = options.command == AppCommand::Export;
     const FrontEndKind kind =
-        options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
+        isExport ? FrontEndKind::Text
+                 : options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
+    const auto log = makeLog(options.log, "orvane");
     // Standard output carries data, or the terminal's screen, unless there is a window.
-    const ProgramServices services(options.log.get(),
-                                   kind == FrontEndKind::Window ? stdout : stderr);
+    const ProgramServices services(log.get(), kind == FrontEndKind::Window ? stdout : stderr);
     try {
-        return run(options, kind);
+        return isExport ? runExport(options) : run(options, kind);
     } catch (const std::exception& failure) {
         complain(failure.what());
         return kFailure;

@@ -1,6 +1,6 @@
 #include "recordings/NumberWithUnit.h"
 
-#include "platform/base/CommandLine.h"
+#include "platform/base/DecimalNumber.h"
 
 #include <algorithm>
 

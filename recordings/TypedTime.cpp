@@ -1,6 +1,6 @@
 #include "recordings/TypedTime.h"
 
-#include "platform/base/CommandLine.h"
+#include "platform/base/DecimalNumber.h"
 
 #include <algorithm>
 #include <cstdio>

@@ -1,12 +1,7 @@
 #include "telephonyd/DaemonOptions.h"
 
-#include "LogGenerator/LogTechnology.h"
-#include "LogGenerator/TechnologyOption.h"
-#include "platform/base/CommandLine.h"
-#include "platform/base/TelephonyConstants.h"
-#include "platform/services/LogOption.h"
-
-#include <algorithm>
+#include "platform/base/CommandHelp.h"
+#include "platform/base/Technology.h"
 
 namespace orvane
 {
@@ -14,77 +9,87 @@ namespace orvane
 namespace
 {
 
-using Value = CommandLineOption::Value;
-
-constexpr CommandLineOption kOptions[] = {
-    {"help",          Value::None    },
-    {"version",       Value::None    },
-    {"demo",          Value::Optional},
-    {"replay",        Value::Required},
-    {"messages",      Value::Optional},
-    {"technology",    Value::Required},
-    {"speed",         Value::Required},
-    {"loop",          Value::None    },
-    {"ports",         Value::Required},
-    {kLogOption,      Value::Required},
-    {kLogLevelOption, Value::Required},
+// A command is asked for by the option of its name.
+constexpr CommandLineCommand kCommands[] = {
+    {"demo",     "--demo=SCENARIO [OPTION...]", "A telephony server for machines without one.",
+     "Runs until it is interrupted."                                                              },
+    {"replay",   "--replay FILE [OPTION...]",   "",                                             ""},
+    {"messages", "--messages=NAME [OPTION...]", "",                                             ""},
 };
 
-constexpr const char* kDefaultScenario = "lte";
-constexpr const char* kFullSpeed = "max";
-constexpr double kSlowest = 0.001;
-constexpr double kFastest = 1000;
+constexpr CommandSet kRecordings{1U << 1,
+                                 "is for a recording: use it with --replay FILE, or leave it out"};
 
-std::string joined(std::span<const std::string> names)
+using DaemonOption = Option<DaemonOptions>;
+
+constexpr DaemonOption kOptions[] = {
+    DaemonOption({"demo", "[SCENARIO]", "serve a simulated phone: {} (default lte)"},
+                 [](DaemonOptions& options, const GivenOption& given) {
+                     options.demo = given.textOrFirst();
+                 }),
+    DaemonOption({"replay", "FILE", "serve a recorded diagnostic log (.dlf)"},
+                 &DaemonOptions::replay),
+    // Not of the cell monitor, whose messages are property lists without log codes.
+    DaemonOption({"messages", "[lte|umts|utran|cdma]",
+                  "serve messages typed on standard input, one a line: a log code and the bytes "
+                  "after the message's header, such as 0xB0C2 01 DD 00 9C 18 (default lte)"},
+                 [](DaemonOptions& options, const GivenOption& given) {
+                     options.messages = technologyNamed(given.textOrFirst());
+                 }),
+    DaemonOption({"technology", "NAME",
+                  "what was recorded: {} (default: by the recording's log codes)", kRecordings},
+                 [](DaemonOptions& options, const GivenOption& given) {
+                     options.technology = technologyNamed(given.text());
+                 }),
+    DaemonOption({"speed", "N|max",
+                  "seconds of the recording a second, 0.001 to 1000, or as fast as clients take it "
+                  "(default 1)",
+                  kRecordings, 0.001, 1000},
+                 [](DaemonOptions& options, const GivenOption& given) {
+                     options.speed = given.value() == "max" ? std::nullopt
+                                                            : std::optional<double>(given.number());
+                 }),
+    DaemonOption({"loop", "", "start over at the recording's end", kRecordings},
+                 &DaemonOptions::loops),
+    DaemonOption({"ports", "DIR",
+                  "where the server's ports are (default $ORVANE_PORTS, $XDG_RUNTIME_DIR/telephony "
+                  "or /tmp/telephony-UID)"},
+                 &DaemonOptions::ports),
+    kLogOption<DaemonOptions>,
+    kLogLevelOption<DaemonOptions>,
+    kHelpOption<DaemonOptions>,
+    kVersionOption<DaemonOptions>,
+};
+
+std::vector<CommandLineOption> describedOptions()
 {
-    std::string text;
-    for (const std::string& name : names)
-        text += (text.empty() ? "" : ", ") + name;
-    return text;
+    return {std::begin(kOptions), std::end(kOptions)};
 }
 
-void refuseReplayOptions(CommandLine& line)
+void parse(DaemonOptions& options, std::span<const std::string> arguments,
+           std::span<const std::string> scenarios)
 {
-    for (const char* name : {"technology", "speed", "loop"})
-        if (line.has(name))
-            line.fail(std::string("--") + name +
-                      " is for a recording: use it with --replay FILE, or leave it out");
-}
-
-void takeDemo(DaemonOptions& options, CommandLine& line, std::span<const std::string> scenarios)
-{
-    const std::string scenario = line.value("demo").value_or("");
-    options.demo = scenario.empty() ? kDefaultScenario : scenario;
-    if (std::find(scenarios.begin(), scenarios.end(), *options.demo) == scenarios.end())
-        line.fail("there is no simulated phone \"" + *options.demo + "\": --demo takes " +
-                  joined(scenarios));
-    refuseReplayOptions(line);
-}
-
-void takeMessages(DaemonOptions& options, CommandLine& line)
-{
-    const std::string name = line.value("messages").value_or("");
-    options.messages = technologyNamed(name.empty() ? kDefaultScenario : name);
-    // The cell monitor's messages are property lists without log codes.
-    if (!options.messages || *options.messages == kTSLogChannelTechnology_IFX)
-        line.fail("--messages takes lte, umts, utran or cdma, not \"" + name + "\"");
-    refuseReplayOptions(line);
-}
-
-void takeReplay(DaemonOptions& options, CommandLine& line)
-{
-    options.replay = line.value("replay");
-    if (options.replay->empty())
-        line.fail("--replay needs the name of a recording");
-    options.technology = technologyFromOption(line);
-    if (line.value("speed") == kFullSpeed)
-        options.speed.reset();
-    else if (const auto speed = line.value("speed")) {
-        options.speed = decimalNumber(*speed);
-        if (!options.speed || *options.speed < kSlowest || *options.speed > kFastest)
-            line.fail("--speed takes a number from 0.001 to 1000, or max, not \"" + *speed + "\"");
+    const CommandLine line(describedOptions(), arguments, commonValueNames(scenarios));
+    options.wantsHelp = line.has("help");
+    options.wantsVersion = line.has("version");
+    if (options.wantsHelp || options.wantsVersion)
+        return;
+    if (!line.words().empty())
+        throw UsageError("\"" + line.words().front() +
+                         "\" is not an option: give a recording as --replay FILE");
+    std::size_t given = 0;
+    for (std::size_t i = 0; i < std::size(kCommands); ++i) {
+        if (!line.has(kCommands[i].name))
+            continue;
+        line.checkCommand(i);
+        ++given;
     }
-    options.loops = line.has("loop");
+    if (given > 1)
+        throw UsageError("--demo, --replay and --messages exclude each other: give one of them");
+    if (given == 0)
+        throw UsageError("give --demo=SCENARIO, --replay FILE or --messages=NAME: there is nothing "
+                         "to serve otherwise");
+    line.storeIn(options, kOptions);
 }
 
 } // namespace
@@ -92,67 +97,18 @@ void takeReplay(DaemonOptions& options, CommandLine& line)
 DaemonOptions parseDaemonOptions(std::span<const std::string> arguments,
                                  std::span<const std::string> scenarios)
 {
-    CommandLine line(kOptions, arguments);
     DaemonOptions options;
-    if (!line.error()) {
-        options.wantsHelp = line.has("help");
-        options.wantsVersion = line.has("version");
-        if (options.wantsHelp || options.wantsVersion)
-            return options;
-        if (!line.words().empty())
-            line.fail("\"" + line.words().front() +
-                      "\" is no option: give a recording as --replay FILE");
-        const int given = line.has("demo") + line.has("replay") + line.has("messages");
-        if (given != 1)
-            line.fail(given != 0
-                          ? "--demo, --replay and --messages exclude each other: give one of them"
-                          : "give --demo=SCENARIO, --replay FILE or --messages=NAME: there is "
-                            "nothing to serve otherwise");
-        else if (line.has("demo"))
-            takeDemo(options, line, scenarios);
-        else if (line.has("messages"))
-            takeMessages(options, line);
-        else
-            takeReplay(options, line);
-        options.ports = line.value("ports").value_or("");
-        if (line.has("ports") && options.ports.empty())
-            line.fail("--ports needs the name of a directory");
-        options.log = logFromOptions(line, "telephonyd");
+    try {
+        parse(options, arguments, scenarios);
+    } catch (const UsageError& error) {
+        options.error = error.what();
     }
-    options.error = line.error();
     return options;
 }
 
 std::string daemonHelp(std::span<const std::string> scenarios)
 {
-    return "Usage: telephonyd --demo=SCENARIO [OPTION...]\n"
-           "       telephonyd --replay FILE [OPTION...]\n"
-           "       telephonyd --messages=NAME [OPTION...]\n"
-           "A telephony server for machines without one.\n"
-           "\n"
-           "  --demo[=SCENARIO]         serve a simulated phone: " +
-           joined(scenarios) +
-           " (default lte)\n"
-           "  --replay FILE             serve a recorded diagnostic log (.dlf)\n"
-           "  --messages[=NAME]         serve messages typed on standard input, one a line: a log\n"
-           "                            code and the bytes behind the message's header, such as\n"
-           "                            0xB0C2 01 DD 00 9C 18; NAME is lte, umts, utran or cdma\n"
-           "                            (default lte)\n"
-           "  --technology NAME         what was recorded: " +
-           technologyNames() +
-           "\n"
-           "                            (default: by the recording's log codes)\n"
-           "  --speed N|max             seconds of the recording a second, 0.001 to 1000, or as\n"
-           "                            fast as clients take it (default 1)\n"
-           "  --loop                    start over at the recording's end\n"
-           "  --ports DIR               where the server's ports are (default $ORVANE_PORTS,\n"
-           "                            $XDG_RUNTIME_DIR/telephony or /tmp/telephony-UID)\n" +
-           kLogOptionsHelp +
-           "  --help                    show this\n"
-           "  --version                 show the version\n"
-           "\n"
-           "Runs until it is interrupted. Exit status: 0 after a normal end, 2 for unusable\n"
-           "arguments, 1 for any other failure.\n";
+    return helpText("telephonyd", kCommands, 0, describedOptions(), commonValueNames(scenarios));
 }
 
 } // namespace orvane

@@ -1,8 +1,7 @@
 #pragma once
 
-#include "platform/services/SystemLog.h"
+#include "platform/services/CommonOptions.h"
 
-#include <memory>
 #include <optional>
 #include <span>
 #include <string>
@@ -14,24 +13,26 @@ namespace orvane
 struct DaemonOptions {
     bool wantsHelp = false;
     bool wantsVersion = false;
+    LogChoice log;
+
     // Exactly one of the three is given.
     std::optional<std::string> demo;     // the scenario of a simulated phone
-    std::optional<std::string> replay;   // the recording to be sent again
+    std::optional<std::string> replay;   // the recording that is sent again
     std::optional<std::string> messages; // the technology constant of the messages that are typed
 
-    // For a recording.
+    // Of a recording.
     std::optional<std::string> technology; // the constant; nothing = by the recording's log codes
     std::optional<double> speed = 1.0;     // nothing = as fast as clients take it
     bool loops = false;
 
     std::string ports; // empty where not given
-    std::unique_ptr<SystemLog> log;
 
     // One line that says what is wrong and what to do; then nothing else counts.
     std::optional<std::string> error;
 };
 
-// `arguments` are those after the program's name; `scenarios` the simulated phones that there are.
+// `arguments` are those after the program's name; `scenarios` are the simulated phones, the default
+// first.
 DaemonOptions parseDaemonOptions(std::span<const std::string> arguments,
                                  std::span<const std::string> scenarios);
 

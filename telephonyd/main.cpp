@@ -126,7 +126,8 @@ int main(int argc, char** argv)
     // Some generators, who are asked for their log codes, come with their templates only.
     DirectoryResources resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES));
     Services& services = Services::current();
-    services.setLog(options.log.get());
+    const auto log = makeLog(options.log, "telephonyd");
+    services.setLog(log.get());
     services.setResources(&resources);
     int status = kFailure;
     try {

@@ -1,17 +1,14 @@
 #include "app/program/ExportProgram.h"
 
-#include "app/ExportOptions.h"
 #include "app/program/FrontEnd.h"
 #include "app/program/PrintedOutput.h"
-#include "app/program/ProgramServices.h"
 #include "app/program/TerminalProgress.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
 #include "recordings/PathListWriter.h"
+#include "recordings/RecordingExport.h"
 
 #include <csignal>
-#include <cstdio>
-#include <exception>
 #include <unistd.h>
 
 namespace orvane
@@ -76,13 +73,14 @@ std::unique_ptr<RowWriter> makeWriter(ExportFormat format, RowWriter::Output out
 }
 
 // Returns the exit status.
-int exportRecording(const ExportOptions& options)
+int exportRecording(const AppOptions& options)
 {
     Output output;
     const auto writer = makeWriter(
         options.format, [&output](std::string_view lines) { return output.write(lines); });
-    auto progress = progressOnTerminal("Reading " + options.request.file);
-    RecordingExport recordingExport(options.request, *writer, [&progress](double done) {
+    auto progress = progressOnTerminal("Reading " + options.file);
+    ExportRequest request{options.file, options.technology, options.refreshInterval, options.paths};
+    RecordingExport recordingExport(std::move(request), *writer, [&progress](double done) {
         if (progress)
             progress->show(done);
         return isInterrupted == 0;
@@ -99,25 +97,10 @@ int exportRecording(const ExportOptions& options)
 
 } // namespace
 
-int runExport(std::span<const std::string> arguments)
+int runExport(const AppOptions& options)
 {
-    const ExportOptions options = parseExportOptions(arguments);
-    if (options.error) {
-        complain(*options.error);
-        return kUnusableArguments;
-    }
-    if (options.wantsHelp) {
-        std::fputs(exportHelp().c_str(), stdout);
-        return 0;
-    }
     endOnSignals();
-    const ProgramServices services(options.log.get(), stderr);
-    try {
-        return exportRecording(options);
-    } catch (const std::exception& failure) {
-        complain(failure.what());
-        return kFailure;
-    }
+    return exportRecording(options);
 }
 
 } // namespace orvane

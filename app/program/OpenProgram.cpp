@@ -21,7 +21,7 @@ namespace
 
 OpenedRecording opened(const AppOptions& options)
 {
-    OpenedRecording recording = openRecording(*options.open);
+    OpenedRecording recording = openRecording(options.file);
     if (recording.error)
         throw std::runtime_error(*recording.error);
     return recording;
@@ -29,7 +29,7 @@ OpenedRecording opened(const AppOptions& options)
 
 RecordingSettings settingsOf(const AppOptions& options)
 {
-    return {*options.open, options.technology, options.refreshInterval};
+    return {options.file, options.technology, options.refreshInterval};
 }
 
 // Commands of a front end that prints: there is nothing to save.
@@ -49,7 +49,7 @@ int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& lo
 {
     QtMainQueue queue;
     PrintedOutput output(kind, false, loop);
-    auto progress = progressOnTerminal("Reading " + *options.open);
+    auto progress = progressOnTerminal("Reading " + options.file);
     std::unique_ptr<RecordingPrinter> printer;
     printer = std::make_unique<RecordingPrinter>(queue, opened(options), settingsOf(options),
                                                  output.pane(), [&] {
@@ -68,7 +68,7 @@ int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& lo
         return kFailure;
     }
     if (const std::string remark = printer->remark(); printer->hasEnded() && !remark.empty())
-        complain(*options.open + ": " + remark);
+        complain(options.file + ": " + remark);
     return output.exitStatus();
 }
 

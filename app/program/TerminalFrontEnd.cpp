@@ -80,9 +80,9 @@ std::unique_ptr<FrontEnd> makeTerminalFrontEnd(const AppOptions& options, QtEven
 {
     TerminalScreen::Settings settings;
     settings.isSimulated = options.demo.has_value();
-    settings.waitingHint = options.open ? "There is nothing in the recording at this time."
-                           : settings.isSimulated
-                               ? "The simulated phone is starting."
+    settings.waitingHint =
+        options.command == AppCommand::Open ? "There is nothing in the recording at this time."
+        : settings.isSimulated              ? "The simulated phone is starting."
                                : "Start telephonyd on this machine, or leave with q and try a "
                                  "simulated phone: orvane --demo";
     settings.onQuit = [&loop] { loop.quit(); };

@@ -27,9 +27,9 @@ std::unique_ptr<FrontEnd> makeWindowFrontEnd(const AppOptions& options, QtEventL
     QtScreen::Settings settings;
     settings.isSimulated = options.demo.has_value();
     settings.isFullScreen = options.isFullScreen;
-    settings.waitingHint = options.open ? "There is nothing in the recording at this time."
-                           : settings.isSimulated
-                               ? "The simulated phone is starting."
+    settings.waitingHint =
+        options.command == AppCommand::Open ? "There is nothing in the recording at this time."
+        : settings.isSimulated              ? "The simulated phone is starting."
                                : "Start telephonyd on this machine, or try a simulated phone: "
                                  "orvane --demo";
     settings.onClose = [&loop] { loop.quit(); };

@@ -30,9 +30,10 @@ TEST(AppOptionsTest, WithoutArgumentsEverythingHasItsDefault)
     EXPECT_EQ(options.ports, "");
     EXPECT_FALSE(options.root);
     EXPECT_EQ(options.refreshInterval, 2s);
-    ASSERT_TRUE(options.log);
-    EXPECT_TRUE(options.log->accepts(LogPriority::Warning));
-    EXPECT_FALSE(options.log->accepts(LogPriority::Notice));
+    EXPECT_EQ(options.command, AppCommand::Live);
+    const auto log = makeLog(options.log, "orvane");
+    EXPECT_TRUE(log->accepts(LogPriority::Warning));
+    EXPECT_FALSE(log->accepts(LogPriority::Notice));
 }
 
 TEST(AppOptionsTest, TakesEachOption)
@@ -44,6 +45,8 @@ TEST(AppOptionsTest, TakesEachOption)
     EXPECT_EQ(options.ports, "/p");
     EXPECT_EQ(options.root, "/r");
     EXPECT_EQ(options.refreshInterval, 250ms);
+    EXPECT_EQ(options.log.target, LogChoice::Target::None);
+    EXPECT_EQ(options.log.lowest, LogPriority::Info);
 }
 
 TEST(AppOptionsTest, TheDemoIsLteUnlessNamed)
@@ -58,7 +61,7 @@ TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
         std::vector<std::string> arguments;
         const char* part;
     } kMistakes[] = {
-        {{"--demo=mars"},             "--demo takes lte, umts"     },
+        {{"--demo=mars"},             "--demo takes lte or umts"   },
         {{"--demo", "--ports", "/p"}, "--ports cannot be used with"},
         {{"--ui", "hologram"},        "--ui takes"                 },
         {{"--ports="},                "--ports needs"              },
@@ -66,6 +69,7 @@ TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
         {{"--refresh", "0"},          "refresh"                    },
         {{"--refresh", "x"},          "refresh"                    },
         {{"--refresh", "nan"},        "refresh"                    },
+        {{"--format", "csv"},         "orvane export FILE"         },
         {{"--log", "paper"},          "--log takes"                },
         {{"--log-level", "loud"},     "--log-level takes"          },
         {{"--demo", "lte"},           "write --demo=lte"           },
@@ -103,12 +107,14 @@ TEST(AppOptionsTest, ByDefaultAWindowElseTheTerminalElseText)
 
 TEST(AppOptionsTest, HelpNamesEveryOptionAndScenario)
 {
-    const std::string help = appHelp(kScenarios);
+    const std::string help = appHelp(AppCommand::Live, kScenarios);
     for (const char* word : {"--demo", "--ui", "--fullscreen", "--ports", "--root", "--refresh",
                              "--record", "--force", "--log", "--log-level", "--technology",
-                             "--help", "--version", "lte, umts", "Exit status"})
+                             "--help", "--version", "lte or umts", "Exit status"})
         EXPECT_THAT(help, HasSubstr(word));
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
+    EXPECT_TRUE(parsed({"-h"}).wantsHelp);
+    EXPECT_EQ(appHelp(AppCommand::Open, kScenarios), help); // its options are among these
     EXPECT_TRUE(parsed({"--version"}).wantsVersion);
 }
 

@@ -1,4 +1,4 @@
-#include "app/ExportOptions.h"
+// Options of `orvane export FILE`.
 
 #include "app/AppOptions.h"
 #include "platform/base/TelephonyConstants.h"
@@ -15,8 +15,13 @@ using namespace std::chrono_literals;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
+using ::testing::Not;
 
-ExportOptions parsed(std::vector<std::string> arguments) { return parseExportOptions(arguments); }
+AppOptions parsed(std::vector<std::string> arguments)
+{
+    arguments.insert(arguments.begin(), "export");
+    return parseAppOptions(arguments, {});
+}
 std::string errorOf(std::vector<std::string> arguments)
 {
     return parsed(std::move(arguments)).error.value_or("");
@@ -24,20 +29,21 @@ std::string errorOf(std::vector<std::string> arguments)
 
 TEST(ExportOptionsTest, AFileAloneGivesEveryRowAsJsonLines)
 {
-    const ExportOptions options = parsed({"drive.dlf"});
+    const AppOptions options = parsed({"drive.dlf"});
     EXPECT_FALSE(options.error);
-    EXPECT_EQ(options.request.file, "drive.dlf");
-    EXPECT_THAT(options.request.paths, IsEmpty());
-    EXPECT_EQ(options.request.period, 2s);
-    EXPECT_FALSE(options.request.technology);
+    EXPECT_EQ(options.file, "drive.dlf");
+    EXPECT_THAT(options.paths, IsEmpty());
+    EXPECT_EQ(options.refreshInterval, 2s);
+    EXPECT_FALSE(options.technology);
     EXPECT_EQ(options.format, ExportFormat::JsonLines);
-    EXPECT_TRUE(options.log);
+    EXPECT_EQ(options.log.target, LogChoice::Target::Syslog);
+    EXPECT_EQ(options.log.lowest, LogPriority::Warning);
 }
 
 TEST(ExportOptionsTest, WithPathsTheFormatIsCsvUnlessGiven)
 {
-    const ExportOptions options = parsed({"drive.dlf", "/a", "/b/*"});
-    EXPECT_THAT(options.request.paths, ElementsAre("/a", "/b/*"));
+    const AppOptions options = parsed({"drive.dlf", "/a", "/b/*"});
+    EXPECT_THAT(options.paths, ElementsAre("/a", "/b/*"));
     EXPECT_EQ(options.format, ExportFormat::Csv);
     EXPECT_EQ(parsed({"drive.dlf", "/a", "--format", "jsonl"}).format, ExportFormat::JsonLines);
     EXPECT_EQ(parsed({"drive.dlf", "--format=csv"}).format, ExportFormat::Csv);
@@ -46,13 +52,13 @@ TEST(ExportOptionsTest, WithPathsTheFormatIsCsvUnlessGiven)
 
 TEST(ExportOptionsTest, TakesEachOption)
 {
-    const ExportOptions options = parsed(
+    const AppOptions options = parsed(
         {"--every", "0.25", "--technology=utran", "drive.dlf", "--list", "--log", "none", "/a"});
     EXPECT_FALSE(options.error);
-    EXPECT_EQ(options.request.period, 250ms);
-    EXPECT_EQ(options.request.technology, kTSLogChannelTechnology_Varnel_UTRAN2);
+    EXPECT_EQ(options.refreshInterval, 250ms);
+    EXPECT_EQ(options.technology, kTSLogChannelTechnology_Varnel_UTRAN2);
     EXPECT_EQ(options.format, ExportFormat::PathList);
-    EXPECT_THAT(options.request.paths, ElementsAre("/a"));
+    EXPECT_THAT(options.paths, ElementsAre("/a"));
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
 }
 
@@ -69,10 +75,26 @@ TEST(ExportOptionsTest, UnusableArgumentsSayWhatToDo)
         EXPECT_THAT(errorOf({"f", "--every", period}), HasSubstr("--every")) << period;
 }
 
-TEST(ExportOptionsTest, TheCommandIsTheFirstWordOfTheLine)
+TEST(ExportOptionsTest, OptionsMayStandBeforeTheCommand)
 {
     const std::vector<std::string> arguments = {"--log", "none", "export", "f"};
-    EXPECT_THAT(parseAppOptions(arguments, {}).error.value_or(""), HasSubstr("the first word"));
+    const AppOptions options = parseAppOptions(arguments, {});
+    EXPECT_FALSE(options.error);
+    EXPECT_EQ(options.command, AppCommand::Export);
+    EXPECT_EQ(options.file, "f");
+    EXPECT_EQ(options.log.target, LogChoice::Target::None);
+}
+
+TEST(ExportOptionsTest, HelpIsOnTheCommandAlone)
+{
+    EXPECT_TRUE(parsed({"--help"}).wantsHelp);
+    const std::string help = appHelp(AppCommand::Export, {});
+    EXPECT_THAT(help, HasSubstr("Usage: orvane export FILE [OPTION...] [PATH...]\nWrites rows"));
+    for (const char* option : {"--format csv|jsonl", "--every", "--list", "--technology", "--log ",
+                               "--log-level", "--help", "Exit status"})
+        EXPECT_THAT(help, HasSubstr(option));
+    for (const char* option : {"--demo", "--ui", "--ports", "--record"})
+        EXPECT_THAT(help, Not(HasSubstr(option)));
 }
 
 } // namespace

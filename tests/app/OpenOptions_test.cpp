@@ -22,9 +22,10 @@ TEST(OpenOptionsTest, ARecordingIsOpenedInsteadOfTheLiveView)
 {
     const AppOptions options = parsed({"open", "a.dlf"});
     EXPECT_FALSE(options.error);
-    EXPECT_EQ(options.open, "a.dlf");
+    EXPECT_EQ(options.file, "a.dlf");
     EXPECT_FALSE(options.technology);
-    EXPECT_FALSE(parsed({}).open);
+    EXPECT_EQ(options.command, AppCommand::Open);
+    EXPECT_EQ(parsed({}).command, AppCommand::Live);
 }
 
 TEST(OpenOptionsTest, OptionsMayStandAnywhere)
@@ -35,7 +36,7 @@ TEST(OpenOptionsTest, OptionsMayStandAnywhere)
     }) {
         const AppOptions options = parsed(arguments);
         EXPECT_FALSE(options.error) << *options.error;
-        EXPECT_EQ(options.open, "a.dlf");
+        EXPECT_EQ(options.file, "a.dlf");
         EXPECT_EQ(options.technology, kTSLogChannelTechnology_Varnel_GSM);
         EXPECT_EQ(options.refreshInterval, 500ms);
         EXPECT_EQ(options.frontEnd, FrontEndKind::Json);
@@ -44,8 +45,8 @@ TEST(OpenOptionsTest, OptionsMayStandAnywhere)
 
 TEST(OpenOptionsTest, AFileMayHaveAnyName)
 {
-    EXPECT_EQ(parsed({"open", "open"}).open, "open");
-    EXPECT_EQ(parsed({"open", "--", "--demo"}).open, "--demo");
+    EXPECT_EQ(parsed({"open", "open"}).file, "open");
+    EXPECT_EQ(parsed({"open", "--", "--demo"}).file, "--demo");
 }
 
 TEST(OpenOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
@@ -54,16 +55,16 @@ TEST(OpenOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
         std::vector<std::string> arguments;
         const char* error;
     } cases[] = {
-        {{"open"},                             "open needs the name of one recording"          },
-        {{"open", ""},                         "open needs the name of one recording"          },
-        {{"open", "a", "b"},                   "orvane open FILE"                              },
-        {{"open", "a", "--technology", "gsm"}, "--technology takes lte, umts, utran, cdma, cel"},
-        {{"--technology", "lte"},              "orvane open FILE --technology NAME"            },
-        {{"open", "a", "--demo"},              "--demo is for the live view"                   },
-        {{"open", "a", "--ports", "p"},        "--ports is for the live view"                  },
-        {{"open", "a", "--root", "r"},         "--root is for the live view"                   },
-        {{"open", "a", "--record", "r"},       "--record is for the live view"                 },
-        {{"open", "a", "--refresh", "0"},      "--refresh \"0\" is unusable"                   },
+        {{"open"},                             "open needs the name of one recording"       },
+        {{"open", ""},                         "open needs the name of one recording"       },
+        {{"open", "a", "b"},                   "orvane open FILE"                           },
+        {{"open", "a", "--technology", "gsm"}, "takes lte, umts, utran, cdma or cellmonitor"},
+        {{"--technology", "lte"},              "orvane open FILE --technology NAME"         },
+        {{"open", "a", "--demo"},              "--demo is for the live view"                },
+        {{"open", "a", "--ports", "p"},        "--ports is for the live view"               },
+        {{"open", "a", "--root", "r"},         "--root is for the live view"                },
+        {{"open", "a", "--record", "r"},       "--record is for the live view"              },
+        {{"open", "a", "--refresh", "0"},      "--refresh \"0\" is unusable"                },
     };
     for (const auto& each : cases)
         EXPECT_THAT(parsed(each.arguments).error.value_or(""), HasSubstr(each.error));

@@ -33,7 +33,7 @@ TEST(DaemonOptionsTest, ARecordingIsSentAtItsOwnPaceOnceUnlessSaid)
     EXPECT_EQ(plain.speed, 1.0);
     EXPECT_FALSE(plain.loops);
     EXPECT_FALSE(plain.technology);
-    EXPECT_TRUE(plain.log);
+    EXPECT_EQ(plain.log.target, LogChoice::Target::Syslog);
 
     const DaemonOptions full = parsed({"--replay=a.dlf", "--loop", "--speed", "2.5", "--technology",
                                        "umts", "--ports", "/tmp/x", "--log", "none"});
@@ -62,28 +62,28 @@ TEST(DaemonOptionsTest, MistakesAreNamedWithWhatToDo)
         std::vector<std::string> arguments;
         const char* error;
     } cases[] = {
-        {{},                                 "give --demo=SCENARIO, --replay FILE or --messages=NAME"   },
-        {{"--demo", "--replay=x"},           "exclude each other: give one"                             },
-        {{"--demo=nope"},                    "--demo takes lte, other"                                  },
-        {{"--demo", "--messages"},           "exclude each other: give one"                             },
-        {{"--messages", "--replay=x"},       "exclude each other: give one"                             },
-        {{"--messages=gsm"},                 "--messages takes lte, umts, utran or cdma, not \"gsm\""   },
-        {{"--messages=cellmonitor"},         "--messages takes lte"                                     },
-        {{"--messages", "--loop"},           "--loop is for a recording"                                },
-        {{"--demo", "--loop"},               "--loop is for a recording"                                },
-        {{"--demo", "--speed=1"},            "--speed is for a recording"                               },
-        {{"--demo", "--technology=lte"},     "--technology is for a recording"                          },
-        {{"--replay="},                      "--replay needs the name of a recording"                   },
-        {{"--replay=x", "--speed=0"},        "--speed takes a number from 0.001 to 1000"                },
-        {{"--replay=x", "--speed=1000.5"},   "or max, not \"1000.5\""                                   },
-        {{"--replay=x", "--speed="},         "or max, not \"\""                                         },
-        {{"--replay=x", "--speed=nan"},      "or max, not \"nan\""                                      },
-        {{"--replay=x", "--technology=gsm"}, "--technology takes lte, umts"                             },
-        {{"--demo", "--ports="},             "--ports needs the name of a directory"                    },
-        {{"--demo", "--log=file"},           "--log takes"                                              },
-        {{"--demo", "--log-level=loud"},     "--log-level takes"                                        },
-        {{"--demo", "x.dlf"},                "\"x.dlf\" is no option: give a recording as --replay FILE"},
-        {{"--demos"},                        "unknown option --demos"                                   },
+        {{},                                 "give --demo=SCENARIO, --replay FILE or --messages=NAME"       },
+        {{"--demo", "--replay=x"},           "exclude each other: give one"                                 },
+        {{"--demo=nope"},                    "--demo takes lte or other"                                    },
+        {{"--demo", "--messages"},           "exclude each other: give one"                                 },
+        {{"--messages", "--replay=x"},       "exclude each other: give one"                                 },
+        {{"--messages=gsm"},                 "--messages takes lte, umts, utran or cdma, not \"gsm\""       },
+        {{"--messages=cellmonitor"},         "--messages takes lte"                                         },
+        {{"--messages", "--loop"},           "--loop is for a recording"                                    },
+        {{"--demo", "--loop"},               "--loop is for a recording"                                    },
+        {{"--demo", "--speed=1"},            "--speed is for a recording"                                   },
+        {{"--demo", "--technology=lte"},     "--technology is for a recording"                              },
+        {{"--replay="},                      "--replay needs the name of a file"                            },
+        {{"--replay=x", "--speed=0"},        "give a number from 0.001 to 1000 or max"                      },
+        {{"--replay=x", "--speed=1000.5"},   "--speed \"1000.5\" is unusable"                               },
+        {{"--replay=x", "--speed="},         "--speed \"\" is unusable"                                     },
+        {{"--replay=x", "--speed=nan"},      "--speed \"nan\" is unusable"                                  },
+        {{"--replay=x", "--technology=gsm"}, "--technology takes lte, umts"                                 },
+        {{"--demo", "--ports="},             "--ports needs the name of a directory"                        },
+        {{"--demo", "--log=file"},           "--log takes"                                                  },
+        {{"--demo", "--log-level=loud"},     "--log-level takes"                                            },
+        {{"--demo", "x.dlf"},                "\"x.dlf\" is not an option: give a recording as --replay FILE"},
+        {{"--demos"},                        "unknown option --demos"                                       },
     };
     for (const auto& each : cases)
         EXPECT_THAT(parsed(each.arguments).error.value_or("no error"), HasSubstr(each.error));
@@ -96,7 +96,7 @@ TEST(DaemonOptionsTest, HelpAndVersionNeedNothingElse)
     EXPECT_FALSE(parsed({"--version"}).error);
     const std::vector<std::string> scenarios = {"lte", "other"};
     for (const char* option : {"--demo", "--replay", "--messages", "--technology", "--speed",
-                               "--loop", "--ports", "--log ", "--log-level", "lte, other"})
+                               "--loop", "--ports", "--log ", "--log-level", "lte or other"})
         EXPECT_THAT(daemonHelp(scenarios), HasSubstr(option));
 }
 
