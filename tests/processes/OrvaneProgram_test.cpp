@@ -132,6 +132,7 @@ TEST_P(MisbehavingServerTest, IsToldInTheLogAndTriedAgain)
     const auto viewer = orvane({"--ui", "json"});
     EXPECT_TRUE(viewer->waitForError(std::string("error: ") + GetParam().line + "\n"))
         << viewer->errors();
+    EXPECT_TRUE(viewer->waitForText(kWaitingLine));
     viewer->writeLine("quit");
     EXPECT_EQ(viewer->waitForEnd(), 0);
     EXPECT_THAT(viewer->lines(), ElementsAre(kFirstLine, kWaitingLine));

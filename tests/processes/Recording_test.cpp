@@ -11,6 +11,7 @@
 #include <csignal>
 #include <filesystem>
 #include <memory>
+#include <thread>
 
 namespace orvane
 {
@@ -83,6 +84,17 @@ protected:
                 return false;
         return true;
     }
+    // Once the recording is longer than that.
+    bool waitForMoreThan(std::size_t bytes) const
+    {
+        const auto deadline = std::chrono::steady_clock::now() + 30s;
+        while (recorded().size() <= bytes) {
+            if (std::chrono::steady_clock::now() > deadline)
+                return false;
+            std::this_thread::sleep_for(10ms);
+        }
+        return true;
+    }
     [[nodiscard]] std::string root() const { return directory.path() + "/root"; }
     [[nodiscard]] Bytes recorded() const { return readFile(file).value_or(Bytes()); }
 
@@ -135,7 +147,7 @@ TEST_F(RecordingProgramTest, AReconnectionGoesOnInTheSameFile)
     ASSERT_GT(before, kDlfVersionReportBytes);
     server = telephonyd({"--demo=utran"});
     ASSERT_TRUE(viewer->waitForText("\"name\":\"RRC Info\""));
-    EXPECT_GT(recorded().size(), before);
+    EXPECT_TRUE(waitForMoreThan(before));
     EXPECT_THAT(viewer->errors(), Not(HasSubstr("ecord")));
 }
 

@@ -18,6 +18,16 @@ protected:
     {
         return loop.runUntil(done, std::chrono::seconds{30});
     }
+    // Tries until one attempt succeeds, for what a busy machine may hinder now and then.
+    static bool eventually(const std::function<bool()>& attempt)
+    {
+        const auto end = std::chrono::steady_clock::now() + std::chrono::seconds{30};
+        do {
+            if (attempt())
+                return true;
+        } while (std::chrono::steady_clock::now() < end);
+        return false;
+    }
     // Serves whatever there is to serve now.
     void turnOnce()
     {

@@ -8,6 +8,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <csignal>
 #include <filesystem>
 #include <iterator>
@@ -20,6 +21,7 @@ namespace
 {
 
 using namespace std::chrono_literals;
+using ::testing::AllOf;
 using ::testing::EndsWith;
 using ::testing::HasSubstr;
 using ::testing::Not;
@@ -87,6 +89,36 @@ protected:
         if (hasFolder)
             fs::create_directories(root() + kSaveFolder);
     }
+    // The program sends a picture of the screen in pieces: whatever a test expects to see, it waits
+    // for.
+    static void expectShown(VirtualTerminal& terminal, const std::string& text)
+    {
+        EXPECT_TRUE(terminal.waitFor(text)) << text << " is not in\n" << terminal.screen();
+    }
+    static void expectGone(VirtualTerminal& terminal, const std::string& text)
+    {
+        EXPECT_TRUE(terminal.waitForNo(text)) << text << " is still in\n" << terminal.screen();
+    }
+    static void expectLine(VirtualTerminal& terminal, int number,
+                           const ::testing::Matcher<std::string>& matcher)
+    {
+        terminal.waitUntil([&] { return matcher.Matches(terminal.line(number)); });
+        EXPECT_THAT(terminal.line(number), matcher);
+    }
+    // Sends the key until the text is shown; for keys that a program may still drop. Each is left
+    // that time before the next.
+    static bool sendUntilShown(VirtualTerminal& terminal, const std::string& key,
+                               const std::string& text, std::chrono::milliseconds pause)
+    {
+        const auto end = std::chrono::steady_clock::now() + VirtualTerminal::kPatience;
+        do {
+            terminal.send(key);
+            if (terminal.waitUntil([&] { return terminal.shows(text); }, pause))
+                return true;
+        } while (std::chrono::steady_clock::now() < end);
+        return false;
+    }
+    // For a program that has ended: nothing is sent any more.
     static void expectRestored(const VirtualTerminal& terminal)
     {
         EXPECT_FALSE(terminal.isOnOtherScreen());
@@ -113,17 +145,19 @@ TEST_F(TerminalProgramTest, APersonBrowsesToAValueAndBackAndQuits)
 {
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
-    EXPECT_THAT(terminal->line(0), StartsWith(" Orvane"));
-    EXPECT_THAT(terminal->line(0), EndsWith("simulated phone"));
-    EXPECT_TRUE(terminal->isOnOtherScreen());
-    EXPECT_FALSE(terminal->isCursorVisible());
-    EXPECT_TRUE(terminal->tellsOfMouse());
+    expectLine(*terminal, 0, AllOf(StartsWith(" Orvane"), EndsWith("simulated phone")));
+    EXPECT_TRUE(terminal->waitUntil([&] {
+        return terminal->isOnOtherScreen() && !terminal->isCursorVisible() &&
+               terminal->tellsOfMouse();
+    }));
     terminal->send(std::string(kDown) + kEnter);
     ASSERT_TRUE(terminal->waitFor("Measured RSRP"));
-    EXPECT_THAT(terminal->line(0), StartsWith(" Orvane › Serving Cell Measurements"));
+    expectLine(*terminal, 0, StartsWith(" Orvane › Serving Cell Measurements"));
     terminal->send(kLeft);
     ASSERT_TRUE(terminal->waitFor("Neighbor Cells List"));
-    EXPECT_TRUE(terminal->isReversed("Serving Cell Measurements")) << "still selected";
+    EXPECT_TRUE(terminal->waitUntil([&] {
+        return terminal->isReversed("Serving Cell Measurements");
+    })) << "still selected";
     terminal->send("q");
     EXPECT_EQ(terminal->waitForEnd(), 0);
     expectRestored(*terminal);
@@ -133,12 +167,18 @@ TEST_F(TerminalProgramTest, EscapeLeadsBackWithoutNoticeableDelay)
 {
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
-    terminal->send(kRight);
-    ASSERT_TRUE(terminal->waitFor("Tracking Area Code"));
-    const auto start = std::chrono::steady_clock::now();
-    terminal->send(kEscape);
-    ASSERT_TRUE(terminal->waitFor("Neighbor Cells List"));
-    EXPECT_LT(std::chrono::steady_clock::now() - start, 500ms) << "ncurses' own would be a second";
+    // On a busy machine one round may take long; with ncurses' own delay each takes a second.
+    constexpr int kRounds = 20;
+    auto shortest = std::chrono::steady_clock::duration::max();
+    for (int round = 0; round < kRounds && shortest >= 500ms; ++round) {
+        terminal->send(kRight);
+        ASSERT_TRUE(terminal->waitFor("Tracking Area Code"));
+        const auto start = std::chrono::steady_clock::now();
+        terminal->send(kEscape);
+        ASSERT_TRUE(terminal->waitFor("Neighbor Cells List"));
+        shortest = std::min(shortest, std::chrono::steady_clock::now() - start);
+    }
+    EXPECT_LT(shortest, 500ms);
 }
 
 TEST_F(TerminalProgramTest, KeysWithoutAMeaningDoNothing)
@@ -166,9 +206,8 @@ TEST_F(TerminalProgramTest, AnEndlessAnswerDoesNotKeepTheKeysForEver)
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     terminal->send(kEscape + ("]" + std::string(2000, 'x')));
-    terminal->waitUntil([] { return false; }, 200ms);
-    terminal->send("?");
-    ASSERT_TRUE(terminal->waitFor("filter as you type"));
+    // The answer ends with a pause of the keys.
+    EXPECT_TRUE(sendUntilShown(*terminal, "?", "filter as you type", 500ms)) << terminal->screen();
 }
 
 TEST_F(TerminalProgramTest, TheCodesOfOtherTerminalsForTheSameKeysWorkToo)
@@ -201,8 +240,7 @@ TEST_F(TerminalProgramTest, APasteWhoseEndIsLostEndsWithAPause)
     terminal->send("\x1b[200~xyz?");
     EXPECT_FALSE(
         terminal->waitUntil([&] { return terminal->shows("filter as you type"); }, 1200ms));
-    terminal->send("?");
-    ASSERT_TRUE(terminal->waitFor("filter as you type"));
+    EXPECT_TRUE(sendUntilShown(*terminal, "?", "filter as you type", 2000ms)) << terminal->screen();
 }
 
 TEST_F(TerminalProgramTest, ControlCEndsItInOrderAlsoWithinAPaste)
@@ -222,11 +260,11 @@ TEST_F(TerminalProgramTest, TheFilterNarrowsTheRows)
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     terminal->send("/neigh");
     ASSERT_TRUE(terminal->waitFor("Filter: neigh"));
-    EXPECT_FALSE(terminal->shows("Serving Cell Info"));
-    EXPECT_TRUE(terminal->shows("Neighbor Cells List"));
-    EXPECT_TRUE(terminal->isCursorVisible());
+    expectGone(*terminal, "Serving Cell Info");
+    expectShown(*terminal, "Neighbor Cells List");
+    EXPECT_TRUE(terminal->waitUntil([&] { return terminal->isCursorVisible(); }));
     terminal->send(kEscape);
-    EXPECT_TRUE(terminal->waitFor("Serving Cell Info"));
+    expectShown(*terminal, "Serving Cell Info");
 }
 
 TEST_F(TerminalProgramTest, AResizeIsFollowed)
@@ -243,7 +281,7 @@ TEST_F(TerminalProgramTest, AResizeIsFollowed)
         return columnsOf(terminal->line(0)) == 299 && terminal->shows("PDP Context Info") &&
                terminal->line(99).find("q quit") != std::string::npos;
     })) << terminal->screen();
-    EXPECT_TRUE(terminal->shows("Serving Cell Info"));
+    expectShown(*terminal, "Serving Cell Info");
 }
 
 TEST_F(TerminalProgramTest, ASnapshotIsSavedWithADescription)
@@ -272,10 +310,10 @@ TEST_F(TerminalProgramTest, WithoutTheFolderTheAlertIsShown)
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     terminal->send(std::string("s") + kEnter + kEnter);
     ASSERT_TRUE(terminal->waitFor("File Error"));
-    EXPECT_TRUE(terminal->shows("Unable to write file to disk"));
-    EXPECT_TRUE(terminal->shows("[ Close ]"));
+    expectShown(*terminal, "Unable to write file to disk");
+    expectShown(*terminal, "[ Close ]");
     terminal->send(kEnter);
-    EXPECT_TRUE(terminal->waitForNo("File Error"));
+    expectGone(*terminal, "File Error");
 }
 
 TEST_F(TerminalProgramTest, AnAbsentServerIsWaitedForAndAKilledOneShows)
@@ -290,7 +328,7 @@ TEST_F(TerminalProgramTest, AnAbsentServerIsWaitedForAndAKilledOneShows)
     EXPECT_FALSE(terminal->shows("simulated phone"));
     server->sendSignal(SIGKILL);
     ASSERT_TRUE(terminal->waitFor("Connecting..."));
-    EXPECT_TRUE(terminal->shows("Serving Cell Info")) << "rows stay";
+    expectShown(*terminal, "Serving Cell Info"); // rows stay
     const std::string status = terminal->line(22);
     EXPECT_TRUE(terminal->waitUntil([&] { return terminal->line(22) != status; })) << "it turns";
     server = startServer();
@@ -303,20 +341,19 @@ TEST_F(TerminalProgramTest, ARefreshOfTheServingMeasurementsSendsLittle)
     ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
     terminal->send(std::string(kDown) + kEnter);
     ASSERT_TRUE(terminal->waitFor("Measured RSRP"));
-    constexpr int kRefreshes = 20;
-    std::size_t most = 0;
-    std::size_t before = terminal->received().size();
-    const std::size_t first = before;
-    for (int i = 0; i < kRefreshes; ++i) {
-        // One refresh is one burst: what comes within a fraction of the period.
-        ASSERT_TRUE(terminal->waitUntil([&] { return terminal->received().size() > before; }));
-        terminal->waitUntil([] { return false; }, 60ms);
-        most = std::max(most, terminal->received().size() - before);
-        before = terminal->received().size();
+    // Until the status has told of five further seconds. There can't have been more refreshes than
+    // periods; a busy machine makes fewer.
+    const auto start = std::chrono::steady_clock::now();
+    const std::size_t before = terminal->received().size();
+    for (int i = 0; i < 5; ++i) {
+        const std::string status = terminal->line(22);
+        ASSERT_TRUE(terminal->waitUntil([&] { return terminal->line(22) != status; }));
     }
-    RecordProperty("BytesARefresh", static_cast<int>((before - first) / kRefreshes));
-    RecordProperty("MostBytesARefresh", static_cast<int>(most));
-    EXPECT_LT(most, 2048U);
+    const auto refreshes =
+        static_cast<std::size_t>((std::chrono::steady_clock::now() - start) / 200ms) + 1;
+    const std::size_t bytes = (terminal->received().size() - before) / refreshes;
+    RecordProperty("BytesARefresh", static_cast<int>(bytes));
+    EXPECT_LT(bytes, 512U);
 }
 
 TEST_F(TerminalProgramTest, ChangedValuesAreMarked)
@@ -337,12 +374,13 @@ TEST_F(TerminalProgramTest, WithNoColorNothingIsColoured)
 {
     const auto terminal = startDemo({"NO_COLOR=1"});
     ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
+    EXPECT_TRUE(terminal->waitUntil([&] { return terminal->isReversed("Orvane"); }));
     EXPECT_FALSE(terminal->isColoured("Orvane"));
-    EXPECT_TRUE(terminal->isReversed("Orvane"));
+    expectShown(*terminal, "quit");
     EXPECT_FALSE(terminal->isColoured("quit"));
     const auto inColour = startDemo();
     ASSERT_TRUE(inColour->waitFor("Serving Cell Measurements"));
-    EXPECT_TRUE(inColour->isColoured("Orvane"));
+    EXPECT_TRUE(inColour->waitUntil([&] { return inColour->isColoured("Orvane"); }));
 }
 
 TEST_F(TerminalProgramTest, WithoutUtf8OnlyAsciiIsSent)
@@ -373,12 +411,12 @@ TEST_F(TerminalProgramTest, ControlZGivesTheTerminalBackAndTheShellContinues)
     ASSERT_TRUE(shell->waitFor("Serving Cell Info"));
     shell->send(kControlZ);
     ASSERT_TRUE(shell->waitFor("Stopped")) << shell->screen();
-    EXPECT_FALSE(shell->isOnOtherScreen());
-    EXPECT_FALSE(shell->tellsOfMouse());
+    EXPECT_TRUE(
+        shell->waitUntil([&] { return !shell->isOnOtherScreen() && !shell->tellsOfMouse(); }));
     shell->send(std::string("fg") + kEnter);
     ASSERT_TRUE(shell->waitUntil(
         [&] { return shell->isOnOtherScreen() && shell->shows("Serving Cell Info"); }));
-    EXPECT_FALSE(shell->isInLineMode());
+    EXPECT_TRUE(shell->waitUntil([&] { return !shell->isInLineMode(); }));
     shell->send(kEnter);
     ASSERT_TRUE(shell->waitFor("Tracking Area Code"));
     shell->send("q");
@@ -409,7 +447,7 @@ TEST_F(TerminalProgramTest, InTheBackgroundItLeavesTheTerminalToTheShellUntilItI
     ASSERT_TRUE(shell->waitFor("Stopped"));
     shell->send(std::string("bg; sleep 0.5; jobs; echo do''ne") + kEnter);
     ASSERT_TRUE(shell->waitFor("done")) << shell->screen();
-    EXPECT_TRUE(shell->shows("Running")) << shell->screen();
+    expectShown(*shell, "Running");
     EXPECT_FALSE(shell->isOnOtherScreen());
     shell->send(std::string("fg") + kEnter);
     ASSERT_TRUE(shell->waitUntil([&] {
@@ -479,11 +517,10 @@ TEST_P(TerminalKindTest, ShowsThePanesAndIsRestored)
 {
     const auto terminal = startDemo({std::string("TERM=") + GetParam()});
     ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
-    EXPECT_THAT(terminal->line(0), StartsWith(" Orvane"));
-    EXPECT_THAT(terminal->line(0), EndsWith("simulated phone"));
+    expectLine(*terminal, 0, AllOf(StartsWith(" Orvane"), EndsWith("simulated phone")));
     terminal->send(kEnter);
     ASSERT_TRUE(terminal->waitFor("Tracking Area Code"));
-    EXPECT_THAT(terminal->line(23), HasSubstr("q quit"));
+    expectLine(*terminal, 23, HasSubstr("q quit"));
     terminal->send("h");
     ASSERT_TRUE(terminal->waitFor("Neighbor Cells List"));
     terminal->send("q");

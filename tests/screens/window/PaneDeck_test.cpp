@@ -2,15 +2,46 @@
 
 #include "screens/window/WindowTest.h"
 
+#include <QAnimationDriver>
 #include <QApplication>
 #include <QPointer>
 #include <QStyle>
+
+#include <chrono>
 
 namespace orvane
 {
 
 namespace
 {
+
+using namespace std::chrono_literals;
+
+// Animations that go on only when a test says so.
+class SteppedAnimations final : public QAnimationDriver
+{
+public:
+    SteppedAnimations() { install(); }
+    ~SteppedAnimations() override { uninstall(); }
+
+    void step(std::chrono::milliseconds time)
+    {
+        _elapsed += time;
+        advanceAnimation();
+    }
+    [[nodiscard]] qint64 elapsed() const override { return _elapsed.count(); }
+
+protected:
+    // Qt counts from the start of the first animation of several.
+    void start() override
+    {
+        _elapsed = {};
+        QAnimationDriver::start();
+    }
+
+private:
+    std::chrono::milliseconds _elapsed{0};
+};
 
 class PaneDeckTest : public WindowTest
 {
@@ -25,6 +56,16 @@ protected:
         show(rootNode({groupNode("Group", {valueNode("Key", "1")})}));
     }
     [[nodiscard]] PaneDeck& deck() const { return frame().deck(); }
+    // Steps to the end of a slide.
+    void endSlide()
+    {
+        for (int i = 0; i < 100 && deck().isSliding(); ++i)
+            animations.step(16ms);
+        turnEvents();
+        EXPECT_FALSE(deck().isSliding());
+    }
+
+    SteppedAnimations animations;
 };
 
 TEST_F(PaneDeckTest, PushedPaneSlidesInFromTheRight)
@@ -32,9 +73,12 @@ TEST_F(PaneDeckTest, PushedPaneSlidesInFromTheRight)
     PaneWidget* const before = deck().top();
     clickRow(0);
     ASSERT_TRUE(deck().isSliding());
+    const int start = topPane().x();
+    animations.step(50ms);
+    EXPECT_LT(topPane().x(), start);
     EXPECT_GT(topPane().x(), 0);
     EXPECT_TRUE(before->isVisible());
-    EXPECT_TRUE(turnEventsUntil([&] { return !deck().isSliding(); }));
+    endSlide();
     EXPECT_EQ(topPane().x(), 0);
     EXPECT_FALSE(before->isVisible());
 }
@@ -42,13 +86,14 @@ TEST_F(PaneDeckTest, PushedPaneSlidesInFromTheRight)
 TEST_F(PaneDeckTest, PoppedPaneSlidesAwayAndIsGone)
 {
     clickRow(0);
-    ASSERT_TRUE(turnEventsUntil([&] { return !deck().isSliding(); }));
+    endSlide();
     const QPointer<PaneWidget> leaving = deck().top();
     frame().goBack();
     turnEvents();
     ASSERT_TRUE(deck().isSliding());
     EXPECT_TRUE(leaving->isVisible());
-    EXPECT_TRUE(turnEventsUntil([&] { return leaving.isNull(); }));
+    endSlide();
+    EXPECT_TRUE(leaving.isNull());
     EXPECT_EQ(topPane().x(), 0);
     EXPECT_TRUE(topPane().isVisible());
 }
@@ -67,7 +112,7 @@ TEST_F(PaneDeckTest, GoingBackWhileSlidingEndsAtTheRoot)
     ASSERT_TRUE(deck().isSliding());
     frame().goBack();
     turnEvents();
-    EXPECT_TRUE(turnEventsUntil([&] { return !deck().isSliding(); }));
+    endSlide();
     EXPECT_EQ(title(), "Orvane");
     EXPECT_EQ(topPane().x(), 0);
 }
