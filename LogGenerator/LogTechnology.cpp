@@ -7,6 +7,7 @@
 #include "platform/base/Bytes.h"
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"
+#include "platform/base/Technology.h"
 #include "platform/base/TelephonyConstants.h"
 
 #include <set>
@@ -16,19 +17,6 @@ namespace orvane
 
 namespace
 {
-
-struct Technology {
-    const char* name;
-    const char* constant;
-};
-
-constexpr Technology kTechnologies[] = {
-    {"lte",         kTSLogChannelTechnology_Varnel_LTE   },
-    {"umts",        kTSLogChannelTechnology_Varnel_GSM   },
-    {"utran",       kTSLogChannelTechnology_Varnel_UTRAN2},
-    {"cdma",        kTSLogChannelTechnology_Varnel_CDMA  },
-    {"cellmonitor", kTSLogChannelTechnology_IFX          },
-};
 
 std::set<std::uint16_t> codesOf(const LogGenerator& generator)
 {
@@ -80,30 +68,6 @@ std::optional<std::string> technologyOfLog(ByteView file)
     while (const auto item = reader.next())
         finder.take(*item);
     return finder.technology();
-}
-
-std::optional<std::string> technologyNamed(std::string_view name)
-{
-    for (const Technology& technology : kTechnologies)
-        if (name == technology.name)
-            return technology.constant;
-    return std::nullopt;
-}
-
-std::string nameOfTechnology(std::string_view constant)
-{
-    for (const Technology& technology : kTechnologies)
-        if (constant == technology.constant)
-            return technology.name;
-    return "";
-}
-
-std::string technologyNames()
-{
-    std::string names;
-    for (const Technology& technology : kTechnologies)
-        names += (names.empty() ? "" : ", ") + std::string(technology.name);
-    return names;
 }
 
 } // namespace orvane

@@ -6,7 +6,6 @@
 #include <cstdint>
 #include <optional>
 #include <string>
-#include <string_view>
 #include <unordered_map>
 
 namespace orvane
@@ -29,13 +28,5 @@ private:
 
 // The technology of a whole recording.
 std::optional<std::string> technologyOfLog(ByteView file);
-
-// The technology constant for its name on the command line: "lte", "umts", "utran", "cdma" or
-// "cellmonitor". Nothing for any other text.
-std::optional<std::string> technologyNamed(std::string_view name);
-// The name of a technology constant; empty for any other text.
-std::string nameOfTechnology(std::string_view constant);
-// All those names, as a text for people.
-std::string technologyNames();
 
 } // namespace orvane

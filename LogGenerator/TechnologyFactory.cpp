@@ -13,12 +13,12 @@ namespace orvane
 namespace
 {
 
-struct Technology {
-    const char* identifier;
+struct Factory {
+    const char* technology;
     std::unique_ptr<LogGenerator> (*generator)();
 };
 
-constexpr Technology kTechnologies[] = {
+constexpr Factory kFactories[] = {
     {kTSLogChannelTechnology_IFX,           GSMLogGenerator::generator    },
     {kTSLogChannelTechnology_Varnel_GSM,    VRN_GSMLogGenerator::generator},
     {kTSLogChannelTechnology_Varnel_CDMA,   C2KLogGenerator::generator    },
@@ -33,8 +33,8 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(const Proper
     const std::string* identifier = technology.asString();
     if (!identifier)
         return nullptr;
-    for (const Technology& known : kTechnologies)
-        if (*identifier == known.identifier)
+    for (const Factory& known : kFactories)
+        if (*identifier == known.technology)
             return known.generator();
     return nullptr;
 }

@@ -1,6 +1,7 @@
 #include "dlf/DlfReader.h"
 
 #include "dlf/DlfTime.h"
+#include "platform/base/LogMessage.h"
 #include "platform/base/PacketView.h"
 
 #include <algorithm>
@@ -12,9 +13,6 @@ namespace
 {
 
 constexpr std::size_t kHeaderBytes = 12;
-constexpr std::uint8_t kModemType = 1;
-constexpr std::uint8_t kServerType = 0xFF;
-constexpr std::uint8_t kWrapper = 0x81;
 constexpr std::uint16_t kFirstModemCode = 0x1000;
 
 // No question reaches further from the cursor: an item (of at most 64 KiB and its separator), the
@@ -24,7 +22,7 @@ constexpr std::size_t kReach = 4 * 65536;
 constexpr std::uint64_t kHour = 3600 * kDlfStepsPerSecond;
 constexpr std::uint64_t kMonth = 30 * 24 * kHour;
 
-bool isType(std::optional<std::uint64_t> byte) { return byte == kModemType || byte == kServerType; }
+bool isType(std::optional<std::uint64_t> byte) { return byte == kModemItem || byte == kServerItem; }
 
 } // namespace
 
@@ -78,14 +76,14 @@ std::optional<DlfReader::Start> DlfReader::firstStart(std::uint64_t from, bool f
             start.reset();
         return start;
     };
-    if (auto start = accepted(0, kModemType))
+    if (auto start = accepted(0, kModemItem))
         return start;
     const auto first = unsignedAt(from, 1);
     if (isType(first))
         if (auto start = accepted(1, *first))
-            if (followsItem || first != kServerType || start->code < kFirstModemCode)
+            if (followsItem || first != kServerItem || start->code < kFirstModemCode)
                 return start;
-    if (first == kWrapper)
+    if (first == kLogWrapper)
         if (const auto third = unsignedAt(from + 2, 1); isType(third))
             if (auto start = accepted(3, *third))
                 return start;
@@ -117,7 +115,7 @@ bool DlfReader::hasVouchedStart(std::uint64_t from, std::uint64_t end)
     while (!_vouchedStarts.empty() && _vouchedStarts.front() < _cursor)
         _vouchedStarts.pop_front();
     for (_searchedTo = std::max(_searchedTo, _cursor); _searchedTo < end; ++_searchedTo) {
-        const auto start = fitting(_searchedTo, 0, kModemType);
+        const auto start = fitting(_searchedTo, 0, kModemItem);
         if (start && isVouchedFor(*start))
             _vouchedStarts.push_back(_searchedTo);
     }

@@ -1,5 +1,7 @@
 #include "dlf/DlfTime.h"
 
+#include "platform/base/LogMessage.h"
+
 #include <cmath>
 #include <limits>
 
@@ -9,7 +11,7 @@ namespace orvane
 namespace
 {
 
-constexpr double kSecondsFrom1970To1980 = 315964800; // 1980-01-06 00:00:00 UTC
+constexpr double kEpoch = kLogEpochSeconds;
 constexpr double kFractionsPerStep = 65536;
 constexpr double kSteps = 281474976710656.0; // 2 to the 48th
 
@@ -28,12 +30,12 @@ double dlfSecondsSince1970(std::uint64_t timestamp)
     // The step and its fraction apart: 64 bits in one go would not fit a double.
     const double steps = static_cast<double>(timestamp >> 16);
     const double fraction = static_cast<double>(timestamp & 0xFFFF) / kFractionsPerStep;
-    return kSecondsFrom1970To1980 + (steps + fraction) / kDlfStepsPerSecond;
+    return kEpoch + (steps + fraction) / kDlfStepsPerSecond;
 }
 
 std::uint64_t dlfTimestamp(double secondsSince1970)
 {
-    const double steps = (secondsSince1970 - kSecondsFrom1970To1980) * kDlfStepsPerSecond;
+    const double steps = (secondsSince1970 - kEpoch) * kDlfStepsPerSecond;
     if (!(steps > 0))
         return 0;
     if (steps >= kSteps)

@@ -2,6 +2,7 @@
 
 #include "dlf/DlfReader.h"
 #include "dlf/DlfTime.h"
+#include "platform/base/LogMessage.h"
 
 #include <cstdint>
 #include <cstdlib>
@@ -33,7 +34,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         placed += item->bytes.size();
         require(placed == reader.placedBytes());
         require(placed + reader.separatorBytes() + reader.unplacedBytes() == end);
-        require(orvane::dlfSecondsSince1970(item->timestamp) >= 315964800.0);
+        require(orvane::dlfSecondsSince1970(item->timestamp) >= orvane::kLogEpochSeconds);
     }
     require(!reader.next());
     require(placed + reader.separatorBytes() + reader.unplacedBytes() == size);

@@ -2,6 +2,7 @@
 
 #include "dlf/DlfTime.h"
 #include "dlf/DlfWriter.h"
+#include "platform/base/Technology.h"
 #include "recordings/LogSlice.h"
 
 #include <algorithm>

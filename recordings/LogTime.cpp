@@ -1,6 +1,7 @@
 #include "recordings/LogTime.h"
 
 #include "platform/base/Calendar.h"
+#include "platform/base/LogMessage.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -17,7 +18,7 @@ using std::chrono::milliseconds;
 
 using Step = std::chrono::duration<std::int64_t, std::ratio<1, 800>>;
 
-constexpr milliseconds kFrom1970To1980{315964800000}; // 1980-01-06 00:00:00 UTC
+constexpr std::chrono::seconds kEpoch{kLogEpochSeconds};
 constexpr std::uint64_t kMostSteps =
     static_cast<std::uint64_t>(std::chrono::duration_cast<Step>(LogTime::max() / 2).count());
 
@@ -62,7 +63,7 @@ std::int64_t LogClock::millisecondsSince1970(LogTime time) const
     // In quarters of a millisecond, which is what both parts are whole numbers of.
     using Quarter = std::chrono::duration<std::int64_t, std::ratio<1, 4000>>;
     const Quarter first{static_cast<std::int64_t>(_firstStep) * 5};
-    return (kFrom1970To1980 + floor<milliseconds>(first + floor<Quarter>(time))).count();
+    return (kEpoch + floor<milliseconds>(first + floor<Quarter>(time))).count();
 }
 
 } // namespace orvane

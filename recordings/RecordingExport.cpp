@@ -1,6 +1,7 @@
 #include "recordings/RecordingExport.h"
 
 #include "platform/base/PropertyValue.h"
+#include "platform/base/Technology.h"
 #include "recordings/LogSurvey.h"
 
 #include <utility>

@@ -15,6 +15,11 @@ namespace orvane
 constexpr std::size_t kLogHeaderBytes = 13;
 constexpr std::uint8_t kModemItem = 1;
 constexpr std::uint8_t kServerItem = 0xFF; // made by the telephony server itself
+constexpr std::uint8_t kLogWrapper = 0x81;
+constexpr std::size_t kLogWrapperBytes = 2;
+
+// Timestamps count from 1980-01-06 00:00:00 UTC, which is so many seconds after 1970.
+constexpr std::int64_t kLogEpochSeconds = 315964800;
 
 // Codes of the server's items begin here: 0xFF0000 plus the 16-bit code.
 constexpr std::uint32_t kExtendedCodes = 0xFF0000;
@@ -26,9 +31,7 @@ constexpr std::uint32_t kPdpContextsCode = kExtendedCodes + 2;
 // back may be shorter by the wrapper.
 inline ByteView unwrappedMessage(ByteView message)
 {
-    constexpr std::uint8_t kWrapper = 0x81;
-    constexpr std::size_t kWrapperBytes = 2;
-    return message[0] == kWrapper ? message.subspan(kWrapperBytes) : message;
+    return message[0] == kLogWrapper ? message.subspan(kLogWrapperBytes) : message;
 }
 
 // The effective log code of an unwrapped message.

@@ -1,6 +1,7 @@
 #include "telephonyd/phone/PhoneSource.h"
 
 #include "platform/base/Bytes.h"
+#include "platform/base/LogMessage.h"
 #include "platform/services/Services.h"
 #include "telephonyd/phone/PacketWriter.h"
 
@@ -10,9 +11,6 @@ namespace orvane
 namespace
 {
 
-constexpr std::uint8_t kModemItem = 1;
-constexpr std::uint8_t kServerItem = 0xFF;
-constexpr std::uint8_t kWrapper = 0x81;
 // The item's length, code and timestamp; the type byte before them does not count as the item's.
 constexpr std::size_t kItemHeaderBytes = 12;
 
@@ -52,7 +50,7 @@ Bytes PhoneSource::logMessage(const PhoneMessage& message)
     const std::uint64_t timestamp = logTimestamp(Services::current().clock().secondsSince1970());
     PacketWriter writer;
     if (++_sent % kWrapEvery == 0)
-        writer.put8(kWrapper).put8(0);
+        writer.put8(kLogWrapper).put8(0);
     writer.put8(message.kind == PhoneMessage::Kind::Modem ? kModemItem : kServerItem)
         .put16(static_cast<std::uint32_t>(kItemHeaderBytes + message.payload.size()))
         .put16(message.code)
@@ -64,9 +62,9 @@ Bytes PhoneSource::logMessage(const PhoneMessage& message)
 
 std::uint64_t logTimestamp(double secondsSince1970)
 {
-    constexpr double kSeconds1970To1980 = 315964800;
     constexpr double kTicksPerSecond = 800 * 65536.0;
-    const double ticks = (secondsSince1970 - kSeconds1970To1980) * kTicksPerSecond;
+    const double ticks =
+        (secondsSince1970 - static_cast<double>(kLogEpochSeconds)) * kTicksPerSecond;
     return ticks > 0 && ticks < 0x1p63 ? static_cast<std::uint64_t>(ticks) : 0;
 }
 
