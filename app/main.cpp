@@ -10,11 +10,14 @@
 #include "app/program/TerminalFrontEnd.h"
 #include "app/program/WindowFrontEnd.h"
 #include "platform/linux/PortsDirectory.h"
+#include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/QtPreferencesStore.h"
+#include "platform/linux/ServerSearch.h"
 #include "platform/linux/SignalWatcher.h"
 #include "platform/linux/SocketTransport.h"
+#include "platform/linux/StalePorts.h"
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
@@ -25,6 +28,7 @@
 #include "telephonyd/phone/Scenarios.h"
 
 #include <cstdio>
+#include <ctime>
 #include <exception>
 #include <optional>
 #include <stdexcept>
@@ -67,10 +71,9 @@ std::unique_ptr<LogRecorder> makeRecorder(const AppOptions& options, MainQueue& 
 
 // Shows the live view until it is ended.
 int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
-          const std::string& portsDirectory, const std::string& root)
+          FrameTransport& transport, const std::string& root)
 {
     QtMainQueue queue;
-    SocketTransport transport(portsDirectory);
     FramePorts ports(transport, queue);
     FrameTelephonyServer server(transport, ports, queue);
     const FileSystem files(root);
@@ -89,6 +92,15 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
     return frontEnd->exitStatus();
 }
 
+std::unique_ptr<FrameTransport> viewerTransport(const PortsDirectory& directory,
+                                                const AppOptions& options)
+{
+    if (PortsDirectory::isNamed(options.ports))
+        return std::make_unique<SocketTransport>(directory);
+    return std::make_unique<ServerSearch>(directory, PortsDirectory::kSystemPath,
+                                          PortsDirectory::systemSharedOwner());
+}
+
 int run(const AppOptions& options, FrontEndKind kind)
 {
     // The event loop of a program with a window needs a larger kind of application object.
@@ -100,11 +112,13 @@ int run(const AppOptions& options, FrontEndKind kind)
         return kind == FrontEndKind::Text || kind == FrontEndKind::Json
                    ? printRecording(options, kind, loop)
                    : browseRecording(options, makeFrontEnd(kind, options, loop), loop);
+    PrivatePortsDirectory::removeAbandoned(std::time(nullptr));
     if (options.demo) {
         const PrivatePortsDirectory directory;
         const std::string root = options.root ? *options.root : simulatedPhoneRoot();
-        const SimulatedPhone phone(directory.path(), *options.demo);
-        return watch(options, kind, loop, directory.path(), root);
+        const SimulatedPhone phone(directory.directory(), *options.demo);
+        SocketTransport transport(directory.directory());
+        return watch(options, kind, loop, transport, root);
     }
     std::string error;
     const auto directory = PortsDirectory::open(options.ports, error);
@@ -112,7 +126,9 @@ int run(const AppOptions& options, FrontEndKind kind)
         complain(error);
         return kFailure;
     }
-    return watch(options, kind, loop, directory->path(), options.root.value_or("/"));
+    removeStalePorts(*directory, StalePorts::Clients, std::time(nullptr));
+    const auto transport = viewerTransport(*directory, options);
+    return watch(options, kind, loop, *transport, options.root.value_or("/"));
 }
 
 } // namespace

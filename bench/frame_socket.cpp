@@ -1,7 +1,7 @@
 // Frames over a real socket between two processes: how many small ones a second, how fast large
 // ones, and how long a request waits for its answer.
 
-#include "platform/linux/PortsDirectory.h"
+#include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/SocketTransport.h"
@@ -33,7 +33,7 @@ enum Request : std::int32_t { Burst = 1, OneATurn = 2, Large = 3, Echo = 4 };
 class Sender
 {
 public:
-    explicit Sender(const std::string& directory) : _transport(directory)
+    explicit Sender(const PortsDirectory& directory) : _transport(directory)
     {
         std::string error;
         _listener = _transport.listen(kPortName, error);
@@ -93,7 +93,7 @@ public:
             return;
         ::prctl(PR_SET_PDEATHSIG, SIGKILL);
         QtEventLoop loop;
-        const Sender sender(_directory.path());
+        const Sender sender(_directory.directory());
         std::_Exit(loop.run());
     }
     ~SenderProcess()
@@ -104,7 +104,7 @@ public:
     SenderProcess(const SenderProcess&) = delete;
     SenderProcess& operator=(const SenderProcess&) = delete;
 
-    [[nodiscard]] const std::string& directory() const { return _directory.path(); }
+    [[nodiscard]] const PortsDirectory& directory() const { return _directory.directory(); }
 
 private:
     PrivatePortsDirectory _directory;
@@ -114,7 +114,7 @@ private:
 class Receiver
 {
 public:
-    explicit Receiver(const std::string& directory) : _transport(directory)
+    explicit Receiver(const PortsDirectory& directory) : _transport(directory)
     {
         std::string error;
         QtMainQueue queue;

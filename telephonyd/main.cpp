@@ -2,11 +2,13 @@
 #include "platform/base/Bytes.h"
 #include "platform/linux/LineReader.h"
 #include "platform/linux/PortsDirectory.h"
+#include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/ResourceDirectory.h"
 #include "platform/linux/SignalWatcher.h"
 #include "platform/linux/SocketTransport.h"
+#include "platform/linux/StalePorts.h"
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
@@ -18,6 +20,7 @@
 
 #include <chrono>
 #include <cstdio>
+#include <ctime>
 #include <exception>
 #include <filesystem>
 #include <unistd.h>
@@ -29,6 +32,7 @@ namespace
 
 constexpr int kFailure = 1;
 constexpr int kUnusableArguments = 2;
+constexpr auto kCleaningInterval = std::chrono::minutes(1);
 
 void complain(const std::string& text) { std::fprintf(stderr, "telephonyd: %s\n", text.c_str()); }
 
@@ -71,7 +75,7 @@ int serve(const DaemonOptions& options)
     }
     QtEventLoop loop;
     QtMainQueue queue;
-    SocketTransport transport(directory->path());
+    SocketTransport transport(*directory);
     std::unique_ptr<TypedMessages> messages;
     std::unique_ptr<LineReader> reader;
     LogSourceFactory factory;
@@ -98,6 +102,13 @@ int serve(const DaemonOptions& options)
                 else
                     messages->take(line);
             });
+    // What killed viewers leave does not wait for the next start.
+    const auto removeLeftovers = [&directory] {
+        removeStalePorts(*directory, StalePorts::All, std::time(nullptr));
+        PrivatePortsDirectory::removeAbandoned(std::time(nullptr));
+    };
+    removeLeftovers();
+    const auto cleaning = queue.repeatingTimer(kCleaningInterval, removeLeftovers);
     const SignalWatcher signals([&loop](int) { loop.quit(); });
     logLine(LogPriority::Notice, "Serving in %s", directory->path().c_str());
     return loop.run();

@@ -18,7 +18,7 @@ namespace
 {
 
 struct Parts {
-    Parts(const std::string& directory, MainQueue& queue, const std::string& scenario)
+    Parts(const PortsDirectory& directory, MainQueue& queue, const std::string& scenario)
         : transport(directory), server(transport, queue, phoneSourceFactory(scenario, queue))
     {
     }
@@ -40,9 +40,9 @@ std::filesystem::path stateDirectory()
 
 } // namespace
 
-SimulatedPhone::SimulatedPhone(const std::string& portsDirectory, const std::string& scenario)
-    : _thread([portsDirectory, scenario](MainQueue& queue) -> std::shared_ptr<void> {
-          auto parts = std::make_shared<Parts>(portsDirectory, queue, scenario);
+SimulatedPhone::SimulatedPhone(const PortsDirectory& directory, const std::string& scenario)
+    : _thread([directory, scenario](MainQueue& queue) -> std::shared_ptr<void> {
+          auto parts = std::make_shared<Parts>(directory, queue, scenario);
           if (const auto error = parts->server.start())
               throw std::runtime_error(*error);
           return parts;

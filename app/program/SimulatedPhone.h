@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/linux/EventThread.h"
+#include "platform/linux/PortsDirectory.h"
 
 #include <string>
 
@@ -13,7 +14,7 @@ class SimulatedPhone
 {
 public:
     // Throws std::runtime_error with a line for the user where the server cannot start.
-    SimulatedPhone(const std::string& portsDirectory, const std::string& scenario);
+    SimulatedPhone(const PortsDirectory& directory, const std::string& scenario);
 
 private:
     EventThread _thread;

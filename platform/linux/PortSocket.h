@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/linux/FileDescriptor.h"
+#include "platform/linux/PortsDirectory.h"
 
 #include <optional>
 #include <string>
@@ -9,17 +10,23 @@
 namespace orvane
 {
 
-// A listening socket and its file DIRECTORY/NAME. The end removes the file, unless somebody has put
-// another in its place.
+// A listening socket and its file DIRECTORY/NAME. The destructor removes the file, unless another
+// file has taken its place.
 //
-// Whoever claims or removes a name holds a lock on the directory meanwhile, so that of two programs
-// that find the same stale file only one replaces it, and neither removes the other's new one.
+// A name appears in one step: the socket is bound and listening under a temporary name, which is
+// then renamed without replacing anything. Nobody locks anything. Of several programs that find the
+// same stale file, one moves it aside to a name made of its inode number. That name stays taken for
+// a minute, so that no other program can move aside what has replaced the stale file.
 class PortSocket
 {
 public:
-    // Takes over a stale name. Nothing, with the reason in `error`, when the path is too long, a
-    // live listener has the name or something that is no socket is there.
-    static std::optional<PortSocket> claim(const std::string& directory, const std::string& name,
+    // Takes over the name from a stale socket: the effective user's own, or in a directory of the
+    // effective user anybody's. The name "TelephonyServer" of a shared directory belongs to the
+    // directory's owner, who takes it from whoever else has it.
+    //
+    // Returns nullopt, with the reason in `error`, when the path is too long, when a live socket or
+    // something that is not a socket has the name, or when it is somebody else's.
+    static std::optional<PortSocket> claim(const PortsDirectory& directory, const std::string& name,
                                            std::string& error);
     ~PortSocket();
     PortSocket(PortSocket&& other) noexcept = default;
@@ -28,12 +35,11 @@ public:
     [[nodiscard]] int descriptor() const { return _socket.get(); }
 
 private:
-    PortSocket(std::string directory, std::string path, FileDescriptor socket);
+    PortSocket(std::string path, FileDescriptor socket);
 
-    std::string _directory;
     std::string _path;
     FileDescriptor _socket;
-    dev_t _device = 0; // these two tell its file from another of the name
+    dev_t _device = 0; // with _inode, tells the socket's file from another file of the name
     ino_t _inode = 0;
 };
 

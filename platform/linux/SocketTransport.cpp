@@ -1,6 +1,7 @@
 #include "platform/linux/SocketTransport.h"
 
 #include "platform/linux/DescriptorWatcher.h"
+#include "platform/linux/PortPeer.h"
 #include "platform/linux/PortSocket.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/SocketConnection.h"
@@ -22,7 +23,8 @@ using ConnectionCallback = std::function<void(std::unique_ptr<FrameConnection>)>
 class SocketListener final : public FrameListener
 {
 public:
-    explicit SocketListener(PortSocket socket) : _state(std::make_shared<State>(std::move(socket)))
+    SocketListener(PortSocket socket, const PortsDirectory& directory)
+        : _state(std::make_shared<State>(std::move(socket), directory))
     {
     }
     ~SocketListener() override { setConnectionCallback({}); }
@@ -45,7 +47,10 @@ public:
 
 private:
     struct State {
-        explicit State(PortSocket theSocket) : socket(std::move(theSocket)) {}
+        State(PortSocket theSocket, PortsDirectory theDirectory)
+            : socket(std::move(theSocket)), directory(std::move(theDirectory))
+        {
+        }
 
         void acceptOne()
         {
@@ -55,14 +60,14 @@ private:
                 pauseIfFailed(errno);
                 return;
             }
-            if (!isPeerTrusted(accepted.get()))
+            if (!isPeerTrusted(accepted.get(), directory))
                 return;
             enlargeBuffers(accepted.get());
             const auto call = callback; // it may set another
             call(std::make_unique<SocketConnection>(std::move(accepted)));
         }
 
-        // A process that has run out of descriptors would be told of the same caller for ever.
+        // A process without free descriptors would hear of the same caller in each turn.
         void pauseIfFailed(int error)
         {
             if (error == EAGAIN || error == EINTR || error == ECONNABORTED)
@@ -76,6 +81,7 @@ private:
         }
 
         PortSocket socket;
+        PortsDirectory directory;
         ConnectionCallback callback;
         std::unique_ptr<DescriptorWatcher> watcher;
         QtMainQueue queue;
@@ -91,6 +97,29 @@ bool isUsable(const std::string& name, std::string& error)
     return false;
 }
 
+// None, with the reason in `error`, where nobody who is trusted accepts on the name.
+FileDescriptor connectedSocket(const PortsDirectory& directory, const std::string& name,
+                               std::string& error)
+{
+    if (!isUsable(name, error))
+        return {};
+    const std::string path = directory.pathOf(name);
+    const auto address = socketAddress(path, error);
+    if (!address)
+        return {};
+    FileDescriptor socket = newStreamSocket();
+    const int failure = socket ? connectTo(socket.get(), *address) : errno;
+    if (failure != 0) {
+        error = "The port " + path + " cannot be reached: " + errorText(failure);
+        return {};
+    }
+    if (!isListenerTrusted(socket.get(), directory, name)) {
+        error = "The port " + path + " belongs to another user.";
+        return {};
+    }
+    return socket;
+}
+
 } // namespace
 
 std::unique_ptr<FrameListener> SocketTransport::listen(const std::string& name, std::string& error)
@@ -100,29 +129,20 @@ std::unique_ptr<FrameListener> SocketTransport::listen(const std::string& name, 
     auto socket = PortSocket::claim(_directory, name, error);
     if (!socket)
         return nullptr;
-    return std::make_unique<SocketListener>(std::move(*socket));
+    return std::make_unique<SocketListener>(std::move(*socket), _directory);
 }
 
 std::unique_ptr<FrameConnection> SocketTransport::connect(const std::string& name,
                                                           std::string& error)
 {
-    if (!isUsable(name, error))
-        return nullptr;
-    const std::string path = _directory + '/' + name;
-    const auto address = socketAddress(path, error);
-    if (!address)
-        return nullptr;
-    FileDescriptor socket = newStreamSocket();
-    const int failure = socket ? connectTo(socket.get(), *address) : errno;
-    if (failure != 0) {
-        error = "The port " + path + " cannot be reached: " + errorText(failure);
-        return nullptr;
-    }
-    if (!isPeerTrusted(socket.get())) {
-        error = "The port " + path + " belongs to another user.";
-        return nullptr;
-    }
-    return std::make_unique<SocketConnection>(std::move(socket));
+    FileDescriptor socket = connectedSocket(_directory, name, error);
+    return socket ? std::make_unique<SocketConnection>(std::move(socket)) : nullptr;
+}
+
+bool SocketTransport::hasListener(const std::string& name) const
+{
+    std::string ignored;
+    return static_cast<bool>(connectedSocket(_directory, name, ignored));
 }
 
 } // namespace orvane

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/linux/PortsDirectory.h"
 #include "platform/ports/FrameConnection.h"
 
 #include <string>
@@ -8,22 +9,23 @@ namespace orvane
 {
 
 // Frames over Unix stream sockets DIRECTORY/NAME, driven by the event loop of the thread that
-// listens or connects. Only peers of the same effective user, or root, are served.
+// listens or connects. Only peers that the directory accepts are served.
 //
-// Connections and listeners may outlive the transport. Frames that arrive while a connection has no
-// frame callback wait in it, a few of them; the peer waits with the rest. A frame that announces
-// more than kFrameDataLimit bytes ends its connection, with a line in the log.
+// Connections and listeners may outlive the transport. A connection without a frame callback holds
+// the first frames that arrive; the peer keeps the rest. A frame that announces more than
+// kFrameDataLimit bytes ends its connection, with a line in the log.
 class SocketTransport final : public FrameTransport
 {
 public:
-    // The directory must be one that PortsDirectory (or PrivatePortsDirectory) has passed.
-    explicit SocketTransport(std::string directory) : _directory(std::move(directory)) {}
+    explicit SocketTransport(PortsDirectory directory) : _directory(std::move(directory)) {}
 
+    // Whether a process that can be trusted accepts connections on the name.
+    [[nodiscard]] bool hasListener(const std::string& name) const;
     std::unique_ptr<FrameListener> listen(const std::string& name, std::string& error) override;
     std::unique_ptr<FrameConnection> connect(const std::string& name, std::string& error) override;
 
 private:
-    std::string _directory;
+    PortsDirectory _directory;
 };
 
 } // namespace orvane

@@ -1,7 +1,5 @@
 #include "platform/linux/UnixSocket.h"
 
-#include "platform/services/SystemLog.h"
-
 #include <cerrno>
 #include <cstring>
 #include <system_error>
@@ -27,7 +25,7 @@ std::optional<sockaddr_un> socketAddress(const std::string& path, std::string& e
 
 void enlargeBuffers(int socket)
 {
-    // As much as the system allows: small messages cost many times their size in there.
+    // As much as the system allows: it counts a small message as many times its size.
     const int bytes = 1024 * 1024;
     ::setsockopt(socket, SOL_SOCKET, SO_SNDBUF, &bytes, sizeof bytes);
     ::setsockopt(socket, SOL_SOCKET, SO_RCVBUF, &bytes, sizeof bytes);
@@ -43,27 +41,12 @@ FileDescriptor newStreamSocket()
 
 int connectTo(int socket, const sockaddr_un& address)
 {
-    // The generic address type is how the call takes every family.
+    // The call takes addresses of all families as this type.
     const auto* generic = reinterpret_cast<const sockaddr*>(&address);
     while (::connect(socket, generic, sizeof address) != 0)
         if (errno != EINTR)
             return errno;
     return 0;
-}
-
-bool isPeerTrusted(int socket)
-{
-    ucred peer{};
-    socklen_t length = sizeof peer;
-    if (::getsockopt(socket, SOL_SOCKET, SO_PEERCRED, &peer, &length) != 0) {
-        logError("The other end of a connection cannot be told (%s); it is refused\n",
-                 errorText(errno).c_str());
-        return false;
-    }
-    if (peer.uid == ::geteuid() || peer.uid == 0)
-        return true;
-    logError("A connection with a process of user %u is refused\n", peer.uid);
-    return false;
 }
 
 } // namespace orvane

@@ -1,6 +1,6 @@
 #include "platform/linux/EventThread.h"
 
-#include "platform/linux/PortsDirectory.h"
+#include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtTest.h"
 #include "platform/linux/SocketTransport.h"
 
@@ -63,7 +63,7 @@ TEST_F(EventThreadTest, AThreadWithoutInhabitantStops)
 
 // Answers each frame with one of the next message id.
 struct Answerer {
-    explicit Answerer(const std::string& directory) : transport(directory)
+    explicit Answerer(const PortsDirectory& directory) : transport(directory)
     {
         std::string error;
         listener = transport.listen("Answerer", error);
@@ -83,8 +83,8 @@ TEST_F(EventThreadTest, ThreadsTalkOverPorts)
 {
     const PrivatePortsDirectory directory;
     const EventThread thread(
-        [&](MainQueue&) { return std::make_shared<Answerer>(directory.path()); });
-    SocketTransport transport(directory.path());
+        [&](MainQueue&) { return std::make_shared<Answerer>(directory.directory()); });
+    SocketTransport transport(directory.directory());
     std::string error;
     const auto connection = transport.connect("Answerer", error);
     ASSERT_TRUE(connection) << error;

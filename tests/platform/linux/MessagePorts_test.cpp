@@ -13,7 +13,7 @@ using namespace std::chrono_literals;
 // A local port in a thread of its own that answers with what it is sent, reversed. Message 9 is
 // left without reply data; message 10 ends the port.
 struct Reverser {
-    Reverser(const std::string& directory, MainQueue& queue)
+    Reverser(const PortsDirectory& directory, MainQueue& queue)
         : transport(directory), ports(transport, queue)
     {
         port = ports.createLocal("Reverser",
@@ -39,7 +39,7 @@ protected:
     QtMainQueue queue;
     FramePorts ports{transport, queue};
     EventThread thread{[this](MainQueue& threadQueue) {
-        return std::make_shared<Reverser>(directory.path(), threadQueue);
+        return std::make_shared<Reverser>(directory.directory(), threadQueue);
     }};
 };
 

@@ -1,7 +1,12 @@
 #include "platform/linux/PortsDirectory.h"
 
+#include "platform/linux/EffectiveUser.h"
+#include "platform/linux/PrivatePortsDirectory.h"
+
 #include <gtest/gtest.h>
 
+#include <array>
+#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -109,22 +114,60 @@ TEST_F(PortsDirectoryTest, MissingParentsAreMadeWhereSomebodyNamedThePath)
     EXPECT_FALSE(std::filesystem::exists(below("missing")));
 }
 
-TEST_F(PortsDirectoryTest, ADirectoryThatOthersCanOnlyReadIsFine)
+TEST_F(PortsDirectoryTest, ADirectoryOfTheUsersOwnNeedsTheModeThatKeepsAllOthersOut)
 {
-    EXPECT_EQ(open(makeDirectory(below("readable"), 0755)), below("readable"));
-    EXPECT_EQ(open(below("readable/")), below("readable"));
-}
-
-TEST_F(PortsDirectoryTest, ADirectoryThatGroupOrOthersCanWriteIsRefused)
-{
-    for (const mode_t mode : {0720U, 0702U, 0777U, 01777U}) {
-        const std::string path = makeDirectory(below("open" + std::to_string(mode)), mode);
-        EXPECT_EQ(open(path), "The ports directory " + path +
-                                  " can be written by its group or by others; take that away with "
-                                  "chmod go-w " +
-                                  path + " or choose another with --ports DIR.");
+    EXPECT_EQ(open(makeDirectory(below("private"), 0700) + "/"), below("private"));
+    for (const mode_t mode : {0755U, 0711U, 0720U, 0702U, 0777U, 01777U, 01770U, 02700U, 0500U}) {
+        const std::string path = makeDirectory(below("mode" + std::to_string(mode)), mode);
+        std::array<char, 8> text{};
+        std::snprintf(text.data(), text.size(), "%04o", mode);
+        EXPECT_EQ(open(path), "The ports directory " + path + " has the mode " + text.data() +
+                                  " instead of 0700; choose another with --ports DIR.");
         EXPECT_EQ(permissions(path), mode);
     }
+}
+
+TEST_F(PortsDirectoryTest, TheDirectoryForTemporaryFilesIsRefusedWithoutAdviceToChangeIt)
+{
+    const std::string error = open("/tmp");
+    EXPECT_EQ(error.find("chmod"), std::string::npos) << error;
+    EXPECT_NE(error.find("choose another with --ports DIR."), std::string::npos) << error;
+}
+
+TEST_F(PortsDirectoryTest, ADirectoryMadeBelowASetGroupIdOneIsPrivateAllTheSame)
+{
+    makeDirectory(below("team"), 02770);
+    EXPECT_EQ(open(below("team/ports")), below("team/ports"));
+    EXPECT_EQ(permissions(below("team/ports")), 0700U);
+}
+
+TEST_F(PortsDirectoryTest, ASharedDirectoryBelongsToItsUserAndHasExactlyItsMode)
+{
+    ORVANE_SKIP_UNLESS_ROOT();
+    constexpr uid_t kOwner = 2001;
+    constexpr gid_t kGroup = 3001;
+    const std::string path = makeDirectory(below("shared"), 0700);
+    std::string error;
+    const auto openAs = [&](mode_t mode, std::optional<uid_t> sharedOwner) {
+        error.clear();
+        EXPECT_EQ(::chown(path.c_str(), kOwner, kGroup), 0);
+        EXPECT_EQ(::chmod(path.c_str(), mode), 0);
+        return PortsDirectory::existing(path, error, sharedOwner);
+    };
+    const auto shared = openAs(01770, kOwner);
+    ASSERT_TRUE(shared) << error;
+    EXPECT_TRUE(shared->isShared());
+    EXPECT_EQ(shared->owner(), kOwner);
+    EXPECT_EQ(shared->group(), kGroup);
+
+    for (const mode_t mode : {0770U, 01777U, 01775U, 03770U, 01700U}) {
+        EXPECT_FALSE(openAs(mode, kOwner)) << mode;
+        EXPECT_NE(error.find("of user telephonyd has the mode "), std::string::npos) << error;
+        EXPECT_NE(error.find("instead of 1770"), std::string::npos) << error;
+    }
+    EXPECT_FALSE(openAs(01770, std::nullopt));
+    EXPECT_NE(error.find("belongs to user 2001"), std::string::npos) << error;
+    EXPECT_FALSE(openAs(01770, kOwner + 1));
 }
 
 TEST_F(PortsDirectoryTest, ADirectoryOfSomebodyElseIsRefused)
@@ -159,35 +202,24 @@ TEST_F(PortsDirectoryTest, ALinkOfTheUsersOwnIsFollowedAndItsTargetChecked)
     std::filesystem::create_symlink(below("bad"), below("to-bad"));
     std::filesystem::create_symlink(below("none"), below("to-none"));
     EXPECT_EQ(open(below("to-good")), below("to-good"));
-    EXPECT_NE(open(below("to-bad")).find("can be written"), std::string::npos);
+    EXPECT_NE(open(below("to-bad")).find("has the mode 0777"), std::string::npos);
     EXPECT_NE(open(below("to-none")).find("cannot be used"), std::string::npos);
 }
 
-TEST_F(PortsDirectoryTest, ALinkOfSomebodyElseIsRefusedWhereverItLeads)
+TEST_F(PortsDirectoryTest, ALinkOfSomebodyElseIsRefusedWhereverItIsInThePath)
 {
-    if (::geteuid() != 0)
-        GTEST_SKIP() << "only root can make one";
+    ORVANE_SKIP_UNLESS_ROOT();
     makeDirectory(below("good"), 0700);
+    makeDirectory(below("good/inner"), 0700);
     const std::string link = below("link");
     std::filesystem::create_symlink(below("good"), link);
     ASSERT_EQ(::lchown(link.c_str(), 65534, 65534), 0);
-    for (const std::string& path : {link, link + "/"})
-        EXPECT_EQ(open(path), "The ports directory " + link +
-                                  " is a symbolic link of user 65534; choose another with --ports "
-                                  "DIR.");
-}
-
-TEST_F(PortsDirectoryTest, APrivateDirectoryIsGoneWithAllInItAtTheEnd)
-{
-    std::string path;
-    {
-        const PrivatePortsDirectory directory;
-        path = directory.path();
-        EXPECT_EQ(permissions(path), 0700U);
-        std::ofstream(path + "/left behind") << "x";
-        EXPECT_NE(PrivatePortsDirectory().path(), path);
-    }
-    EXPECT_FALSE(std::filesystem::exists(path));
+    for (const char* rest : {"", "/", "/.", "/./", "//.", "/inner", "/./inner", "/../good"})
+        EXPECT_NE(open(link + rest)
+                      .find("is reached through a symbolic link of user 65534; choose "
+                            "another with --ports DIR."),
+                  std::string::npos)
+            << rest;
 }
 
 } // namespace

@@ -1,5 +1,6 @@
 #include "platform/linux/SocketTransport.h"
 
+#include "platform/linux/EffectiveUser.h"
 #include "platform/linux/TransportTest.h"
 
 #include <fcntl.h>
@@ -101,16 +102,17 @@ TEST_F(SocketTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
 {
     // 107 bytes are what an address holds, beside the one that ends it.
     for (const std::size_t length : {107U, 108U, 250U}) {
-        const std::size_t folder = length - pathOf("").size() - std::string("/P").size();
+        const std::string name(20, 'P');
+        const std::size_t folder = length - pathOf("").size() - name.size() - 1;
         const std::string deep = pathOf(std::string(folder, 'd'));
         std::filesystem::create_directory(deep);
-        SocketTransport deepTransport(deep);
-        const std::string path = deep + "/P";
+        SocketTransport deepTransport(PortsDirectory::unchecked(deep));
+        const std::string path = deep + '/' + name;
         ASSERT_EQ(path.size(), length);
-        const auto listener = deepTransport.listen("P", error);
+        const auto listener = deepTransport.listen(name, error);
         if (length <= 107) {
             ASSERT_TRUE(listener) << error;
-            EXPECT_TRUE(deepTransport.connect("P", error)) << error;
+            EXPECT_TRUE(deepTransport.connect(name, error)) << error;
             continue;
         }
         const std::string expected =
@@ -120,7 +122,7 @@ TEST_F(SocketTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
         EXPECT_FALSE(listener);
         EXPECT_EQ(error, expected);
         error.clear();
-        EXPECT_FALSE(deepTransport.connect("P", error));
+        EXPECT_FALSE(deepTransport.connect(name, error));
         EXPECT_EQ(error, expected);
     }
 }
@@ -138,8 +140,8 @@ TEST_F(SocketTransportTest, AListenerLeavesASocketThatHasTakenItsPlace)
 TEST_F(SocketTransportTest, ADirectoryThatIsGoneIsAnError)
 {
     std::filesystem::remove(directory.path());
-    EXPECT_EQ(refusal("Port"), "The ports directory " + directory.path() +
-                                   " cannot be opened: No such file or directory");
+    EXPECT_EQ(refusal("Port"),
+              "The port " + pathOf("Port") + " cannot be made: No such file or directory");
     EXPECT_FALSE(transport.connect("Port", error));
 }
 
@@ -231,27 +233,16 @@ TEST_F(SocketTransportTest, ACallerWaitsUntilThereIsADescriptorForIt)
 
 #endif
 
-// The effective user for the life of this object. Only root can become somebody else.
-class OtherUser
-{
-public:
-    OtherUser() { EXPECT_EQ(::seteuid(65534), 0); }
-    ~OtherUser() { EXPECT_EQ(::seteuid(0), 0); }
-    OtherUser(const OtherUser&) = delete;
-    OtherUser& operator=(const OtherUser&) = delete;
-};
-
 TEST_F(SocketTransportTest, ACallerOfAnotherUserIsRefused)
 {
-    if (::geteuid() != 0)
-        GTEST_SKIP() << "only root can call as somebody else";
+    ORVANE_SKIP_UNLESS_ROOT();
     const auto listener = listen("Port");
     listener->setConnectionCallback([](std::unique_ptr<FrameConnection>) { FAIL(); });
     ASSERT_EQ(::chmod(directory.path().c_str(), 0755), 0);
     ASSERT_EQ(::chmod(pathOf("Port").c_str(), 0777), 0);
     FileDescriptor caller;
     {
-        const OtherUser other;
+        const EffectiveUser other(65534, 65534);
         caller = connectPlainly("Port");
     }
     char byte = 0;
@@ -262,18 +253,26 @@ TEST_F(SocketTransportTest, ACallerOfAnotherUserIsRefused)
 
 TEST_F(SocketTransportTest, AListenerOfAnotherUserIsRefused)
 {
-    if (::geteuid() != 0)
-        GTEST_SKIP() << "only root can listen as somebody else";
+    ORVANE_SKIP_UNLESS_ROOT();
     const auto address = socketAddress(pathOf("Port"), error);
     const FileDescriptor socket = newStreamSocket();
     ASSERT_EQ(::bind(socket.get(), reinterpret_cast<const sockaddr*>(&*address), sizeof *address),
               0);
     {
-        const OtherUser other;
+        const EffectiveUser other(65534, 65534);
         ASSERT_EQ(::listen(socket.get(), 1), 0);
     }
     EXPECT_FALSE(transport.connect("Port", error));
     EXPECT_EQ(error, "The port " + pathOf("Port") + " belongs to another user.");
+}
+
+TEST_F(SocketTransportTest, APortThatNobodyAcceptsOnHasNoListener)
+{
+    EXPECT_FALSE(transport.hasListener("Port"));
+    leaveStaleSocket("Port");
+    EXPECT_FALSE(transport.hasListener("Port"));
+    const auto listener = listen("Port");
+    EXPECT_TRUE(transport.hasListener("Port"));
 }
 
 } // namespace

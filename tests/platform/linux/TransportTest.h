@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/linux/FileDescriptor.h"
-#include "platform/linux/PortsDirectory.h"
+#include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtTest.h"
 #include "platform/linux/SocketTransport.h"
 #include "platform/linux/UnixSocket.h"
@@ -61,7 +61,7 @@ protected:
 
     RecordingLog log;
     PrivatePortsDirectory directory;
-    SocketTransport transport{directory.path()};
+    SocketTransport transport{directory.directory()};
     std::string error;
 };
 

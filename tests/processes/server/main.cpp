@@ -68,7 +68,7 @@ int main(int argc, char** argv)
     const std::string_view mode = argv[2];
     QtEventLoop loop;
     QtMainQueue queue;
-    SocketTransport transport(argv[1]);
+    SocketTransport transport(PortsDirectory::unchecked(argv[1]));
     ScriptedTelephonyServer server(transport, queue);
     if (!arrange(server, mode))
         return 2;
