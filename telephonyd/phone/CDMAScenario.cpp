@@ -57,52 +57,37 @@ std::uint32_t wholeSeconds(milliseconds now)
 } // namespace
 
 CDMAScenario::CDMAScenario(std::uint64_t seed)
-    : _drive(kCDMATownMasts, kLTETownRoad, seed), _phone(seed + 1),
-      _oneXPilots(&CDMAAir::oneXPilot, -14, -16), _evdoPilots(&CDMAAir::evdoPilot, -9, -11),
-      _forward(seed + 4), _reverse(seed + 5), _noise(seed + 6)
+    : DrivenScenario(kTSLogChannelTechnology_Varnel_CDMA, {kCDMATownMasts, kLTETownRoad, seed}),
+      _phone(seed + 1), _oneXPilots(&CDMAAir::oneXPilot, -14, -16),
+      _evdoPilots(&CDMAAir::evdoPilot, -9, -11), _forward(seed + 4), _reverse(seed + 5),
+      _noise(seed + 6)
 {
-}
-
-std::string CDMAScenario::technology() const { return kTSLogChannelTechnology_Varnel_CDMA; }
-
-std::vector<PhoneMessage> CDMAScenario::step(milliseconds now)
-{
-    Messages messages;
-    if (_now < milliseconds(0)) {
-        _now = milliseconds(0);
-        first(messages);
-    }
-    while (_now + Drive::kStep <= now) {
-        _now += Drive::kStep;
-        next(messages);
-    }
-    return messages;
 }
 
 // The frame is the last of the call before.
-void CDMAScenario::first(Messages& messages)
+void CDMAScenario::first()
 {
-    _phone.advance(_now, servingCell().area.colourCode);
+    _phone.advance(now(), servingCell().area.colourCode);
     const CDMAAir air(_drive);
     _oneXPilots.step(air, _drive.serving(), _phone.isInTraffic());
     _evdoPilots.step(air, _drive.serving(), _phone.isConnected());
-    addSystem(messages);
-    addFrame(air, messages);
-    addStatus(air, messages);
-    addSummary(air, messages);
-    addActiveSet(air, messages);
-    addFingers(air, messages);
-    addForwardTraffic(messages);
-    addReverseTraffic(messages);
+    addSystem();
+    addFrame(air);
+    addStatus(air);
+    addSummary(air);
+    addActiveSet(air);
+    addFingers(air);
+    addForwardTraffic();
+    addReverseTraffic();
 }
 
-void CDMAScenario::next(Messages& messages)
+void CDMAScenario::next()
 {
     const OneXState oneXBefore = _phone.oneX();
     const EvdoState evdoBefore = _phone.evdo();
     const EvdoSession sessionBefore = _phone.session();
     const bool cellChanged = _drive.step(_phone.isInTraffic() || _phone.isConnected());
-    _phone.advance(_now, servingCell().area.colourCode);
+    _phone.advance(now(), servingCell().area.colourCode);
     const CDMAAir air(_drive);
     const bool oneXPilotsChanged =
         _oneXPilots.step(air, _drive.serving(), _phone.isInTraffic()) && _phone.isInTraffic();
@@ -111,10 +96,10 @@ void CDMAScenario::next(Messages& messages)
     moveData(air);
 
     if (cellChanged || isDue(kSystemEvery))
-        addSystem(messages);
-    reportOneX(air, _phone.oneX() != oneXBefore || oneXPilotsChanged, messages);
+        addSystem();
+    reportOneX(air, _phone.oneX() != oneXBefore || oneXPilotsChanged);
     reportEvdo(air, _phone.evdo() != evdoBefore || _phone.session() != sessionBefore,
-               evdoPilotsChanged, messages);
+               evdoPilotsChanged);
 }
 
 // How much of the sector's time is the phone's changes every second or so, as others come and go.
@@ -129,32 +114,29 @@ void CDMAScenario::moveData(const CDMAAir& air)
     _reverse.step(kMostSent - sent(air, servingCell().area.evdoBand));
 }
 
-void CDMAScenario::reportOneX(const CDMAAir& air, bool somethingChanged, Messages& messages)
+void CDMAScenario::reportOneX(const CDMAAir& air, bool somethingChanged)
 {
     // Asleep there is nothing to report but that.
     const bool isDueAwake = isDue(kStatusEvery) && _phone.oneX() != OneXState::Sleep;
     if (somethingChanged || isDueAwake)
-        addStatus(air, messages);
+        addStatus(air);
     if (_phone.isInTraffic() && isDue(kFrameEvery))
-        addFrame(air, messages);
+        addFrame(air);
 }
 
-void CDMAScenario::reportEvdo(const CDMAAir& air, bool stateChanged, bool pilotsChanged,
-                              Messages& messages)
+void CDMAScenario::reportEvdo(const CDMAAir& air, bool stateChanged, bool pilotsChanged)
 {
     if (stateChanged || isDue(kSummaryEvery))
-        addSummary(air, messages);
+        addSummary(air);
     if (stateChanged || pilotsChanged || isDue(kActiveSetEvery))
-        addActiveSet(air, messages);
+        addActiveSet(air);
     if (stateChanged || isDue(kFingersEvery))
-        addFingers(air, messages);
+        addFingers(air);
     if (isDue(kForwardTrafficEvery))
-        addForwardTraffic(messages);
+        addForwardTraffic();
     if (isDue(kReverseTrafficEvery))
-        addReverseTraffic(messages);
+        addReverseTraffic();
 }
-
-bool CDMAScenario::isDue(milliseconds every) const { return _now % every == milliseconds(0); }
 
 bool CDMAScenario::isEvdoFound() const { return _phone.evdo() >= EvdoState::Sync; }
 
@@ -168,47 +150,43 @@ CDMARadio CDMAScenario::radio(const CDMAAir& air, std::uint8_t band, std::uint16
             sent(air, band) + _noise.between(-1, 1)};
 }
 
-void CDMAScenario::addStatus(const CDMAAir& air, Messages& messages)
+void CDMAScenario::addStatus(const CDMAAir& air)
 {
     std::vector<CDMAPilot> pilots;
     for (const std::size_t cell : _oneXPilots.cells())
         pilots.push_back({kCDMATown[cell].pilotOffset, air.oneXPilot(cell)});
     const CDMAArea& area = servingCell().area;
-    messages.push_back(oneXStatus(_phone.oneX(), radio(air, area.oneXBand, area.oneXChannel),
-                                  pilots, servingCell().pilotOffset));
+    add(oneXStatus(_phone.oneX(), radio(air, area.oneXBand, area.oneXChannel), pilots,
+                   servingCell().pilotOffset));
 }
 
-void CDMAScenario::addFrame(const CDMAAir& air, Messages& messages)
+void CDMAScenario::addFrame(const CDMAAir& air)
 {
-    messages.push_back(
-        oneXFrame(_noise.between(0, 1) < damagedFrames(air.oneXPilot(_drive.serving()))));
+    add(oneXFrame(_noise.between(0, 1) < damagedFrames(air.oneXPilot(_drive.serving()))));
 }
 
-void CDMAScenario::addSystem(Messages& messages) const
-{
-    messages.push_back(oneXSystem(servingCell()));
-}
+void CDMAScenario::addSystem() { add(oneXSystem(servingCell())); }
 
-void CDMAScenario::addSummary(const CDMAAir& air, Messages& messages)
+void CDMAScenario::addSummary(const CDMAAir& air)
 {
     const CDMAArea& area = servingCell().area;
     std::optional<std::uint16_t> serving;
     if (isEvdoFound())
         serving = servingCell().pilotOffset;
-    messages.push_back(evdoSummary(_phone, radio(air, area.evdoBand, area.evdoChannel), serving));
+    add(evdoSummary(_phone, radio(air, area.evdoBand, area.evdoChannel), serving));
 }
 
-void CDMAScenario::addActiveSet(const CDMAAir& air, Messages& messages) const
+void CDMAScenario::addActiveSet(const CDMAAir& air)
 {
     std::vector<CDMAPilot> pilots;
     if (isEvdoFound())
         for (const std::size_t cell : _evdoPilots.cells())
             pilots.push_back({kCDMATown[cell].pilotOffset, air.evdoPilot(cell)});
-    messages.push_back(evdoActiveSet(pilots));
+    add(evdoActiveSet(pilots));
 }
 
 // Two echoes of the serving cell, one of each other in the active set, the rest at rest.
-void CDMAScenario::addFingers(const CDMAAir& air, Messages& messages)
+void CDMAScenario::addFingers(const CDMAAir& air)
 {
     constexpr std::size_t kFingers = 6;
     constexpr double kOfFirst = -1.5; // dB of a cell's strength that is in its first echo
@@ -225,17 +203,11 @@ void CDMAScenario::addFingers(const CDMAAir& air, Messages& messages)
                 lock(cell, kOfFirst);
     }
     fingers.resize(kFingers);
-    messages.push_back(evdoFingers(fingers));
+    add(evdoFingers(fingers));
 }
 
-void CDMAScenario::addForwardTraffic(Messages& messages) const
-{
-    messages.push_back(evdoForwardTraffic(wholeSeconds(_now), _forward));
-}
+void CDMAScenario::addForwardTraffic() { add(evdoForwardTraffic(wholeSeconds(now()), _forward)); }
 
-void CDMAScenario::addReverseTraffic(Messages& messages) const
-{
-    messages.push_back(evdoReverseTraffic(wholeSeconds(_now), _reverse));
-}
+void CDMAScenario::addReverseTraffic() { add(evdoReverseTraffic(wholeSeconds(now()), _reverse)); }
 
 } // namespace orvane

@@ -4,6 +4,7 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/plist/PropertyList.h"
+#include "telephonyd/phone/EachSite.h"
 #include "telephonyd/phone/LTETown.h"
 
 #include <algorithm>
@@ -36,37 +37,29 @@ struct Site {
     std::uint16_t locationArea;
 };
 
-constexpr std::size_t kSites = 16;
-constexpr std::array<Site, kSites> kTown = {
-    {
-     {150, 180, 22, 3, 0, 11001, 4101},
-     {520, -160, 634, 3, 1, 11002, 4101},
-     {910, 170, 41, 3, 4, 11011, 4101},
-     {1300, -150, 702, 3, 2, 11012, 4101},
-     {1660, 190, 29, 3, 7, 11021, 4101},
-     {1960, -90, 666, 3, 5, 11022, 4101},
-     {1960, 470, 57, 3, 3, 11031, 4102},
-     {1720, 780, 641, 3, 6, 11032, 4102},
-     {2210, 1060, 35, 3, 1, 12001, 4102},
-     {2760, 1010, 691, 3, 0, 12002, 4102},
-     {2790, 1550, 48, 3, 2, 12011, 4102},
-     {2360, 1930, 24, 3, 5, 12012, 4102},
-     {1780, 1660, 53, 3, 4, 13001, 4103},
-     {1150, 1930, 38, 3, 6, 13002, 4103},
-     {650, 1450, 61, 3, 3, 13011, 4103},
-     {-120, 760, 44, 3, 7, 13012, 4103},
-     }
+constexpr Site kTown[] = {
+    {150,  180,  22,  3, 0, 11001, 4101},
+    {520,  -160, 634, 3, 1, 11002, 4101},
+    {910,  170,  41,  3, 4, 11011, 4101},
+    {1300, -150, 702, 3, 2, 11012, 4101},
+    {1660, 190,  29,  3, 7, 11021, 4101},
+    {1960, -90,  666, 3, 5, 11022, 4101},
+    {1960, 470,  57,  3, 3, 11031, 4102},
+    {1720, 780,  641, 3, 6, 11032, 4102},
+    {2210, 1060, 35,  3, 1, 12001, 4102},
+    {2760, 1010, 691, 3, 0, 12002, 4102},
+    {2790, 1550, 48,  3, 2, 12011, 4102},
+    {2360, 1930, 24,  3, 5, 12012, 4102},
+    {1780, 1660, 53,  3, 4, 13001, 4103},
+    {1150, 1930, 38,  3, 6, 13002, 4103},
+    {650,  1450, 61,  3, 3, 13011, 4103},
+    {-120, 760,  44,  3, 7, 13012, 4103},
 };
 
-constexpr std::array<DriveCell, kSites> townMasts()
-{
-    constexpr double kLevelAt100Metres = -74;
-    std::array<DriveCell, kSites> masts{};
-    for (std::size_t i = 0; i < kSites; ++i)
-        masts[i] = {kTown[i].eastMetres, kTown[i].northMetres, kTown[i].channel, kLevelAt100Metres};
-    return masts;
-}
-constexpr std::array<DriveCell, kSites> kMasts = townMasts();
+constexpr double kLevelAt100Metres = -74;
+constexpr auto kMasts = ofEach(kTown, [](const Site& site) {
+    return DriveCell{site.eastMetres, site.northMetres, site.channel, kLevelAt100Metres};
+});
 
 std::string decibels(double value, const char* unit)
 {
@@ -97,27 +90,17 @@ PropertyValue only(const char* key, std::string value)
 } // namespace
 
 CellMonitorScenario::CellMonitorScenario(std::uint64_t seed)
-    : _drive(kMasts, kLTETownRoad, seed), _call(kCallFor, kNoCallFor, false, seed + 1)
+    : DrivenScenario(kTSLogChannelTechnology_IFX, {kMasts, kLTETownRoad, seed}),
+      _call(kCallFor, kNoCallFor, false, seed + 1)
 {
 }
 
-std::string CellMonitorScenario::technology() const { return kTSLogChannelTechnology_IFX; }
-
-std::vector<PhoneMessage> CellMonitorScenario::step(milliseconds now)
+void CellMonitorScenario::next()
 {
-    std::vector<PhoneMessage> messages;
-    if (_now < milliseconds(0)) {
-        _now = milliseconds(0);
-        messages.push_back(cellList());
-    }
-    while (_now + Drive::kStep <= now) {
-        _now += Drive::kStep;
-        const bool callChanged = _call.advance(_now);
-        const bool cellChanged = _drive.step(_call.isOn());
-        if (callChanged || cellChanged || _now % kListEvery == milliseconds(0))
-            messages.push_back(cellList());
-    }
-    return messages;
+    const bool callChanged = _call.advance(now());
+    const bool cellChanged = _drive.step(_call.isOn());
+    if (callChanged || cellChanged || isDue(kListEvery))
+        add(cellList());
 }
 
 PhoneMessage CellMonitorScenario::cellList() const

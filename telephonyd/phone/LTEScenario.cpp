@@ -64,85 +64,61 @@ std::uint16_t frames(milliseconds now, int millisecondsPerFrame, int modulus)
     return static_cast<std::uint16_t>(now.count() / millisecondsPerFrame % modulus);
 }
 
-PropertyValue cellDictionary(const LTECell& cell, const char* type)
+PropertyValue listed(const LTECell& cell, bool isServing)
 {
-    const auto number = [](std::int64_t value) { return PropertyValue::integer(value); };
-    return PropertyValue::dictionaryOf({
-        {kTSCellMonitorCellRadioAccessTechnology, kTSCellMonitorRadioAccessTechnologyLTE},
-        {kTSCellMonitorCellType,                  type                                  },
-        {kTSCellMonitorMCC,                       number(1)                             },
-        {kTSCellMonitorMNC,                       number(1)                             },
-        {kTSCellMonitorTAC,                       number(cell.trackingAreaCode)         },
-        {kTSCellMonitorCellId,                    number(cell.cellIdentity)             },
-        {kTSCellMonitorPID,                       number(cell.physicalCellId)           },
-        {kTSCellMonitorBandInfo,                  number(cell.band)                     },
-        {kTSCellMonitorUARFCN,                    number(cell.earfcn)                   },
+    return listedCell(kTSCellMonitorRadioAccessTechnologyLTE, isServing,
+                      {
+                          {kTSCellMonitorTAC,      cell.trackingAreaCode},
+                          {kTSCellMonitorCellId,   cell.cellIdentity    },
+                          {kTSCellMonitorPID,      cell.physicalCellId  },
+                          {kTSCellMonitorBandInfo, cell.band            },
+                          {kTSCellMonitorUARFCN,   cell.earfcn          },
     });
 }
 
 } // namespace
 
 LTEScenario::LTEScenario(std::uint64_t seed)
-    : _drive(kLTETownMasts, kLTETownRoad, seed),
+    : DrivenScenario(kTSLogChannelTechnology_Varnel_LTE, {kLTETownMasts, kLTETownRoad, seed}),
       _connected(kConnectedFor, kIdleFor, false, seed + 1),
-      _dataConnection(kDataFor, kNoDataFor, true, seed + 2)
+      _dataConnections(DataConnections::Network::LTE, kDataFor, kNoDataFor, seed + 2)
 {
 }
 
-std::string LTEScenario::technology() const { return kTSLogChannelTechnology_Varnel_LTE; }
-
-std::vector<PhoneMessage> LTEScenario::step(milliseconds now)
+void LTEScenario::first()
 {
-    Messages messages;
-    if (_now < milliseconds(0)) {
-        _now = milliseconds(0);
-        first(messages);
-    }
-    while (_now + Drive::kStep <= now) {
-        _now += Drive::kStep;
-        next(messages);
-    }
-    return messages;
+    addServingCell();
+    add(serverItem(kSimFilesItem, simFiles()));
+    addCells();
+    add(_dataConnections.item());
+    addServingMeasurement(true);
+    addNeighbours();
+    addConnectedMeasurement();
+    addReselection();
 }
 
-void LTEScenario::first(Messages& messages)
+void LTEScenario::next()
 {
-    addServingCell(messages);
-    messages.push_back(serverItem(kSimFilesItem, simFiles()));
-    addCells(messages);
-    addDataConnections(messages);
-    addServingMeasurement(messages, true);
-    addNeighbours(messages);
-    addConnectedMeasurement(messages);
-    addReselection(messages);
-}
-
-void LTEScenario::next(Messages& messages)
-{
-    _connected.advance(_now);
-    if (_dataConnection.advance(_now)) {
-        _dataConnections += _dataConnection.isOn() ? 1 : 0;
-        addDataConnections(messages);
-    }
+    _connected.advance(now());
+    if (_dataConnections.advance(now()))
+        add(_dataConnections.item());
     const bool cellChanged = _drive.step(_connected.isOn());
     if (cellChanged)
-        addServingCell(messages);
+        addServingCell();
     if (cellChanged || isDue(kCellsEvery))
-        addCells(messages);
+        addCells();
     if (_connected.isOn()) {
         if (isDue(kConnectedMeasurementEvery))
-            addConnectedMeasurement(messages);
+            addConnectedMeasurement();
         return;
     }
     if (cellChanged || isDue(kServingMeasurementEvery))
-        addServingMeasurement(messages, cellChanged);
+        addServingMeasurement(cellChanged);
     if (cellChanged || isDue(kNeighboursEvery))
-        addNeighbours(messages);
+        addNeighbours();
     if (isDue(kReselectionEvery))
-        addReselection(messages);
+        addReselection();
 }
-
-bool LTEScenario::isDue(milliseconds every) const { return _now % every == milliseconds(0); }
 
 LTELevels LTEScenario::levels(std::size_t cell) const
 {
@@ -155,7 +131,7 @@ LTELevels LTEScenario::levels(std::size_t cell) const
             averageAll += milliwatts(_drive.averageLevel(i));
         }
     const double power = _drive.level(cell);
-    const double share = shareInUse(own.earfcn, _now);
+    const double share = shareInUse(own.earfcn, now());
     const double powerQuality = quality(power, all, share);
     return {own,
             power,
@@ -173,28 +149,28 @@ std::vector<LTELevels> LTEScenario::levelsOf(const std::vector<std::size_t>& cel
     return found;
 }
 
-void LTEScenario::addServingCell(Messages& messages) const
+void LTEScenario::addServingCell()
 {
     const LTECell& cell = kLTETown[_drive.serving()];
-    messages.push_back(lteServingCell(cell));
-    messages.push_back(lteMasterInformation(cell, frames(_now, 10, 1024)));
+    add(lteServingCell(cell));
+    add(lteMasterInformation(cell, frames(now(), 10, 1024)));
 }
 
-void LTEScenario::addServingMeasurement(Messages& messages, bool rulesUpdated) const
+void LTEScenario::addServingMeasurement(bool rulesUpdated)
 {
-    messages.push_back(lteServingMeasurement(levels(_drive.serving()), rulesUpdated));
+    add(lteServingMeasurement(levels(_drive.serving()), rulesUpdated));
 }
 
-void LTEScenario::addConnectedMeasurement(Messages& messages) const
+void LTEScenario::addConnectedMeasurement()
 {
     const std::size_t serving = _drive.serving();
     const auto others = levelsOf(_drive.neighboursOn(kLTETown[serving].earfcn));
-    messages.push_back(lteConnectedMeasurement(levels(serving), others, frames(_now, 1, 10240)));
+    add(lteConnectedMeasurement(levels(serving), others, frames(now(), 1, 10240)));
 }
 
 // The neighbours on the serving channel, or where none is heard those on the channel of the
 // strongest: a report is of one channel and of at least one cell.
-void LTEScenario::addNeighbours(Messages& messages) const
+void LTEScenario::addNeighbours()
 {
     const std::vector<std::size_t> all = _drive.neighbours();
     if (all.empty())
@@ -202,38 +178,25 @@ void LTEScenario::addNeighbours(Messages& messages) const
     auto cells = _drive.neighboursOn(kLTETown[_drive.serving()].earfcn);
     if (cells.empty())
         cells = _drive.neighboursOn(kLTETown[all.front()].earfcn);
-    messages.push_back(lteNeighbourMeasurement(levelsOf(cells), frames(_now, 10, 1024)));
+    add(lteNeighbourMeasurement(levelsOf(cells), frames(now(), 10, 1024)));
 }
 
 // LTE and the other technologies by turns.
-void LTEScenario::addReselection(Messages& messages)
+void LTEScenario::addReselection()
 {
     const LTECell& serving = kLTETown[_drive.serving()];
     const std::vector<std::size_t> neighbours = _drive.neighbours();
     const unsigned turn = _reselections++;
     const bool isLte = turn % 2 == 0 && !neighbours.empty();
-    messages.push_back(lteReselection(serving, isLte ? lteCandidate(kLTETown[neighbours.front()])
-                                                     : otherCandidate(turn / 2)));
+    add(lteReselection(serving, isLte ? lteCandidate(kLTETown[neighbours.front()])
+                                      : otherCandidate(turn / 2)));
 }
 
-void LTEScenario::addCells(Messages& messages) const
+void LTEScenario::addCells()
 {
-    auto cells = PropertyValue::newArray();
-    cells.asArray()->append(
-        cellDictionary(kLTETown[_drive.serving()], kTSCellMonitorCellTypeServing));
-    for (const std::size_t cell : _drive.neighbours())
-        cells.asArray()->append(cellDictionary(kLTETown[cell], kTSCellMonitorCellTypeNeighbor));
-    messages.push_back(serverItem(kCellsItem, cells));
-}
-
-// The one for calls stays; the one for the rest comes and goes, each time with a new address.
-void LTEScenario::addDataConnections(Messages& messages) const
-{
-    auto connections = PropertyValue::newArray();
-    connections.asArray()->append(dataConnection("ims", "5", 0));
-    if (_dataConnection.isOn())
-        connections.asArray()->append(dataConnection("internet", "9", _dataConnections));
-    messages.push_back(serverItem(kDataConnectionsItem, connections));
+    add(cellList(_drive.serving(), _drive.neighbours(), [](std::size_t cell, bool isServing) {
+        return listed(kLTETown[cell], isServing);
+    }));
 }
 
 } // namespace orvane

@@ -1,5 +1,7 @@
 #include "telephonyd/phone/LTETown.h"
 
+#include "telephonyd/phone/EachSite.h"
+
 namespace orvane
 {
 
@@ -33,62 +35,45 @@ struct Site {
     std::uint16_t trackingAreaCode;
 };
 
-constexpr std::array<Site, kLTETownCells> kSites = {
-    {
-     {150, 120, -80, kCentre, 12, 0x01A2B00, 4101},
-     {560, -110, -80, kCentre, 48, 0x01A2B01, 4101},
-     {960, 90, -79, kCentre, 301, 0x01A2C00, 4101},
-     {1380, -80, -80, kCentre, 337, 0x01A2C01, 4101},
-     {1780, -60, -81, kCentre, 150, 0x01A2D02, 4101},
-     {1700, 400, -79, kStation, 77, 0x01B0100, 4101},
-     {1930, 800, -79, kStation, 221, 0x01B0101, 4102},
-     {1350, 520, -83, kStation, 404, 0x01B0102, 4101},
-     {2360, 1010, -79, kHarbour, 5, 0x01C3300, 4102},
-     {2690, 1300, -79, kHarbour, 17, 0x01C3301, 4102},
-     {2480, 1690, -80, kHarbour, 29, 0x01C3302, 4102},
-     {2050, 1880, -79, kSuburb, 468, 0x01D0A00, 4102},
-     {1560, 1740, -79, kSuburb, 479, 0x01D0A01, 4102},
-     {1080, 1890, -79, kSuburb, 490, 0x01D0A02, 4103},
-     {880, 1480, -80, kFields, 90, 0x01E5500, 4103},
-     {700, 1060, -80, kFields, 91, 0x01E5501, 4103},
-     {290, 930, -79, kVillage, 256, 0x01F1100, 4103},
-     {-90, 700, -79, kVillage, 257, 0x01F1101, 4103},
-     {110, 390, -81, kVillage, 503, 0x01F1102, 4101},
-     }
+constexpr Site kSites[] = {
+    {150,  120,  -80, kCentre,  12,  0x01A2B00, 4101},
+    {560,  -110, -80, kCentre,  48,  0x01A2B01, 4101},
+    {960,  90,   -79, kCentre,  301, 0x01A2C00, 4101},
+    {1380, -80,  -80, kCentre,  337, 0x01A2C01, 4101},
+    {1780, -60,  -81, kCentre,  150, 0x01A2D02, 4101},
+    {1700, 400,  -79, kStation, 77,  0x01B0100, 4101},
+    {1930, 800,  -79, kStation, 221, 0x01B0101, 4102},
+    {1350, 520,  -83, kStation, 404, 0x01B0102, 4101},
+    {2360, 1010, -79, kHarbour, 5,   0x01C3300, 4102},
+    {2690, 1300, -79, kHarbour, 17,  0x01C3301, 4102},
+    {2480, 1690, -80, kHarbour, 29,  0x01C3302, 4102},
+    {2050, 1880, -79, kSuburb,  468, 0x01D0A00, 4102},
+    {1560, 1740, -79, kSuburb,  479, 0x01D0A01, 4102},
+    {1080, 1890, -79, kSuburb,  490, 0x01D0A02, 4103},
+    {880,  1480, -80, kFields,  90,  0x01E5500, 4103},
+    {700,  1060, -80, kFields,  91,  0x01E5501, 4103},
+    {290,  930,  -79, kVillage, 256, 0x01F1100, 4103},
+    {-90,  700,  -79, kVillage, 257, 0x01F1101, 4103},
+    {110,  390,  -81, kVillage, 503, 0x01F1102, 4101},
 };
-
-constexpr std::array<LTECell, kLTETownCells> townCells()
-{
-    std::array<LTECell, kLTETownCells> cells{};
-    for (std::size_t i = 0; i < kSites.size(); ++i) {
-        const Site& site = kSites[i];
-        const Layer& layer = site.layer;
-        cells[i] = {site.physicalCellId,
-                    layer.earfcn,
-                    static_cast<std::uint16_t>(layer.earfcn + kUplinkOffset),
-                    layer.band,
-                    layer.resourceBlocks,
-                    site.cellIdentity,
-                    site.trackingAreaCode,
-                    layer.antennas,
-                    layer.priority};
-    }
-    return cells;
-}
-
-constexpr std::array<DriveCell, kLTETownCells> townMasts()
-{
-    std::array<DriveCell, kLTETownCells> masts{};
-    for (std::size_t i = 0; i < kSites.size(); ++i)
-        masts[i] = {kSites[i].eastMetres, kSites[i].northMetres, kSites[i].layer.earfcn,
-                    kSites[i].levelAt100Metres};
-    return masts;
-}
 
 } // namespace
 
-constexpr std::array<LTECell, kLTETownCells> kLTETown = townCells();
-constexpr std::array<DriveCell, kLTETownCells> kLTETownMasts = townMasts();
+constexpr std::array<LTECell, kLTETownCells> kLTETown = ofEach(kSites, [](const Site& site) {
+    const Layer& layer = site.layer;
+    return LTECell{site.physicalCellId,
+                   layer.earfcn,
+                   static_cast<std::uint16_t>(layer.earfcn + kUplinkOffset),
+                   layer.band,
+                   layer.resourceBlocks,
+                   site.cellIdentity,
+                   site.trackingAreaCode,
+                   layer.antennas,
+                   layer.priority};
+});
+constexpr std::array<DriveCell, kLTETownCells> kLTETownMasts = ofEach(kSites, [](const Site& site) {
+    return DriveCell{site.eastMetres, site.northMetres, site.layer.earfcn, site.levelAt100Metres};
+});
 constexpr std::array<RoadPoint, 8> kLTETownRoad = {
     {
      {0, 0},

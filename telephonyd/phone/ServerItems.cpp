@@ -2,7 +2,10 @@
 
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
+#include "platform/base/TelephonyConstants.h"
 #include "platform/plist/PropertyList.h"
+
+#include <cmath>
 
 namespace orvane
 {
@@ -34,37 +37,19 @@ PropertyValue simFiles()
     });
 }
 
-namespace
+PropertyValue listedCell(const char* technology, bool isServing,
+                         std::initializer_list<std::pair<const char*, double>> numbers)
 {
-
-// From the addresses that are kept for examples.
-std::string exampleAddress(unsigned number)
-{
-    return "192.0.2." + std::to_string(1 + number % 254);
-}
-
-} // namespace
-
-PropertyValue dataConnection(const char* accessPointName, const char* qosClass, unsigned number)
-{
-    return PropertyValue::dictionaryOf({
-        {"APN",        accessPointName       },
-        {"IP Address", exampleAddress(number)},
-        {"State",      "Active"              },
-        {"QCI",        qosClass              },
+    PropertyValue cell = PropertyValue::dictionaryOf({
+        {kTSCellMonitorCellRadioAccessTechnology, technology                       },
+        {kTSCellMonitorCellType,
+         isServing ? kTSCellMonitorCellTypeServing : kTSCellMonitorCellTypeNeighbor},
+        {kTSCellMonitorMCC,                       PropertyValue::integer(1)        },
+        {kTSCellMonitorMNC,                       PropertyValue::integer(1)        },
     });
-}
-
-PropertyValue packetDataContext(const char* accessPointName, const char* trafficClass,
-                                unsigned accessPointId, unsigned number)
-{
-    return PropertyValue::dictionaryOf({
-        {"APN",           accessPointName              },
-        {"IP Address",    exampleAddress(number)       },
-        {"State",         "Active"                     },
-        {"NSAPI",         std::to_string(accessPointId)},
-        {"Traffic Class", trafficClass                 },
-    });
+    for (const auto& [key, number] : numbers)
+        cell.asDictionary()->set(key, PropertyValue::integer(std::lround(number)));
+    return cell;
 }
 
 } // namespace orvane

@@ -3,6 +3,10 @@
 #include "platform/base/PropertyValue.h"
 #include "telephonyd/phone/Scenario.h"
 
+#include <initializer_list>
+#include <span>
+#include <utility>
+
 namespace orvane
 {
 
@@ -18,11 +22,19 @@ constexpr std::uint16_t kDataConnectionsItem = 2;
 // The files of a test card: mostly text, some as the card holds them.
 PropertyValue simFiles();
 
-// A data connection as the server lists it. `number` tells its addresses apart.
-PropertyValue dataConnection(const char* accessPointName, const char* qosClass, unsigned number);
+// A cell as the server lists it: its technology, whether it serves the phone, the network of all
+// towns (001 01), and the given numbers, rounded to whole ones.
+PropertyValue listedCell(const char* technology, bool isServing,
+                         std::initializer_list<std::pair<const char*, double>> numbers);
 
-// The same for networks before LTE. The access point id (5 to 15) tells a phone's contexts apart.
-PropertyValue packetDataContext(const char* accessPointName, const char* trafficClass,
-                                unsigned accessPointId, unsigned number);
+// The list of the serving cell and the others, each as the function makes it of its index.
+template <typename Function>
+PhoneMessage cellList(std::size_t serving, std::span<const std::size_t> others, Function listed)
+{
+    PropertyValue cells = PropertyValue::arrayOf({listed(serving, true)});
+    for (const std::size_t cell : others)
+        cells.asArray()->append(listed(cell, false));
+    return serverItem(kCellsItem, cells);
+}
 
 } // namespace orvane

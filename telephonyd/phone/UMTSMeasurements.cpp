@@ -20,22 +20,6 @@ constexpr std::size_t kMostActive = 3;
 
 double milliwatts(double decibelMilliwatts) { return std::pow(10, decibelMilliwatts / 10); }
 
-PropertyValue number(double value) { return PropertyValue::integer(std::lround(value)); }
-
-PropertyValue cellDictionary(const UMTSTownCell& cell, const char* type)
-{
-    return PropertyValue::dictionaryOf({
-        {kTSCellMonitorCellRadioAccessTechnology, cell.isUmts
-                                                      ? kTSCellMonitorRadioAccessTechnologyUMTS
-                                                      : kTSCellMonitorRadioAccessTechnologyGSM},
-        {kTSCellMonitorCellType,                  type                                                                                         },
-        {kTSCellMonitorMCC,                       number(1)                                                                                    },
-        {kTSCellMonitorMNC,                       number(1)                                                                                    },
-        {kTSCellMonitorLAC,                       number(cell.locationArea)                                                                    },
-        {kTSCellMonitorCellId,                    number(cell.cellIdentity)                                                                    },
-    });
-}
-
 } // namespace
 
 std::size_t UMTSScenario::bestOf(bool isUmts) const
@@ -94,7 +78,7 @@ UMTSLevel UMTSScenario::umtsLevel(std::size_t cell) const
 }
 
 // In a call the strongest cells on the channel serve the phone together.
-void UMTSScenario::addActiveSet(Messages& messages) const
+void UMTSScenario::addActiveSet()
 {
     const std::size_t best = bestOf(true);
     const std::uint16_t channel = kUMTSTown[best].channel;
@@ -112,10 +96,10 @@ void UMTSScenario::addActiveSet(Messages& messages) const
         }
         cells.push_back(level);
     }
-    messages.push_back(umtsActiveSet(totalPower(channel), cells));
+    add(umtsActiveSet(totalPower(channel), cells));
 }
 
-void UMTSScenario::addUMTSRanking(Messages& messages) const
+void UMTSScenario::addUMTSRanking()
 {
     std::vector<UMTSLevel> cells = {umtsLevel(bestOf(true))};
     for (const std::size_t cell : othersOf(true))
@@ -124,11 +108,11 @@ void UMTSScenario::addUMTSRanking(Messages& messages) const
     std::stable_sort(cells.begin(), cells.end(), [](const UMTSLevel& left, const UMTSLevel& right) {
         return left.rank > right.rank;
     });
-    messages.push_back(umtsRanking(cells));
+    add(umtsRanking(cells));
 }
 
 // The weaker a cell comes in, the stronger the phone has to send.
-void UMTSScenario::addTransmitPower(Messages& messages)
+void UMTSScenario::addTransmitPower()
 {
     constexpr double kLoss = -96; // dBm, of both powers together
     constexpr double kWeakest = -50;
@@ -137,10 +121,10 @@ void UMTSScenario::addTransmitPower(Messages& messages)
     for (double& power : powers)
         power = std::clamp(kLoss - _drive.level(bestOf(true)) + _noise.between(-1.5, 1.5), kWeakest,
                            kStrongest);
-    messages.push_back(umtsTransmitPower(powers));
+    add(umtsTransmitPower(powers));
 }
 
-void UMTSScenario::addBlockErrors(Messages& messages)
+void UMTSScenario::addBlockErrors()
 {
     constexpr std::uint32_t kSpeechBlocks = 48; // in the time between two reports
     constexpr std::uint32_t kSignallingBlocks = 24;
@@ -154,11 +138,11 @@ void UMTSScenario::addBlockErrors(Messages& messages)
         for (std::uint32_t i = 0; i < blocks; ++i)
             each.damaged += _noise.between(0, 1) < share ? 1 : 0;
     }
-    messages.push_back(umtsBlockErrors(_blocks));
+    add(umtsBlockErrors(_blocks));
 }
 
 // Where the cell comes in well, a second carrier helps.
-void UMTSScenario::addFastDownlink(Messages& messages)
+void UMTSScenario::addFastDownlink()
 {
     constexpr std::uint16_t kSubFrames = 240;
     constexpr std::uint8_t kProcesses = 6;
@@ -179,10 +163,10 @@ void UMTSScenario::addFastDownlink(Messages& messages)
         return found;
     };
     const auto primary = processes();
-    const bool isFirst = _now.count() == 0;
+    const bool isFirst = now().count() == 0;
     const auto secondary =
         isFirst || ratio > kWellQuality ? processes() : std::vector<DownlinkProcess>();
-    messages.push_back(umtsFastDownlink(kSubFrames, primary, secondary));
+    add(umtsFastDownlink(kSubFrames, primary, secondary));
 }
 
 std::vector<GSMLevel> UMTSScenario::gsmNeighbours() const
@@ -195,18 +179,15 @@ std::vector<GSMLevel> UMTSScenario::gsmNeighbours() const
     return found;
 }
 
-void UMTSScenario::addGSMMeasurement(Messages& messages) const
+void UMTSScenario::addGSMMeasurement()
 {
     const std::size_t best = bestOf(false);
-    messages.push_back(gsmMeasurement({kUMTSTown[best], _drive.level(best)}, gsmNeighbours()));
+    add(gsmMeasurement({kUMTSTown[best], _drive.level(best)}, gsmNeighbours()));
 }
 
-void UMTSScenario::addGSMColours(Messages& messages) const
-{
-    messages.push_back(gsmColours(gsmNeighbours()));
-}
+void UMTSScenario::addGSMColours() { add(gsmColours(gsmNeighbours())); }
 
-void UMTSScenario::addGSMRanking(Messages& messages) const
+void UMTSScenario::addGSMRanking()
 {
     const std::size_t best = bestOf(false);
     std::vector<GSMLevel> cells = {
@@ -214,33 +195,40 @@ void UMTSScenario::addGSMRanking(Messages& messages) const
     };
     for (const GSMLevel& each : gsmNeighbours())
         cells.push_back(each);
-    messages.push_back(gsmRanking(cells));
+    add(gsmRanking(cells));
 }
 
-// The server tells half of what a GSM cell's level is.
-void UMTSScenario::addCells(Messages& messages) const
+// The server reports half of a GSM cell's level.
+PropertyValue UMTSScenario::listed(std::size_t index, bool isServing) const
 {
-    auto cells = PropertyValue::newArray();
-    const auto append = [&](std::size_t index, const char* type) {
-        const UMTSTownCell& cell = kUMTSTown[index];
-        PropertyValue entry = cellDictionary(cell, type);
-        PropertyDictionary& keys = *entry.asDictionary();
-        if (cell.isUmts) {
-            keys.set(kTSCellMonitorUARFCN, number(cell.channel));
-            keys.set(kTSCellMonitorSCN, number(cell.code));
-            keys.set(kTSCellMonitorRSCP, number(_drive.level(index)));
-            keys.set(kTSCellMonitorECN0, number(quality(index)));
-        } else {
-            keys.set(kTSCellMonitorARFCN, number(cell.channel));
-            keys.set(kTSCellMonitorRSSI, number(_drive.level(index) / 2));
-        }
-        cells.asArray()->append(entry);
-    };
-    append(_drive.serving(), kTSCellMonitorCellTypeServing);
-    for (const bool isUmts : {serving().isUmts, !serving().isUmts})
-        for (const std::size_t cell : othersOf(isUmts))
-            append(cell, kTSCellMonitorCellTypeNeighbor);
-    messages.push_back(serverItem(kCellsItem, cells));
+    const UMTSTownCell& cell = kUMTSTown[index];
+    const double level = _drive.level(index);
+    if (!cell.isUmts)
+        return listedCell(kTSCellMonitorRadioAccessTechnologyGSM, isServing,
+                          {
+                              {kTSCellMonitorLAC,    cell.locationArea},
+                              {kTSCellMonitorCellId, cell.cellIdentity},
+                              {kTSCellMonitorARFCN,  cell.channel     },
+                              {kTSCellMonitorRSSI,   level / 2        },
+        });
+    return listedCell(kTSCellMonitorRadioAccessTechnologyUMTS, isServing,
+                      {
+                          {kTSCellMonitorLAC,    cell.locationArea},
+                          {kTSCellMonitorCellId, cell.cellIdentity},
+                          {kTSCellMonitorUARFCN, cell.channel     },
+                          {kTSCellMonitorSCN,    cell.code        },
+                          {kTSCellMonitorRSCP,   level            },
+                          {kTSCellMonitorECN0,   quality(index)   },
+    });
+}
+
+void UMTSScenario::addCells()
+{
+    std::vector<std::size_t> others = othersOf(serving().isUmts);
+    for (const std::size_t cell : othersOf(!serving().isUmts))
+        others.push_back(cell);
+    add(cellList(_drive.serving(), others,
+                 [this](std::size_t cell, bool isServing) { return listed(cell, isServing); }));
 }
 
 } // namespace orvane

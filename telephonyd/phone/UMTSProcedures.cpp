@@ -23,13 +23,13 @@ void UMTSScenario::registerWherePhoneIs()
 {
     const UMTSTownCell& cell = serving();
     const bool isElsewhere = cell.locationArea != _locationArea;
-    if (_now < _registeredAt || _now < kFirstRegistration || _use != Use::None ||
+    if (now() < _registeredAt || now() < kFirstRegistration || _use != Use::None ||
         (!isElsewhere && cell.routingArea == _routingArea))
         return;
     const bool isFirst = _locationArea == 0;
     _locationArea = cell.locationArea;
     _routingArea = cell.routingArea;
-    milliseconds at = _now;
+    milliseconds at = now();
     _agenda.add(at, registration(RegistrationState::Registering));
     if (cell.isUmts)
         _umts.connect(at);
@@ -86,7 +86,7 @@ void UMTSScenario::beginCall()
              std::pair{500,  WaitForOutgoingConnection},
              std::pair{1200, ConnectionActive         }
     })
-        _agenda.add(_now + milliseconds(after),
+        _agenda.add(now() + milliseconds(after),
                     circuitMobility(state, CircuitSubState::None, true));
 }
 
@@ -94,82 +94,82 @@ void UMTSScenario::endCall()
 {
     using enum CircuitState;
     _use = Use::None;
-    _agenda.add(_now, circuitMobility(WaitForNetworkCommand, CircuitSubState::None, true));
-    _agenda.add(_now + milliseconds(400),
+    _agenda.add(now(), circuitMobility(WaitForNetworkCommand, CircuitSubState::None, true));
+    _agenda.add(now() + milliseconds(400),
                 circuitMobility(Idle, CircuitSubState::NormalService, true));
 }
 
-void UMTSScenario::changeCell(bool wasUmts, Messages& messages)
+void UMTSScenario::changeCell(bool wasUmts)
 {
     const bool isUmts = serving().isUmts;
     if (isUmts != wasUmts) {
         // What was under way in the other network is not finished in it.
         _agenda.clear();
         _use = Use::None;
-        _registeredAt = _now;
+        _registeredAt = now();
         if (isUmts)
-            enterUMTS(messages);
+            enterUMTS();
         else
-            enterGSM(messages);
+            enterGSM();
     }
     if (isUmts) {
-        messages.push_back(umtsServingCell(serving()));
+        add(umtsServingCell(serving()));
         return;
     }
     if (!wasUmts && _use == Use::None) {
-        messages.push_back(gsmRadioState(GSMRadioState::Reselection, false));
-        _agenda.add(_now + milliseconds(400), gsmRadioState(GSMRadioState::Idle, false));
+        add(gsmRadioState(GSMRadioState::Reselection, false));
+        _agenda.add(now() + milliseconds(400), gsmRadioState(GSMRadioState::Idle, false));
     }
-    addGSMCell(messages);
+    addGSMCell();
 }
 
-void UMTSScenario::enterUMTS(Messages& messages)
+void UMTSScenario::enterUMTS()
 {
-    messages.push_back(gsmRadioState(GSMRadioState::GoingToUMTS, false));
-    messages.push_back(gsmRadioState(GSMRadioState::Inactive, false));
-    _umts.release(_now);
+    add(gsmRadioState(GSMRadioState::GoingToUMTS, false));
+    add(gsmRadioState(GSMRadioState::Inactive, false));
+    _umts.release(now());
     _umtsBefore = RadioState::Idle;
-    messages.push_back(umtsRadioState(RadioState::Idle));
+    add(umtsRadioState(RadioState::Idle));
 }
 
-void UMTSScenario::enterGSM(Messages& messages)
+void UMTSScenario::enterGSM()
 {
-    _umts.release(_now);
+    _umts.release(now());
     _umtsBefore = RadioState::Idle;
-    messages.push_back(umtsRadioState(RadioState::Idle));
-    messages.push_back(umtsCiphering(false));
-    messages.push_back(gsmRadioState(GSMRadioState::ComingFromUMTS, false));
-    messages.push_back(gsmRadioState(GSMRadioState::Idle, false));
+    add(umtsRadioState(RadioState::Idle));
+    add(umtsCiphering(false));
+    add(gsmRadioState(GSMRadioState::ComingFromUMTS, false));
+    add(gsmRadioState(GSMRadioState::Idle, false));
 }
 
 // The cell's own data at once, what it tells about packet service as its system information comes.
-void UMTSScenario::addGSMCell(Messages& messages)
+void UMTSScenario::addGSMCell()
 {
-    messages.push_back(gsmServingCell(serving()));
+    add(gsmServingCell(serving()));
     if (_use == Use::Call) {
-        messages.push_back(gsmMobileAllocation(serving()));
-        messages.push_back(gsmDedicatedChannel(serving()));
+        add(gsmMobileAllocation(serving()));
+        add(gsmDedicatedChannel(serving()));
     }
-    milliseconds at = _now;
+    milliseconds at = now();
     for (PhoneMessage& each : gprsInformation(serving()))
         _agenda.add(at += milliseconds(200), std::move(each));
 }
 
 // A connection on channels of its own is a call or a data transfer by turns, unless it was made to
 // register: then data go over it.
-void UMTSScenario::changeUMTSConnection(Messages& messages)
+void UMTSScenario::changeUMTSConnection()
 {
     const RadioState state = _umts.state();
-    messages.push_back(umtsRadioState(state));
+    add(umtsRadioState(state));
     if (_use == Use::Call)
         endCall();
     _use = Use::None;
-    const bool isRegistering = _now < _registeredAt;
+    const bool isRegistering = now() < _registeredAt;
     switch (state) {
     case RadioState::Connecting:
         if (!isRegistering && _umts.transfers() % 2 == 0) // the next one is of data
-            _agenda.add(_now, packetMobility(PacketState::ServiceRequestInitiated,
-                                             PacketSubState::None, true));
+            _agenda.add(now(), packetMobility(PacketState::ServiceRequestInitiated,
+                                              PacketSubState::None, true));
         break;
     case RadioState::CellDch:
         if (_umts.transfers() % 2 == 0 && !isRegistering)
@@ -181,14 +181,14 @@ void UMTSScenario::changeUMTSConnection(Messages& messages)
         break;
     }
     if (_umtsBefore == RadioState::Connecting) {
-        _agenda.add(_now + milliseconds(400), umtsCiphering(true));
+        _agenda.add(now() + milliseconds(400), umtsCiphering(true));
         if (!isRegistering)
             _agenda.add(
-                _now + milliseconds(400),
+                now() + milliseconds(400),
                 packetMobility(PacketState::Registered, PacketSubState::NormalService, true));
     }
     if (state == RadioState::Idle)
-        messages.push_back(umtsCiphering(false));
+        add(umtsCiphering(false));
     _umtsBefore = state;
 }
 
@@ -196,13 +196,13 @@ void UMTSScenario::changeUMTSConnection(Messages& messages)
 void UMTSScenario::changeGSMConnection()
 {
     const auto addRadio = [this](int after, GSMRadioState state, bool isData) {
-        _agenda.add(_now + milliseconds(after), gsmRadioState(state, isData));
+        _agenda.add(now() + milliseconds(after), gsmRadioState(state, isData));
     };
     const auto addPacket = [this](PacketSubState subState) {
-        _agenda.add(_now, packetMobility(PacketState::Registered, subState, true));
+        _agenda.add(now(), packetMobility(PacketState::Registered, subState, true));
     };
     if (_gsm.isOn()) {
-        if (_now < _registeredAt || _now < kFirstRegistration)
+        if (now() < _registeredAt || now() < kFirstRegistration)
             return; // busy enough
         const bool isCall = ++_gsmConnections % 2 == 1;
         addRadio(0, GSMRadioState::ConnectionPending, !isCall);
@@ -213,8 +213,8 @@ void UMTSScenario::changeGSMConnection()
         }
         beginCall();
         addPacket(PacketSubState::Suspended);
-        _agenda.add(_now + milliseconds(500), gsmMobileAllocation(serving()));
-        _agenda.add(_now + milliseconds(500), gsmDedicatedChannel(serving()));
+        _agenda.add(now() + milliseconds(500), gsmMobileAllocation(serving()));
+        _agenda.add(now() + milliseconds(500), gsmDedicatedChannel(serving()));
     } else if (_use != Use::None) {
         const bool isCall = _use == Use::Call;
         addRadio(0, GSMRadioState::ConnectionRelease, !isCall);

@@ -32,141 +32,107 @@ constexpr Phases::Range kNoDataFor{6, 14};
 } // namespace
 
 UMTSScenario::UMTSScenario(std::uint64_t seed)
-    : _drive(kUMTSTownMasts, kUMTSTownRoad, seed), _umts(seed + 1),
-      _gsm(kGSMConnectedFor, kGSMIdleFor, false, seed + 2),
-      _dataConnection(kDataFor, kNoDataFor, true, seed + 3), _noise(seed + 4),
+    : DrivenScenario(kTSLogChannelTechnology_Varnel_GSM,
+                     {
+                         kUMTSTownMasts, kUMTSTownRoad, seed
+}),
+      _umts(seed + 1), _gsm(kGSMConnectedFor, kGSMIdleFor, false, seed + 2),
+      _dataConnections(DataConnections::Network::BeforeLTE, kDataFor, kNoDataFor, seed + 3),
+      _noise(seed + 4),
       // Three of a call's speech, one of signalling.
-      _blocks{
-          {1,  0, 0},
-          {2,  0, 0},
-          {3,  0, 0},
-          {24, 0, 0}
-}
+      _blocks{{1, 0, 0}, {2, 0, 0}, {3, 0, 0}, {24, 0, 0}}
 {
-}
-
-std::string UMTSScenario::technology() const { return kTSLogChannelTechnology_Varnel_GSM; }
-
-std::vector<PhoneMessage> UMTSScenario::step(milliseconds now)
-{
-    Messages messages;
-    if (_now < milliseconds(0)) {
-        _now = milliseconds(0);
-        first(messages);
-    }
-    while (_now + Drive::kStep <= now) {
-        _now += Drive::kStep;
-        next(messages);
-    }
-    return messages;
 }
 
 // Switched on, the phone has listened to both networks and known nothing of either before.
-void UMTSScenario::first(Messages& messages)
+void UMTSScenario::first()
 {
     const UMTSTownCell& umts = kUMTSTown[bestOf(true)];
-    messages.push_back(serverItem(kSimFilesItem, simFiles()));
-    messages.push_back(registration(RegistrationState::AutomaticSearch));
-    messages.push_back(circuitMobility(CircuitState::Idle, CircuitSubState::NetworkSearch, false));
-    messages.push_back(
-        packetMobility(PacketState::Deregistered, PacketSubState::AttachNeeded, false));
-    messages.push_back(systemInformation(serving(), ServiceType::Limited));
-    messages.push_back(equivalentNetworks(serving().locationArea));
-    messages.push_back(umtsRadioState(RadioState::Idle));
-    messages.push_back(umtsServingCell(umts));
-    messages.push_back(umtsCiphering(false));
-    addActiveSet(messages);
-    addTransmitPower(messages);
-    addBlockErrors(messages);
-    addFastDownlink(messages);
-    messages.push_back(
-        gsmRadioState(serving().isUmts ? GSMRadioState::Inactive : GSMRadioState::Idle, false));
+    add(serverItem(kSimFilesItem, simFiles()));
+    add(registration(RegistrationState::AutomaticSearch));
+    add(circuitMobility(CircuitState::Idle, CircuitSubState::NetworkSearch, false));
+    add(packetMobility(PacketState::Deregistered, PacketSubState::AttachNeeded, false));
+    add(systemInformation(serving(), ServiceType::Limited));
+    add(equivalentNetworks(serving().locationArea));
+    add(umtsRadioState(RadioState::Idle));
+    add(umtsServingCell(umts));
+    add(umtsCiphering(false));
+    addActiveSet();
+    addTransmitPower();
+    addBlockErrors();
+    addFastDownlink();
+    add(gsmRadioState(serving().isUmts ? GSMRadioState::Inactive : GSMRadioState::Idle, false));
     const UMTSTownCell& gsm = kUMTSTown[bestOf(false)];
-    messages.push_back(gsmServingCell(gsm));
-    messages.push_back(gsmMobileAllocation(gsm));
-    messages.push_back(gsmDedicatedChannel(gsm));
-    messages.push_back(gsmDiscontinuousTransmission(false));
+    add(gsmServingCell(gsm));
+    add(gsmMobileAllocation(gsm));
+    add(gsmDedicatedChannel(gsm));
+    add(gsmDiscontinuousTransmission(false));
     for (PhoneMessage& each : gprsInformation(gsm))
-        messages.push_back(std::move(each));
-    addGSMColours(messages);
-    addMeasurements(messages);
+        add(std::move(each));
+    addGSMColours();
+    addMeasurements();
     if (serving().isUmts)
-        addGSMMeasurement(messages);
-    addDataConnections(messages);
+        addGSMMeasurement();
+    add(_dataConnections.item());
 }
 
-void UMTSScenario::next(Messages& messages)
+void UMTSScenario::next()
 {
-    if (_dataConnection.advance(_now)) {
-        _dataConnections += _dataConnection.isOn() ? 1 : 0;
-        addDataConnections(messages);
-    }
+    if (_dataConnections.advance(now()))
+        add(_dataConnections.item());
     const bool wasUmts = serving().isUmts;
     const bool cellChanged = _drive.step(_use != Use::None);
     if (cellChanged)
-        changeCell(wasUmts, messages);
+        changeCell(wasUmts);
     registerWherePhoneIs();
-    const bool gsmTurned = _gsm.advance(_now);
+    const bool gsmTurned = _gsm.advance(now());
     if (serving().isUmts) {
-        if (_umts.advance(_now))
-            changeUMTSConnection(messages);
+        if (_umts.advance(now()))
+            changeUMTSConnection();
     } else if (gsmTurned) {
         changeGSMConnection();
     }
-    _agenda.takeDue(_now, messages);
+    _agenda.takeDue(now(), messages());
     if (serving().isUmts)
-        addUMTSMeasurements(messages);
+        addUMTSMeasurements();
     else if (_use == Use::Call && isDue(kDiscontinuousEvery))
-        messages.push_back(gsmDiscontinuousTransmission(_noise.below(3) > 0));
+        add(gsmDiscontinuousTransmission(_noise.below(3) > 0));
     if (isDue(kColoursEvery) && !serving().isUmts)
-        addGSMColours(messages);
+        addGSMColours();
     if (cellChanged || isDue(kCellsEvery))
-        addMeasurements(messages);
+        addMeasurements();
 }
 
 const UMTSTownCell& UMTSScenario::serving() const { return kUMTSTown[_drive.serving()]; }
 
-bool UMTSScenario::isDue(milliseconds every) const { return _now % every == milliseconds(0); }
-
 // The ranking and the server's list of cells both tell the UMTS neighbours, the list and the GSM
 // measurement both the GSM ones. What comes last stays visible: the GSM measurement in GSM; in UMTS
 // the ranking while there is one, which a connection on channels of its own does without.
-void UMTSScenario::addMeasurements(Messages& messages)
+void UMTSScenario::addMeasurements()
 {
     if (!serving().isUmts) {
-        addGSMRanking(messages);
-        addCells(messages);
-        addGSMMeasurement(messages);
+        addGSMRanking();
+        addCells();
+        addGSMMeasurement();
         return;
     }
-    addCells(messages);
+    addCells();
     if (_umts.state() != RadioState::CellDch)
-        addUMTSRanking(messages);
+        addUMTSRanking();
 }
 
-void UMTSScenario::addUMTSMeasurements(Messages& messages)
+void UMTSScenario::addUMTSMeasurements()
 {
     const RadioState state = _umts.state();
     const bool isBusy = state == RadioState::CellDch;
     if (isDue(isBusy ? kActiveSetBusyEvery : kActiveSetIdleEvery))
-        addActiveSet(messages);
+        addActiveSet();
     if ((isBusy || state == RadioState::CellFach) && isDue(kTransmitPowerEvery))
-        addTransmitPower(messages);
+        addTransmitPower();
     if (isBusy && isDue(kBlockErrorsEvery))
-        addBlockErrors(messages);
+        addBlockErrors();
     if (isBusy && _use == Use::Data && isDue(kFastDownlinkEvery))
-        addFastDownlink(messages);
-}
-
-// The one for messages stays; the one for the rest comes and goes, each time with a new address.
-void UMTSScenario::addDataConnections(Messages& messages) const
-{
-    auto contexts = PropertyValue::newArray();
-    contexts.asArray()->append(packetDataContext("mms", "Background", 5, 0));
-    if (_dataConnection.isOn())
-        contexts.asArray()->append(
-            packetDataContext("internet", "Interactive", 6, _dataConnections));
-    messages.push_back(serverItem(kDataConnectionsItem, contexts));
+        addFastDownlink();
 }
 
 } // namespace orvane

@@ -41,107 +41,85 @@ bool isReceiving(RadioState state)
 double signalToInterference(double power) { return std::clamp((power + 114) * 0.55, 1.0, 24.0); }
 double percentDamaged(double ratio) { return std::min(12 * std::exp((4 - ratio) / 3), 60.0); }
 
-PropertyValue cellDictionary(const UTRANCell& cell, const char* type, double power)
+PropertyValue listed(const UTRANCell& cell, bool isServing, double power)
 {
-    const auto number = [](std::int64_t value) { return PropertyValue::integer(value); };
-    return PropertyValue::dictionaryOf({
-        {kTSCellMonitorCellRadioAccessTechnology, kTSCellMonitorRadioAccessTechnologyUTRAN2},
-        {kTSCellMonitorCellType,                  type                                     },
-        {kTSCellMonitorMCC,                       number(1)                                },
-        {kTSCellMonitorMNC,                       number(1)                                },
-        {kTSCellMonitorLAC,                       number(cell.locationArea)                },
-        {kTSCellMonitorCellId,                    number(cell.cellIdentity)                },
-        {kTSCellMonitorBandInfo,                  number(cell.band)                        },
-        {kTSCellMonitorSCN,                       number(cell.cellParameter)               },
-        {kTSCellMonitorUARFCN,                    number(cell.channel)                     },
-        {kTSCellMonitorRSCP,                      number(std::lround(power))               },
+    return listedCell(kTSCellMonitorRadioAccessTechnologyUTRAN2, isServing,
+                      {
+                          {kTSCellMonitorLAC,      cell.locationArea },
+                          {kTSCellMonitorCellId,   cell.cellIdentity },
+                          {kTSCellMonitorBandInfo, cell.band         },
+                          {kTSCellMonitorSCN,      cell.cellParameter},
+                          {kTSCellMonitorUARFCN,   cell.channel      },
+                          {kTSCellMonitorRSCP,     power             },
     });
 }
 
 } // namespace
 
 UTRANScenario::UTRANScenario(std::uint64_t seed)
-    : _drive(kUTRANTownMasts, kLTETownRoad, seed), _radio(seed + 1),
-      _dataConnection(kDataFor, kNoDataFor, true, seed + 2), _noise(seed + 3)
+    : DrivenScenario(kTSLogChannelTechnology_Varnel_UTRAN2, {kUTRANTownMasts, kLTETownRoad, seed}),
+      _radio(seed + 1),
+      _dataConnections(DataConnections::Network::BeforeLTE, kDataFor, kNoDataFor, seed + 2),
+      _noise(seed + 3)
 {
 }
 
-std::string UTRANScenario::technology() const { return kTSLogChannelTechnology_Varnel_UTRAN2; }
-
-std::vector<PhoneMessage> UTRANScenario::step(milliseconds now)
-{
-    Messages messages;
-    if (_now < milliseconds(0)) {
-        _now = milliseconds(0);
-        first(messages);
-    }
-    while (_now + Drive::kStep <= now) {
-        _now += Drive::kStep;
-        next(messages);
-    }
-    return messages;
-}
-
-void UTRANScenario::first(Messages& messages)
+void UTRANScenario::first()
 {
     _locationArea = kUTRANTown[_drive.serving()].locationArea;
-    messages.push_back(utranRadioState(_radio.state()));
-    addServingCell(messages);
-    messages.push_back(serverItem(kSimFilesItem, simFiles()));
-    addCells(messages);
-    addDataConnections(messages);
-    addNeighbours(messages);
-    addGSMNeighbours(messages);
-    addChannelQuality(messages);
+    add(utranRadioState(_radio.state()));
+    addServingCell();
+    add(serverItem(kSimFilesItem, simFiles()));
+    addCells();
+    add(_dataConnections.item());
+    addNeighbours();
+    addGSMNeighbours();
+    addChannelQuality();
 }
 
-void UTRANScenario::next(Messages& messages)
+void UTRANScenario::next()
 {
-    if (_radio.advance(_now))
-        messages.push_back(utranRadioState(_radio.state()));
-    if (_dataConnection.advance(_now)) {
-        _dataConnections += _dataConnection.isOn() ? 1 : 0;
-        addDataConnections(messages);
-    }
+    if (_radio.advance(now()))
+        add(utranRadioState(_radio.state()));
+    if (_dataConnections.advance(now()))
+        add(_dataConnections.item());
     const bool cellChanged = _drive.step(isOnOwnChannels(_radio.state()));
     if (cellChanged)
-        changeCell(messages);
-    if (_isRegistering && _now >= _registeredAt) {
+        changeCell();
+    if (_isRegistering && now() >= _registeredAt) {
         _isRegistering = false;
-        addServingCell(messages);
+        addServingCell();
     }
     if (cellChanged || isDue(kCellsEvery))
-        addCells(messages);
+        addCells();
     const milliseconds every =
         isReceiving(_radio.state()) ? kConnectedMeasurementEvery : kIdleMeasurementEvery;
     if (cellChanged || isDue(every)) {
-        addNeighbours(messages);
-        addChannelQuality(messages);
+        addNeighbours();
+        addChannelQuality();
     }
     if (isDue(kGSMMeasurementEvery))
-        addGSMNeighbours(messages);
+        addGSMNeighbours();
 }
 
-bool UTRANScenario::isDue(milliseconds every) const { return _now % every == milliseconds(0); }
-
-void UTRANScenario::changeCell(Messages& messages)
+void UTRANScenario::changeCell()
 {
     const std::uint16_t area = kUTRANTown[_drive.serving()].locationArea;
     if (area != _locationArea) {
         _locationArea = area;
         _isRegistering = true;
-        _registeredAt = _now + kRegistrationTakes;
+        _registeredAt = now() + kRegistrationTakes;
     }
-    addServingCell(messages);
+    addServingCell();
 }
 
 // Until the network has taken the phone in, it lets it make emergency calls only.
-void UTRANScenario::addServingCell(Messages& messages) const
+void UTRANScenario::addServingCell()
 {
-    messages.push_back(utranServingCell(kUTRANTown[_drive.serving()], _isRegistering));
+    add(utranServingCell(kUTRANTown[_drive.serving()], _isRegistering));
 }
 
-void UTRANScenario::addNeighbours(Messages& messages) const
+void UTRANScenario::addNeighbours()
 {
     const std::size_t serving = _drive.serving();
     const double best = _drive.averageLevel(serving);
@@ -159,11 +137,11 @@ void UTRANScenario::addNeighbours(Messages& messages) const
         cells.push_back(record(cell, isMonitored ? UTRANSet::Monitored : UTRANSet::Detected,
                                sharesChannel && power > best - kJointWithin));
     }
-    messages.push_back(utranNeighbours(cells));
+    add(utranNeighbours(cells));
 }
 
 // GSM transceivers share some of the masts.
-void UTRANScenario::addGSMNeighbours(Messages& messages) const
+void UTRANScenario::addGSMNeighbours()
 {
     constexpr double kGSMStronger = 6;
     constexpr std::uint16_t kFirstChannel = 22;
@@ -174,18 +152,18 @@ void UTRANScenario::addGSMNeighbours(Messages& messages) const
                              static_cast<std::uint16_t>(kFirstChannel + 3 * cell),
                              static_cast<std::uint8_t>(8 * (cell % 4) + cell % 8),
                              _drive.averageLevel(cell) + kGSMStronger});
-    messages.push_back(utranGSMNeighbours(cells));
+    add(utranGSMNeighbours(cells));
 }
 
 // What there is to be measured goes by the state: the paging channel, the shared channels, or those
 // of a call and of a data transfer by turns.
-void UTRANScenario::addChannelQuality(Messages& messages)
+void UTRANScenario::addChannelQuality()
 {
     constexpr std::uint8_t kBroadcastSlot = 0;
     const double ratio = signalToInterference(_drive.level(_drive.serving()));
     std::vector<TransportChannel> transport;
     std::vector<CodedChannel> coded;
-    const auto add = [&](std::uint8_t number, double more) {
+    const auto addTransport = [&](std::uint8_t number, double more) {
         transport.push_back({number, percentDamaged(ratio) + _noise.between(0, more)});
     };
     const auto addCoded = [&](std::uint8_t number, std::uint8_t slot, double more) {
@@ -197,49 +175,33 @@ void UTRANScenario::addChannelQuality(Messages& messages)
     switch (_radio.state()) {
     case RadioState::CellDch:
         addCoded(1, 5, 0);
-        add(1, 2);
+        addTransport(1, 2);
         if (_radio.transfers() % 2 == 1) {
-            add(2, 2);
-            add(3, 3);
-            add(31, 1);
+            addTransport(2, 2);
+            addTransport(3, 3);
+            addTransport(31, 1);
         } else {
-            add(31, 1);
+            addTransport(31, 1);
             addCoded(2, 6, -1);
         }
         break;
     case RadioState::CellFach:
         addCoded(1, 4, 0);
-        add(1, 2);
-        add(2, 2);
+        addTransport(1, 2);
+        addTransport(2, 2);
         break;
     default:
         addCoded(1, kBroadcastSlot, 2);
-        add(1, 2);
+        addTransport(1, 2);
     }
-    messages.push_back(utranChannelQuality(transport, coded));
+    add(utranChannelQuality(transport, coded));
 }
 
-void UTRANScenario::addCells(Messages& messages) const
+void UTRANScenario::addCells()
 {
-    auto cells = PropertyValue::newArray();
-    const auto append = [&](std::size_t cell, const char* type) {
-        cells.asArray()->append(cellDictionary(kUTRANTown[cell], type, _drive.averageLevel(cell)));
-    };
-    append(_drive.serving(), kTSCellMonitorCellTypeServing);
-    for (const std::size_t cell : _drive.neighbours())
-        append(cell, kTSCellMonitorCellTypeNeighbor);
-    messages.push_back(serverItem(kCellsItem, cells));
-}
-
-// The one for messages stays; the one for the rest comes and goes, each time with a new address.
-void UTRANScenario::addDataConnections(Messages& messages) const
-{
-    auto connections = PropertyValue::newArray();
-    connections.asArray()->append(packetDataContext("mms", "Background", 5, 0));
-    if (_dataConnection.isOn())
-        connections.asArray()->append(
-            packetDataContext("internet", "Interactive", 6, _dataConnections));
-    messages.push_back(serverItem(kDataConnectionsItem, connections));
+    add(cellList(_drive.serving(), _drive.neighbours(), [this](std::size_t cell, bool isServing) {
+        return listed(kUTRANTown[cell], isServing, _drive.averageLevel(cell));
+    }));
 }
 
 } // namespace orvane
