@@ -11,14 +11,20 @@ namespace
 
 // A command is asked for by the option of its name.
 constexpr CommandLineCommand kCommands[] = {
-    {"demo",     "--demo=SCENARIO [OPTION...]", "A telephony server for machines without one.",
-     "Runs until it is interrupted."                                                              },
-    {"replay",   "--replay FILE [OPTION...]",   "",                                             ""},
-    {"messages", "--messages=NAME [OPTION...]", "",                                             ""},
+    {"demo",     "--demo=SCENARIO [OPTION...]",
+     "A telephony server for a modem, a recording or a simulated phone.", "Runs until it is interrupted."},
+    {"replay",   "--replay FILE [OPTION...]",   "",                       ""                             },
+    {"messages", "--messages=NAME [OPTION...]", "",                       ""                             },
+    {"port",     "--port DEVICE [OPTION...]",   "",                       ""                             },
 };
 
-constexpr CommandSet kRecordings{1U << 1,
+constexpr unsigned kReplay = 1U << 1;
+constexpr unsigned kPort = 1U << 3;
+constexpr CommandSet kRecordings{kReplay,
                                  "is for a recording: use it with --replay FILE, or leave it out"};
+constexpr CommandSet kRecordingsAndModems{
+    kReplay | kPort,
+    "is for a recording or a modem: use it with --replay FILE or --port DEVICE, or leave it out"};
 
 using DaemonOption = Option<DaemonOptions>;
 
@@ -36,11 +42,16 @@ constexpr DaemonOption kOptions[] = {
                  [](DaemonOptions& options, const GivenOption& given) {
                      options.messages = technologyNamed(given.textOrFirst());
                  }),
-    DaemonOption({"technology", "NAME",
-                  "what was recorded: {} (default: by the recording's log codes)", kRecordings},
-                 [](DaemonOptions& options, const GivenOption& given) {
-                     options.technology = technologyNamed(given.text());
-                 }),
+    DaemonOption(
+        {"port", "DEVICE", "serve the modem whose diagnostic port this is, such as /dev/ttyUSB0"},
+        &DaemonOptions::port),
+    DaemonOption(
+        {"technology", "NAME",
+         "what was recorded, or what the modem serves: {} (default: by the log codes that come)",
+         kRecordingsAndModems},
+        [](DaemonOptions& options, const GivenOption& given) {
+            options.technology = technologyNamed(given.text());
+        }),
     DaemonOption({"speed", "N|max",
                   "seconds of the recording a second, 0.001 to 1000, or as fast as clients take it "
                   "(default 1)",
@@ -85,10 +96,11 @@ void parse(DaemonOptions& options, std::span<const std::string> arguments,
         ++given;
     }
     if (given > 1)
-        throw UsageError("--demo, --replay and --messages exclude each other: give one of them");
+        throw UsageError(
+            "--demo, --replay, --messages and --port exclude each other: give one of them");
     if (given == 0)
-        throw UsageError("give --demo=SCENARIO, --replay FILE or --messages=NAME: there is nothing "
-                         "to serve otherwise");
+        throw UsageError("give --demo=SCENARIO, --replay FILE, --messages=NAME or --port DEVICE: "
+                         "there is nothing to serve otherwise");
     line.storeIn(options, kOptions);
 }
 

@@ -15,14 +15,18 @@ struct DaemonOptions {
     bool wantsVersion = false;
     LogChoice log;
 
-    // Exactly one of the three is given.
+    // Exactly one of the four is given.
     std::optional<std::string> demo;     // the scenario of a simulated phone
     std::optional<std::string> replay;   // the recording that is sent again
     std::optional<std::string> messages; // the technology constant of the messages that are typed
 
+    std::optional<std::string> port; // the device that is a modem's diagnostic port
+
+    // Of a recording or a modem.
+    std::optional<std::string> technology; // the constant; nothing = by the log codes that come
+
     // Of a recording.
-    std::optional<std::string> technology; // the constant; nothing = by the recording's log codes
-    std::optional<double> speed = 1.0;     // nothing = as fast as clients take it
+    std::optional<double> speed = 1.0; // nothing = as fast as clients take it
     bool loops = false;
 
     std::string ports; // empty where not given

@@ -55,8 +55,11 @@ std::optional<Bytes> LogChannel::obey(const FrameReader::View& frame)
         return std::nullopt;
     }
     if (command.value[kGetTechnologyKey]) {
+        const std::string technology = _source->technology();
+        if (technology.empty())
+            return std::nullopt;
         return xmlPropertyListBytes(PropertyValue::dictionaryOf({
-            {kGetTechnologyKey, _source->technology()}
+            {kGetTechnologyKey, technology}
         }));
     }
     const std::string* state = command.value[kSetStateKey].asString();

@@ -9,6 +9,9 @@
 #include "platform/services/SystemLog.h"
 #include "telephonyd/LogChannel.h"
 
+#include <utility>
+#include <vector>
+
 namespace orvane
 {
 
@@ -127,6 +130,9 @@ std::int32_t LogServer::openChannel(ClientId client, const std::string& clientPo
         LogChannel::Events{[this, client] { channelStarted(client); },
                            [this, number] { channelEnded(number); }});
     logLine(LogPriority::Info, "%s is open for %s", port.c_str(), clientPort.c_str());
+    if (_isModemMissing)
+        _queue.async(
+            _lifetime.whileAlive([this, client] { notify(client, kModemMissingNotification); }));
     return 0;
 }
 
@@ -145,17 +151,42 @@ void LogServer::channelEnded(ChannelNumber number)
 // Once the first messages are on their way the client may as well show them.
 void LogServer::channelStarted(ClientId client)
 {
-    _queue.after(kNotificationDelay, _lifetime.whileAlive([this, client] { notify(client); }));
+    _queue.after(kNotificationDelay, _lifetime.whileAlive([this, client] {
+        notify(client, kChannelStreamingNotification);
+    }));
 }
 
-void LogServer::notify(ClientId client)
+void LogServer::technologyChanged()
+{
+    _channels.clear();
+    // Clients are to see the end of their channels before the notification, which makes them look.
+    _queue.after(kNotificationDelay,
+                 _lifetime.whileAlive([this] { notifyAll(kTechnologyChangedNotification); }));
+}
+
+void LogServer::setModemMissing(bool isMissing)
+{
+    if (std::exchange(_isModemMissing, isMissing) != isMissing)
+        notifyAll(isMissing ? kModemMissingNotification : kModemPresentNotification);
+}
+
+void LogServer::notifyAll(const char* name)
+{
+    std::vector<ClientId> clients;
+    for (const auto& [client, connection] : _clients)
+        clients.push_back(client);
+    for (const ClientId client : clients)
+        notify(client, name);
+}
+
+void LogServer::notify(ClientId client, const char* name)
 {
     const auto found = _clients.find(client);
     if (found == _clients.end())
         return;
     found->second->send(kNotificationMessage, 0, false, false,
                         xmlBytes(PropertyValue::dictionaryOf({
-                            {kNotificationNameKey, kChannelStreamingNotification}
+                            {kNotificationNameKey, name}
     })));
 }
 

@@ -17,8 +17,8 @@ namespace orvane
 
 class LogChannel;
 
-// A telephony server for machines without one: gives clients log channels whose messages come from
-// a simulated phone or a recording. Serves any number of clients on one queue.
+// A telephony server: gives clients log channels whose messages come from a simulated phone, a
+// recording or a modem. Serves any number of clients on one queue.
 class LogServer
 {
 public:
@@ -42,6 +42,13 @@ public:
     // Closes all channels and connections. Not to be called from within a source's call.
     void stop();
 
+    // Closes all channels, whose clients then ask for the technology anew, and notifies all
+    // clients. Not to be called from within a call of a channel's source.
+    void technologyChanged();
+    // Tells all clients, and those that come later, that the modem is missing; or, after that, that
+    // it is there again. At first it is not missing.
+    void setModemMissing(bool isMissing);
+
     [[nodiscard]] std::size_t channelCount() const { return _channels.size(); }
     [[nodiscard]] std::size_t clientCount() const { return _clients.size(); }
 
@@ -56,7 +63,8 @@ private:
     std::int32_t openChannel(ClientId client, const std::string& clientPort, std::string& port);
     void channelEnded(ChannelNumber number);
     void channelStarted(ClientId client);
-    void notify(ClientId client);
+    void notify(ClientId client, const char* name);
+    void notifyAll(const char* name);
 
     FrameTransport& _transport;
     MainQueue& _queue;
@@ -66,6 +74,7 @@ private:
     std::map<ChannelNumber, std::unique_ptr<LogChannel>> _channels;
     ClientId _lastClient = 0;
     ChannelNumber _lastChannel = 0;
+    bool _isModemMissing = false;
     Lifetime _lifetime;
 };
 

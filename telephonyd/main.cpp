@@ -6,6 +6,7 @@
 #include "platform/linux/QtEventLoop.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/ResourceDirectory.h"
+#include "platform/linux/SerialDevice.h"
 #include "platform/linux/SignalWatcher.h"
 #include "platform/linux/SocketTransport.h"
 #include "platform/linux/StalePorts.h"
@@ -14,8 +15,10 @@
 #include "platform/services/Services.h"
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
+#include "telephonyd/ModemSource.h"
 #include "telephonyd/ReplaySource.h"
 #include "telephonyd/TypedMessages.h"
+#include "telephonyd/modem/DiagnosticModem.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <chrono>
@@ -24,6 +27,7 @@
 #include <exception>
 #include <filesystem>
 #include <unistd.h>
+#include <utility>
 
 using namespace orvane;
 
@@ -65,6 +69,24 @@ LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
     };
 }
 
+std::unique_ptr<DiagnosticModem> modemOf(const DaemonOptions& options, MainQueue& queue)
+{
+    const auto open = [device = *options.port](std::string& error) {
+        return openSerialDevice(device, error);
+    };
+    return std::make_unique<DiagnosticModem>(
+        queue, open, DiagnosticModem::Settings{*options.port, options.technology});
+}
+
+// What the server tells its clients of the modem. Both must outlive the modem's events.
+DiagnosticModem::Events eventsFor(LogServer& server, const DiagnosticModem& modem)
+{
+    return {[&server] { server.technologyChanged(); },
+            [&server, &modem] {
+                server.setModemMissing(modem.presence() == DiagnosticModem::Presence::Missing);
+            }};
+}
+
 int serve(const DaemonOptions& options)
 {
     std::string error;
@@ -78,8 +100,12 @@ int serve(const DaemonOptions& options)
     SocketTransport transport(*directory);
     std::unique_ptr<TypedMessages> messages;
     std::unique_ptr<LineReader> reader;
+    std::unique_ptr<DiagnosticModem> modem;
     LogSourceFactory factory;
-    if (options.messages) {
+    if (options.port) {
+        modem = modemOf(options, queue);
+        factory = [&modem] { return std::make_unique<ModemSource>(*modem); };
+    } else if (options.messages) {
         messages = std::make_unique<TypedMessages>(*options.messages, queue, complain);
         factory = messages->sources();
     } else {
@@ -109,7 +135,23 @@ int serve(const DaemonOptions& options)
     };
     removeLeftovers();
     const auto cleaning = queue.repeatingTimer(kCleaningInterval, removeLeftovers);
-    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    if (modem) {
+        modem->setEvents(eventsFor(server, *modem));
+        if (const auto failure = modem->start()) {
+            complain(*failure);
+            return kFailure;
+        }
+    }
+    bool isEnding = false;
+    const SignalWatcher signals([&](int) {
+        // The modem is left as it was found; a second signal does not wait for that.
+        if (!modem || std::exchange(isEnding, true)) {
+            loop.quit();
+            return;
+        }
+        server.stop();
+        modem->stop([&loop] { loop.quit(); });
+    });
     logLine(LogPriority::Notice, "Serving in %s", directory->path().c_str());
     return loop.run();
 }

@@ -73,9 +73,10 @@ std::string GivenOption::text() const
     if (!namesOfValue(_option, _names).empty())
         static_cast<void>(choice());
     else if (_value.empty())
-        fail(argument == "DIR"    ? "needs the name of a directory"
-             : argument == "FILE" ? "needs the name of a file"
-                                  : "needs a value");
+        fail(argument == "DIR"      ? "needs the name of a directory"
+             : argument == "DEVICE" ? "needs the name of a device"
+             : argument == "FILE"   ? "needs the name of a file"
+                                    : "needs a value");
     return _value;
 }
 

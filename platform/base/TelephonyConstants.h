@@ -46,6 +46,9 @@ inline constexpr const char* kLogChannelPortKey = "Port";
 inline constexpr const char* kNotificationNameKey = "Name";
 inline constexpr const char* kNotificationInfoKey = "Info";
 inline constexpr const char* kChannelStreamingNotification = "ChannelStreaming";
+inline constexpr const char* kTechnologyChangedNotification = "TechnologyChanged";
+inline constexpr const char* kModemMissingNotification = "ModemMissing";
+inline constexpr const char* kModemPresentNotification = "ModemPresent";
 
 // Those of a log channel: technology query, start command and log messages.
 inline constexpr std::int32_t kChannelMessage = 0;

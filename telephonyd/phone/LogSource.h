@@ -30,7 +30,8 @@ public:
     using Send = std::function<bool(ByteView message)>;
 
     virtual ~LogSource() = default;
-    // The technology constant that answers the technology query.
+    // The technology constant that answers the technology query. Empty while it is not known: the
+    // query then gets an empty reply, and the client asks again.
     [[nodiscard]] virtual std::string technology() const = 0;
     // Begins to send what the selection asks for, never from within this call. Called once.
     virtual void start(const LogSelection& selection, Send send) = 0;

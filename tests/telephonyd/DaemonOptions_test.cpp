@@ -56,34 +56,47 @@ TEST(DaemonOptionsTest, TypedMessagesAreOfLteUnlessNamed)
     EXPECT_FALSE(parsed({"--messages"}).demo);
 }
 
+TEST(DaemonOptionsTest, AModemIsServedThroughItsDiagnosticPort)
+{
+    const DaemonOptions plain = parsed({"--port", "/dev/ttyUSB0"});
+    EXPECT_FALSE(plain.error);
+    EXPECT_EQ(plain.port, "/dev/ttyUSB0");
+    EXPECT_FALSE(plain.technology);
+    EXPECT_EQ(parsed({"--port=/dev/ttyUSB0", "--technology=utran"}).technology,
+              kTSLogChannelTechnology_Varnel_UTRAN2);
+}
+
 TEST(DaemonOptionsTest, MistakesAreNamedWithWhatToDo)
 {
     const struct {
         std::vector<std::string> arguments;
         const char* error;
     } cases[] = {
-        {{},                                 "give --demo=SCENARIO, --replay FILE or --messages=NAME"       },
-        {{"--demo", "--replay=x"},           "exclude each other: give one"                                 },
-        {{"--demo=nope"},                    "--demo takes lte or other"                                    },
-        {{"--demo", "--messages"},           "exclude each other: give one"                                 },
-        {{"--messages", "--replay=x"},       "exclude each other: give one"                                 },
-        {{"--messages=gsm"},                 "--messages takes lte, umts, utran or cdma, not \"gsm\""       },
-        {{"--messages=cellmonitor"},         "--messages takes lte"                                         },
-        {{"--messages", "--loop"},           "--loop is for a recording"                                    },
-        {{"--demo", "--loop"},               "--loop is for a recording"                                    },
-        {{"--demo", "--speed=1"},            "--speed is for a recording"                                   },
-        {{"--demo", "--technology=lte"},     "--technology is for a recording"                              },
-        {{"--replay="},                      "--replay needs the name of a file"                            },
-        {{"--replay=x", "--speed=0"},        "give a number from 0.001 to 1000 or max"                      },
-        {{"--replay=x", "--speed=1000.5"},   "--speed \"1000.5\" is unusable"                               },
-        {{"--replay=x", "--speed="},         "--speed \"\" is unusable"                                     },
-        {{"--replay=x", "--speed=nan"},      "--speed \"nan\" is unusable"                                  },
-        {{"--replay=x", "--technology=gsm"}, "--technology takes lte, umts"                                 },
-        {{"--demo", "--ports="},             "--ports needs the name of a directory"                        },
-        {{"--demo", "--log=file"},           "--log takes"                                                  },
-        {{"--demo", "--log-level=loud"},     "--log-level takes"                                            },
-        {{"--demo", "x.dlf"},                "\"x.dlf\" is not an option: give a recording as --replay FILE"},
-        {{"--demos"},                        "unknown option --demos"                                       },
+        {{},                                 "give --demo=SCENARIO, --replay FILE, --messages=NAME or --port DEVICE"},
+        {{"--demo", "--replay=x"},           "exclude each other: give one"                                         },
+        {{"--demo=nope"},                    "--demo takes lte or other"                                            },
+        {{"--demo", "--messages"},           "exclude each other: give one"                                         },
+        {{"--messages", "--replay=x"},       "exclude each other: give one"                                         },
+        {{"--messages=gsm"},                 "--messages takes lte, umts, utran or cdma, not \"gsm\""               },
+        {{"--messages=cellmonitor"},         "--messages takes lte"                                                 },
+        {{"--messages", "--loop"},           "--loop is for a recording"                                            },
+        {{"--demo", "--loop"},               "--loop is for a recording"                                            },
+        {{"--demo", "--speed=1"},            "--speed is for a recording"                                           },
+        {{"--demo", "--technology=lte"},     "--technology is for a recording or a modem"                           },
+        {{"--replay="},                      "--replay needs the name of a file"                                    },
+        {{"--replay=x", "--speed=0"},        "give a number from 0.001 to 1000 or max"                              },
+        {{"--replay=x", "--speed=1000.5"},   "--speed \"1000.5\" is unusable"                                       },
+        {{"--replay=x", "--speed="},         "--speed \"\" is unusable"                                             },
+        {{"--replay=x", "--speed=nan"},      "--speed \"nan\" is unusable"                                          },
+        {{"--replay=x", "--technology=gsm"}, "--technology takes lte, umts"                                         },
+        {{"--demo", "--ports="},             "--ports needs the name of a directory"                                },
+        {{"--demo", "--log=file"},           "--log takes"                                                          },
+        {{"--demo", "--log-level=loud"},     "--log-level takes"                                                    },
+        {{"--demo", "x.dlf"},                "\"x.dlf\" is not an option: give a recording as --replay FILE"        },
+        {{"--port="},                        "--port needs the name of a device"                                    },
+        {{"--port=x", "--demo"},             "exclude each other: give one"                                         },
+        {{"--port=x", "--loop"},             "--loop is for a recording"                                            },
+        {{"--demos"},                        "unknown option --demos"                                               },
     };
     for (const auto& each : cases)
         EXPECT_THAT(parsed(each.arguments).error.value_or("no error"), HasSubstr(each.error));
@@ -95,8 +108,9 @@ TEST(DaemonOptionsTest, HelpAndVersionNeedNothingElse)
     EXPECT_TRUE(parsed({"--version"}).wantsVersion);
     EXPECT_FALSE(parsed({"--version"}).error);
     const std::vector<std::string> scenarios = {"lte", "other"};
-    for (const char* option : {"--demo", "--replay", "--messages", "--technology", "--speed",
-                               "--loop", "--ports", "--log ", "--log-level", "lte or other"})
+    for (const char* option :
+         {"--demo", "--replay", "--messages", "--technology", "--speed", "--loop", "--port ",
+          "--ports", "--log ", "--log-level", "lte or other"})
         EXPECT_THAT(daemonHelp(scenarios), HasSubstr(option));
 }
 
