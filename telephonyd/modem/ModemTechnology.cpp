@@ -1,5 +1,6 @@
 #include "telephonyd/modem/ModemTechnology.h"
 
+#include "platform/base/Technology.h"
 #include "platform/services/SystemLog.h"
 
 #include <utility>
@@ -58,7 +59,8 @@ void ModemTechnology::found(const std::string& technology)
     _isConfirmed = true;
     ++_silences;
     _probe.stop();
-    logLine(LogPriority::Info, "The modem serves %s", technology.c_str());
+    logLine(LogPriority::Info, "The modem serves %s",
+            std::string(nameOfTechnology(technology)).c_str());
     if (isOther)
         _events.changed();
 }
