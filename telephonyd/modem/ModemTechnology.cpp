@@ -59,8 +59,7 @@ void ModemTechnology::found(const std::string& technology)
     _isConfirmed = true;
     ++_silences;
     _probe.stop();
-    logLine(LogPriority::Info, "The modem serves %s",
-            std::string(nameOfTechnology(technology)).c_str());
+    logLine(LogPriority::Info, "The modem serves %s", nameOfTechnology(technology).c_str());
     if (isOther)
         _events.changed();
 }
