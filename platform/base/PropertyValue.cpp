@@ -68,6 +68,11 @@ PropertyValue PropertyValue::data(Bytes bytes)
     return PropertyValue(Storage(std::make_shared<const Bytes>(std::move(bytes))));
 }
 
+PropertyValue PropertyValue::largeNumber(PropertyLargeNumber number)
+{
+    return PropertyValue(Storage(std::make_shared<const PropertyLargeNumber>(std::move(number))));
+}
+
 PropertyValue PropertyValue::newDictionary() { return std::make_shared<PropertyDictionary>(); }
 
 PropertyValue PropertyValue::newArray() { return std::make_shared<PropertyArray>(); }
@@ -92,6 +97,12 @@ PropertyValue PropertyValue::arrayOf(std::initializer_list<PropertyValue> elemen
 const Bytes* PropertyValue::asData() const
 {
     const DataPointer* pointer = std::get_if<DataPointer>(&_value);
+    return pointer ? pointer->get() : nullptr;
+}
+
+const PropertyLargeNumber* PropertyValue::asLargeNumber() const
+{
+    const LargeNumberPointer* pointer = std::get_if<LargeNumberPointer>(&_value);
     return pointer ? pointer->get() : nullptr;
 }
 
@@ -154,6 +165,8 @@ bool operator==(const PropertyValue& left, const PropertyValue& right)
         return left.asArray()->elements() == right.asArray()->elements();
     case PropertyValue::Type::Data:
         return *left.asData() == *right.asData();
+    case PropertyValue::Type::LargeNumber:
+        return *left.asLargeNumber() == *right.asLargeNumber();
     case PropertyValue::Type::Real:
         return equalReals(*left.asReal(), *right.asReal());
     case PropertyValue::Type::Date:
@@ -174,6 +187,7 @@ const char* PropertyValue::typeName() const
         return "string";
     case Type::Integer:
     case Type::Real:
+    case Type::LargeNumber:
         return "number";
     case Type::Boolean:
         return "boolean";
@@ -214,6 +228,8 @@ std::string PropertyValue::description() const
         return std::to_string(*asInteger());
     case Type::Real:
         return formattedReal(*asReal());
+    case Type::LargeNumber:
+        return asLargeNumber()->digits;
     case Type::Boolean:
         return *asBoolean() ? "true" : "false";
     case Type::Data:

@@ -24,6 +24,13 @@ struct PropertyDate {
     friend bool operator==(const PropertyDate&, const PropertyDate&) = default;
 };
 
+// A number that no 64-bit integer and no finite real holds, as it was written.
+struct PropertyLargeNumber {
+    std::string digits; // "18446744073709551616", "0x10000000000000000", "-1e400"
+    bool isReal = false;
+    friend bool operator==(const PropertyLargeNumber&, const PropertyLargeNumber&) = default;
+};
+
 // The one value type of commands, replies, templates, state, display and files.
 //
 // Scalars are values; the bytes of data are never changed, so copies share them. Dictionaries and
@@ -33,7 +40,18 @@ struct PropertyDate {
 class PropertyValue
 {
 public:
-    enum class Type { Absent, Dictionary, Array, String, Integer, Real, Boolean, Data, Date };
+    enum class Type {
+        Absent,
+        Dictionary,
+        Array,
+        String,
+        Integer,
+        Real,
+        Boolean,
+        Data,
+        Date,
+        LargeNumber
+    };
 
     PropertyValue() = default;
     PropertyValue(std::string text) : _value(std::move(text)) {}
@@ -48,6 +66,7 @@ public:
     static PropertyValue boolean(bool flag) { return PropertyValue(Storage(flag)); }
     static PropertyValue data(Bytes bytes);
     static PropertyValue date(PropertyDate date) { return PropertyValue(Storage(date)); }
+    static PropertyValue largeNumber(PropertyLargeNumber number);
     static PropertyValue newDictionary();
     static PropertyValue newArray();
 
@@ -68,6 +87,8 @@ public:
     [[nodiscard]] std::optional<bool> asBoolean() const { return scalar<bool>(); }
     [[nodiscard]] const Bytes* asData() const;
     [[nodiscard]] std::optional<PropertyDate> asDate() const { return scalar<PropertyDate>(); }
+    // Converts to no integer and no real.
+    [[nodiscard]] const PropertyLargeNumber* asLargeNumber() const;
     // The container is shared, hence changeable also through a constant value.
     [[nodiscard]] PropertyDictionary* asDictionary() const;
     [[nodiscard]] PropertyArray* asArray() const;
@@ -87,16 +108,19 @@ public:
     // "dictionary", "array", "string", "number", "boolean", "data", "date" or "nothing".
     [[nodiscard]] const char* typeName() const;
     // What "%@" shows in a text: a string as it is, a dictionary as {key = value; ...}, an array as
-    // (value, ...), data as <hexadecimal>. On one line.
+    // (value, ...), data as <hexadecimal>, a large number as its digits. On one line.
     [[nodiscard]] std::string description() const;
 
 private:
     using DictionaryPointer = std::shared_ptr<PropertyDictionary>;
     using ArrayPointer = std::shared_ptr<PropertyArray>;
     using DataPointer = std::shared_ptr<const Bytes>;
+    // Rare, so that a pointer is better than a larger value.
+    using LargeNumberPointer = std::shared_ptr<const PropertyLargeNumber>;
     // The order of the alternatives is the order of Type.
-    using Storage = std::variant<std::monostate, DictionaryPointer, ArrayPointer, std::string,
-                                 std::int64_t, double, bool, DataPointer, PropertyDate>;
+    using Storage =
+        std::variant<std::monostate, DictionaryPointer, ArrayPointer, std::string, std::int64_t,
+                     double, bool, DataPointer, PropertyDate, LargeNumberPointer>;
 
     explicit PropertyValue(Storage value) : _value(std::move(value)) {}
 
@@ -136,7 +160,7 @@ public:
     void setText(std::string_view key, std::string&& text);
     void remove(std::string_view key) { _entries.remove(key); }
     void clear() { _entries.clear(); }
-    // Makes room for that many entries in one go.
+    // Makes room for that many entries at once.
     void reserve(std::size_t size) { _entries.reserve(size); }
 
 private:
@@ -155,6 +179,8 @@ public:
     [[nodiscard]] const PropertyValue& operator[](std::size_t index) const;
     [[nodiscard]] const std::vector<PropertyValue>& elements() const { return _elements; }
 
+    // Makes room for that many elements at once.
+    void reserve(std::size_t size) { _elements.reserve(size); }
     // Like PropertyDictionary::set, refuses an absent value.
     void append(PropertyValue value);
     // Removes `count` elements from the front, or all if there are fewer.

@@ -1,6 +1,7 @@
 #include "platform/plist/PropertyListBinaryObjects.h"
 
 #include <algorithm>
+#include <numeric>
 
 namespace orvane
 {
@@ -67,6 +68,8 @@ bool PropertyListBinaryObjects::readTrailer()
 {
     if (_bytes.size() < kMagicBytes + kTrailerBytes)
         return fail("binary property list cut short", _bytes.size());
+    if (_bytes.size() > UINT32_MAX)
+        return fail("binary property list longer than 4 GiB", _bytes.size());
     // Six bytes that do not matter, the two widths, then three integers of 8 bytes.
     const std::size_t trailer = _bytes.size() - kTrailerBytes;
     const auto numberAt = [this](std::size_t at) { return bigEndian(_bytes.subspan(at, 8)); };
@@ -99,7 +102,6 @@ bool PropertyListBinaryObjects::readTrailer()
 bool PropertyListBinaryObjects::readObjects()
 {
     _objects.reserve(_objectCount);
-    _ends.reserve(_objectCount);
     for (std::size_t i = 0; i < _objectCount; ++i) {
         const std::size_t entry = _table + i * _offsetBytes;
         const std::uint64_t offset = bigEndian(_bytes.subspan(entry, _offsetBytes));
@@ -171,25 +173,49 @@ bool PropertyListBinaryObjects::bound(Object object, std::size_t unitBytes)
     const bool isContainer = object.type == Type::Array || object.type == Type::Dictionary;
     if (!isContainer)
         object.count = contentBytes;
-    _objects.push_back(object);
-    _ends.push_back(object.content + contentBytes);
+    _objects.push_back({static_cast<std::uint32_t>(object.begin),
+                        static_cast<std::uint32_t>(object.count),
+                        static_cast<std::uint8_t>(object.content - object.begin), object.type});
     return true;
+}
+
+PropertyListBinaryObjects::Object PropertyListBinaryObjects::operator[](std::size_t index) const
+{
+    const Kept& kept = _objects[index];
+    return {kept.begin, std::size_t{kept.begin} + kept.contentOffset, kept.count, kept.type};
+}
+
+std::size_t PropertyListBinaryObjects::endOf(std::size_t index) const
+{
+    const Object object = (*this)[index];
+    const std::size_t references = object.type == Type::Dictionary ? 2 : 1;
+    const bool isContainer = object.type == Type::Array || object.type == Type::Dictionary;
+    return object.content + object.count * (isContainer ? references * _referenceBytes : 1);
 }
 
 bool PropertyListBinaryObjects::refuseOverlaps()
 {
-    std::vector<std::size_t> order(_objects.size());
-    for (std::size_t i = 0; i < order.size(); ++i)
-        order[i] = i;
-    const auto standsBefore = [this](std::size_t left, std::size_t right) {
-        return _objects[left].begin < _objects[right].begin;
+    const auto overlap = [this](std::size_t earlier, std::size_t later) {
+        return _objects[later].begin < endOf(earlier) &&
+               !fail("overlapping objects", _objects[later].begin);
     };
     // Most writers put objects in the order of the table.
-    if (!std::is_sorted(order.begin(), order.end(), standsBefore))
-        std::sort(order.begin(), order.end(), standsBefore);
+    if (std::is_sorted(_objects.begin(), _objects.end(), [](const Kept& left, const Kept& right) {
+            return left.begin < right.begin;
+        })) {
+        for (std::size_t i = 1; i < _objects.size(); ++i)
+            if (overlap(i - 1, i))
+                return false;
+        return true;
+    }
+    std::vector<std::uint32_t> order(_objects.size());
+    std::iota(order.begin(), order.end(), 0U);
+    std::sort(order.begin(), order.end(), [this](std::uint32_t left, std::uint32_t right) {
+        return _objects[left].begin < _objects[right].begin;
+    });
     for (std::size_t i = 1; i < order.size(); ++i)
-        if (_objects[order[i]].begin < _ends[order[i - 1]])
-            return fail("overlapping objects", _objects[order[i]].begin);
+        if (overlap(order[i - 1], order[i]))
+            return false;
     return true;
 }
 

@@ -40,14 +40,14 @@ public:
         Type type;
     };
 
-    // Takes the list's bytes, which must outlive this. On failure isRead() is false.
+    // Takes the list's bytes, at most 4 GiB, which must outlive this. On failure isRead() is false.
     explicit PropertyListBinaryObjects(ByteView bytes);
 
     [[nodiscard]] bool isRead() const { return _error.empty(); }
     [[nodiscard]] const std::string& error() const { return _error; }
 
     [[nodiscard]] std::size_t count() const { return _objects.size(); }
-    [[nodiscard]] const Object& operator[](std::size_t index) const { return _objects[index]; }
+    [[nodiscard]] Object operator[](std::size_t index) const;
     [[nodiscard]] std::size_t rootIndex() const { return _root; }
     // The bytes of an object's content, where its count is in bytes.
     [[nodiscard]] ByteView content(const Object& object) const
@@ -72,6 +72,15 @@ private:
     bool readCount(Object& object);
     bool bound(Object object, std::size_t unitBytes);
     bool refuseOverlaps();
+    [[nodiscard]] std::size_t endOf(std::size_t index) const;
+
+    // An object as it is kept: a list of a megabyte has up to 260,000 of them.
+    struct Kept {
+        std::uint32_t begin;
+        std::uint32_t count;
+        std::uint8_t contentOffset; // of the content, counted from begin
+        Type type;
+    };
 
     ByteView _bytes;
     std::size_t _offsetBytes = 0; // of one entry of the offset table
@@ -79,8 +88,7 @@ private:
     std::size_t _objectCount = 0;
     std::size_t _root = 0;
     std::size_t _table = 0; // offset of the offset table, the end of the objects
-    std::vector<Object> _objects;
-    std::vector<std::size_t> _ends; // of the objects
+    std::vector<Kept> _objects;
     std::string _error;
 };
 

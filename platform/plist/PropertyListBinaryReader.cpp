@@ -20,12 +20,59 @@ using Type = PropertyListBinaryObjects::Type;
 // 2001-01-01 00:00:00 UTC, from which binary lists count.
 constexpr double kDateOrigin = 978307200;
 
+// What an allocation takes of the heap: a header before it, rounded up.
+constexpr std::size_t heapBytes(std::size_t size)
+{
+    return size == 0 ? 0 : std::max<std::size_t>(32, (size + 8 + 15) / 16 * 16);
+}
+
+// What a text takes beside the value that holds it: nothing where it is short, and room for 30
+// characters at least where it grows beyond that.
+constexpr std::size_t textBytes(std::size_t length)
+{
+    constexpr std::size_t kLengthInPlace = 15;
+    return length <= kLengthInPlace ? 0 : heapBytes(std::max(length, 2 * kLengthInPlace) + 1);
+}
+
+constexpr std::size_t kSharedBytes = 16; // beside an object that is made with its counts
+// A dictionary's entry, and what a large dictionary takes for finding it.
+constexpr std::size_t kEntryBytes = sizeof(std::string) + sizeof(PropertyValue);
+constexpr std::size_t kIndexedEntries = 32;
+constexpr std::size_t kIndexBytes = 96;
+
+// The integer, big-endian with its sign, in decimal.
+std::string decimalDigits(Bytes integer)
+{
+    const bool isNegative = (integer[0] & 0x80) != 0;
+    if (isNegative) {
+        unsigned carry = 1;
+        for (auto byte = integer.rbegin(); byte != integer.rend(); ++byte) {
+            carry += 0xFFU - *byte;
+            *byte = static_cast<std::uint8_t>(carry & 0xFF);
+            carry >>= 8;
+        }
+    }
+    std::string digits;
+    while (std::any_of(integer.begin(), integer.end(), [](auto byte) { return byte != 0; })) {
+        unsigned remainder = 0;
+        for (std::uint8_t& byte : integer) {
+            remainder = remainder << 8 | byte;
+            byte = static_cast<std::uint8_t>(remainder / 10);
+            remainder %= 10;
+        }
+        digits += static_cast<char>('0' + remainder);
+    }
+    if (isNegative)
+        digits += '-';
+    return {digits.rbegin(), digits.rend()};
+}
+
 // Builds values from objects. An absent value means that `_error` says why.
 class TreeBuilder
 {
 public:
     explicit TreeBuilder(ByteView bytes)
-        : _objects(bytes), _budget(kBinaryCostLimit + kBinaryCostLimitPerByte * bytes.size())
+        : _objects(bytes), _budget(kBinaryMemoryLimit + kBinaryMemoryLimitPerByte * bytes.size())
     {
     }
     PropertyListResult read();
@@ -34,6 +81,7 @@ private:
     PropertyValue value(std::size_t index);
     PropertyValue contentOf(const Object& object);
     PropertyValue integer(const Object& object);
+    PropertyValue largeInteger(const Object& object);
     PropertyValue real(const Object& object);
     PropertyValue string(const Object& object);
     PropertyValue array(const Object& object);
@@ -41,7 +89,8 @@ private:
     enum class Use { Element, Key };
     // The value of the object that the container's n-th reference names.
     PropertyValue referenced(const Object& container, std::size_t n, Use use = Use::Element);
-    bool spend(std::size_t cost, const Object& on);
+    // Whether the memory is within the limit. Asked before it is taken.
+    bool spend(std::size_t bytes, const Object& on);
     PropertyValue fail(std::string what, std::size_t at);
 
     PropertyListBinaryObjects _objects;
@@ -66,30 +115,28 @@ PropertyValue TreeBuilder::fail(std::string what, std::size_t at)
     return {};
 }
 
-bool TreeBuilder::spend(std::size_t cost, const Object& on)
+bool TreeBuilder::spend(std::size_t bytes, const Object& on)
 {
-    if (cost > _budget) {
+    if (bytes > _budget) {
         fail("too many values for the length of the list, with the object", on.begin);
         return false;
     }
-    _budget -= cost;
+    _budget -= bytes;
     return true;
 }
 
 PropertyValue TreeBuilder::value(std::size_t index)
 {
-    const Object& object = _objects[index];
+    const Object object = _objects[index];
     if (_isOpen[index])
         return fail("reference cycle through the object", object.begin);
     const bool isContainer = object.type == Type::Array || object.type == Type::Dictionary;
     if (!isContainer)
-        return spend(kBinaryValueCost + object.count, object) ? contentOf(object) : PropertyValue();
+        return contentOf(object);
 
     if (_depth == kPropertyListDepthLimit)
         return fail("nested deeper than " + std::to_string(kPropertyListDepthLimit) + " levels",
                     object.begin);
-    if (!spend(kBinaryValueCost + kBinaryContainerCost, object))
-        return {};
     _isOpen[index] = true;
     ++_depth;
     PropertyValue container = contentOf(object);
@@ -113,6 +160,8 @@ PropertyValue TreeBuilder::contentOf(const Object& object)
         return PropertyValue::date({seconds + kDateOrigin});
     }
     case Type::Data: {
+        if (!spend(heapBytes(kSharedBytes + sizeof(Bytes)) + heapBytes(object.count), object))
+            return {};
         const ByteView content = _objects.content(object);
         return PropertyValue::data(Bytes(content.begin(), content.end()));
     }
@@ -136,9 +185,18 @@ PropertyValue TreeBuilder::integer(const Object& object)
         content = content.last(8);
         const std::uint8_t sign = (content[0] & 0x80) != 0 ? 0xFF : 0;
         if (!std::all_of(high.begin(), high.end(), [sign](auto byte) { return byte == sign; }))
-            return fail("number out of range", object.begin);
+            return largeInteger(object);
     }
     return PropertyValue::integer(static_cast<std::int64_t>(bigEndian(content)));
+}
+
+PropertyValue TreeBuilder::largeInteger(const Object& object)
+{
+    const ByteView content = _objects.content(object);
+    PropertyLargeNumber number{decimalDigits(Bytes(content.begin(), content.end())), false};
+    if (!spend(heapBytes(kSharedBytes + sizeof number) + textBytes(number.digits.size()), object))
+        return {};
+    return PropertyValue::largeNumber(std::move(number));
 }
 
 PropertyValue TreeBuilder::real(const Object& object)
@@ -153,6 +211,11 @@ PropertyValue TreeBuilder::real(const Object& object)
 PropertyValue TreeBuilder::string(const Object& object)
 {
     const ByteView content = _objects.content(object);
+    // Two bytes of UTF-16 are at most three of UTF-8.
+    const std::size_t length =
+        object.type == Type::AsciiString ? content.size() : content.size() / 2 * 3;
+    if (!spend(textBytes(length), object))
+        return {};
     if (object.type == Type::AsciiString) {
         const auto isAscii = [](std::uint8_t byte) { return byte < 0x80; };
         const auto wrong = std::find_if_not(content.begin(), content.end(), isAscii);
@@ -161,15 +224,17 @@ PropertyValue TreeBuilder::string(const Object& object)
                         object.content + static_cast<std::size_t>(wrong - content.begin()));
         return PropertyValue(std::string(content.begin(), content.end()));
     }
-    Utf16Conversion conversion = utf8FromUtf16(content, std::endian::big);
-    if (!conversion.text)
-        return fail("malformed UTF-16", object.content + conversion.faultOffset);
-    return PropertyValue(std::move(*conversion.text));
+    return PropertyValue(utf8FromUtf16(content, std::endian::big));
 }
 
 PropertyValue TreeBuilder::array(const Object& object)
 {
+    if (!spend(heapBytes(kSharedBytes + sizeof(PropertyArray)) +
+                   heapBytes(object.count * sizeof(PropertyValue)),
+               object))
+        return {};
     PropertyValue array = PropertyValue::newArray();
+    array.asArray()->reserve(object.count);
     for (std::size_t n = 0; n < object.count; ++n) {
         PropertyValue element = referenced(object, n);
         if (!element)
@@ -181,11 +246,19 @@ PropertyValue TreeBuilder::array(const Object& object)
 
 PropertyValue TreeBuilder::dictionary(const Object& object)
 {
+    const bool isIndexed = object.count >= kIndexedEntries;
+    if (!spend(heapBytes(kSharedBytes + sizeof(PropertyDictionary)) +
+                   heapBytes(object.count * kEntryBytes) +
+                   (isIndexed ? object.count * kIndexBytes : 0),
+               object))
+        return {};
     PropertyValue dictionary = PropertyValue::newDictionary();
+    dictionary.asDictionary()->reserve(object.count);
     for (std::size_t n = 0; n < object.count; ++n) {
         const PropertyValue key = referenced(object, n, Use::Key);
         PropertyValue element = key ? referenced(object, object.count + n) : PropertyValue();
-        if (!element)
+        // A large dictionary keeps its keys twice.
+        if (!element || (isIndexed && !spend(textBytes(key.asString()->size()), object)))
             return {};
         dictionary.asDictionary()->set(*key.asString(), std::move(element));
     }

@@ -9,36 +9,50 @@ namespace
 {
 
 constexpr std::size_t kExcerptBytes = 40;
+constexpr std::uint32_t kReplacement = 0xFFFD;
 
-} // namespace
+constexpr bool isFirstSurrogate(std::uint32_t unit) { return unit >= 0xD800 && unit <= 0xDBFF; }
+constexpr bool isSecondSurrogate(std::uint32_t unit) { return unit >= 0xDC00 && unit <= 0xDFFF; }
 
-Utf16Conversion utf8FromUtf16(ByteView bytes, std::endian order)
+std::size_t utf8Length(std::uint32_t character)
+{
+    return character < 0x80 ? 1 : character < 0x800 ? 2 : character < 0x10000 ? 3 : 4;
+}
+
+// Calls `take` with each character, U+FFFD for what is malformed.
+template <typename Take>
+void eachCharacter(ByteView bytes, std::endian order, Take take)
 {
     const std::size_t high = order == std::endian::big ? 0 : 1;
     const auto unitAt = [bytes, high](std::size_t at) {
         return static_cast<std::uint32_t>(bytes[at + high] << 8 | bytes[at + 1 - high]);
     };
-    std::string text;
-    text.reserve(bytes.size() / 2);
     std::size_t at = 0;
-    for (; bytes.size() - at >= 2; at += 2) {
-        std::uint32_t character = unitAt(at);
-        if (character >= 0xDC00 && character <= 0xDFFF)
-            return {std::nullopt, at};
-        if (character >= 0xD800 && character <= 0xDBFF) {
-            if (bytes.size() - at < 4)
-                return {std::nullopt, at};
-            const std::uint32_t partner = unitAt(at + 2);
-            if (partner < 0xDC00 || partner > 0xDFFF)
-                return {std::nullopt, at};
-            character = 0x10000 + ((character - 0xD800) << 10) + (partner - 0xDC00);
+    while (bytes.size() - at >= 2) {
+        const std::uint32_t unit = unitAt(at);
+        at += 2;
+        if (isFirstSurrogate(unit) && bytes.size() - at >= 2 && isSecondSurrogate(unitAt(at))) {
+            take(0x10000 + ((unit - 0xD800) << 10) + (unitAt(at) - 0xDC00));
             at += 2;
+        } else {
+            take(isFirstSurrogate(unit) || isSecondSurrogate(unit) ? kReplacement : unit);
         }
-        appendUtf8(text, character);
     }
     if (at != bytes.size())
-        return {std::nullopt, at};
-    return {std::move(text), 0};
+        take(kReplacement);
+}
+
+} // namespace
+
+std::string utf8FromUtf16(ByteView bytes, std::endian order)
+{
+    std::size_t length = 0;
+    eachCharacter(bytes, order,
+                  [&length](std::uint32_t character) { length += utf8Length(character); });
+    std::string text;
+    text.reserve(length);
+    eachCharacter(bytes, order, [&text](std::uint32_t character) { appendUtf8(text, character); });
+    return text;
 }
 
 std::string quotedExcerpt(std::string_view text)

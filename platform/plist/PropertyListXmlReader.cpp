@@ -205,11 +205,9 @@ PropertyListResult readXmlPropertyList(ByteView bytes)
         const auto* const text = reinterpret_cast<const char*>(bytes.data());
         return XmlRun(std::string_view(text, bytes.size()), nullptr).read();
     }
-    // Converted here because Expat lets surrogates without their partner pass.
-    const Utf16Conversion conversion = utf8FromUtf16(bytes, *order);
-    if (!conversion.text)
-        return {{}, "malformed UTF-16 at byte " + std::to_string(conversion.faultOffset)};
-    return XmlRun(*conversion.text, "UTF-8").read();
+    // Converted here because Expat passes on surrogates without their partner.
+    const std::string text = utf8FromUtf16(bytes, *order);
+    return XmlRun(text, "UTF-8").read();
 }
 
 } // namespace orvane

@@ -27,12 +27,6 @@ PropertyValue refused(std::string_view text, const char* what, std::string& erro
     return {};
 }
 
-PropertyValue outOfRange(std::string& error)
-{
-    error = "number out of range";
-    return {};
-}
-
 bool isLeapYear(int year) { return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0); }
 
 int daysOfMonth(int year, int month)
@@ -86,7 +80,7 @@ PropertyValue integerFromXml(std::string_view text, std::string& error)
         return refused(text, "integer", error);
     const std::uint64_t highest = INT64_MAX;
     if (fault != std::errc() || magnitude > (isNegative ? highest + 1 : highest))
-        return outOfRange(error);
+        return PropertyValue::largeNumber({std::string(trimmed(text)), false});
     return PropertyValue::integer(
         static_cast<std::int64_t>(isNegative ? 0 - magnitude : magnitude));
 }
@@ -103,7 +97,7 @@ PropertyValue realFromXml(std::string_view text, std::string& error)
     if (stopped != end || fault == std::errc::invalid_argument || rest.ends_with(')'))
         return refused(text, "real number", error);
     if (fault != std::errc())
-        return outOfRange(error);
+        return PropertyValue::largeNumber({std::string(trimmed(text)), true});
     return PropertyValue::real(number);
 }
 

@@ -12,9 +12,11 @@ namespace orvane
 // line ends around it do not count. On bad text each yields an absent value and says in `error`
 // what is wrong with it.
 
-// Decimal or, after "0x", hexadecimal, with or without a sign, within 64 signed bits.
+// Decimal or, after "0x", hexadecimal, with or without a sign. One outside 64 signed bits becomes a
+// large number.
 PropertyValue integerFromXml(std::string_view text, std::string& error);
-// Decimal with or without an exponent, "nan", "inf" or "infinity". Not dependent on the locale.
+// Decimal with or without an exponent, "nan", "inf" or "infinity". Not dependent on the locale. One
+// that is too large, or too near to zero, for a double becomes a large number.
 PropertyValue realFromXml(std::string_view text, std::string& error);
 // "2026-11-21T10:00:00Z", the years 1 to 9999.
 PropertyValue dateFromXml(std::string_view text, std::string& error);

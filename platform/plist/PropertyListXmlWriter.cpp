@@ -75,6 +75,7 @@ private:
     bool writeArray(const PropertyArray& array);
     bool writeText(const char* element, std::string_view text);
     bool writeReal(double number);
+    bool writeLargeNumber(const PropertyLargeNumber& number);
     bool writeData(const Bytes& bytes);
     bool writeDate(PropertyDate date);
     bool writeLine(std::string_view line);
@@ -99,6 +100,8 @@ bool XmlWriter::write(const PropertyValue& value)
         return writeLine("<integer>" + std::to_string(*value.asInteger()) + "</integer>");
     case PropertyValue::Type::Real:
         return writeReal(*value.asReal());
+    case PropertyValue::Type::LargeNumber:
+        return writeLargeNumber(*value.asLargeNumber());
     case PropertyValue::Type::Boolean:
         return writeLine(*value.asBoolean() ? "<true/>" : "<false/>");
     case PropertyValue::Type::Data:
@@ -185,6 +188,11 @@ bool XmlWriter::writeReal(double number)
     char digits[40];
     const auto [end, fault] = std::to_chars(digits, digits + sizeof digits, number);
     return fault == std::errc() && writeLine("<real>" + std::string(digits, end) + "</real>");
+}
+
+bool XmlWriter::writeLargeNumber(const PropertyLargeNumber& number)
+{
+    return writeText(number.isReal ? "real" : "integer", number.digits);
 }
 
 bool XmlWriter::writeData(const Bytes& bytes)

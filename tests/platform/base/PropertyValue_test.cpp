@@ -16,9 +16,15 @@ using Type = PropertyValue::Type;
 std::vector<PropertyValue> oneOfEachType()
 {
     return {
-        PropertyValue::newDictionary(), PropertyValue::newArray(), PropertyValue("text"),
-        PropertyValue::integer(7),      PropertyValue::real(7),    PropertyValue::boolean(true),
-        PropertyValue::data({7}),       PropertyValue::date({7}),
+        PropertyValue::newDictionary(),
+        PropertyValue::newArray(),
+        PropertyValue("text"),
+        PropertyValue::integer(7),
+        PropertyValue::real(7),
+        PropertyValue::boolean(true),
+        PropertyValue::data({7}),
+        PropertyValue::date({7}),
+        PropertyValue::largeNumber({"7"}),
     };
 }
 
@@ -38,6 +44,7 @@ TEST(PropertyValueTest, AbsentValueYieldsNothing)
     EXPECT_EQ(absent.asReal(), std::nullopt);
     EXPECT_EQ(absent.asBoolean(), std::nullopt);
     EXPECT_EQ(absent.asDate(), std::nullopt);
+    EXPECT_EQ(absent.asLargeNumber(), nullptr);
     EXPECT_TRUE(absent["key"]["of"]["nothing"].isAbsent());
     EXPECT_TRUE(absent.deepCopy().isAbsent());
     EXPECT_EQ(absent.description(), "(null)");
@@ -66,6 +73,7 @@ TEST(PropertyValueTest, EachValueAnswersForItsOwnTypeOnly)
         EXPECT_EQ(value.asBoolean().has_value(), value.type() == Type::Boolean) << name;
         EXPECT_EQ(value.asData() != nullptr, value.type() == Type::Data) << name;
         EXPECT_EQ(value.asDate().has_value(), value.type() == Type::Date) << name;
+        EXPECT_EQ(value.asLargeNumber() != nullptr, value.type() == Type::LargeNumber) << name;
         EXPECT_TRUE(value["key"].isAbsent()) << name;
     }
 }
@@ -201,18 +209,19 @@ TEST(PropertyValueTest, DescriptionIsOneLineInTheOrderOfStorage)
         {"list",  PropertyValue::arrayOf({"x", PropertyValue::newArray()})},
         {"none",  PropertyValue::newDictionary()                          },
     });
+    EXPECT_EQ(PropertyValue::largeNumber({"-1e400", true}).description(), "-1e400");
     EXPECT_EQ(value.description(),
               "{name = a text; count = -3; half = 0.5; on = true; off = false; bytes = <009fff>; "
               "when = 2026-11-21 10:00:00 +0000; list = (x, ()); none = {}}");
 }
 
-TEST(PropertyValueTest, TypeNamesSayNumberForBothKindsOfNumber)
+TEST(PropertyValueTest, TypeNamesSayNumberForEveryKindOfNumber)
 {
     std::vector<std::string> names;
     for (const PropertyValue& value : oneOfEachType())
         names.emplace_back(value.typeName());
     EXPECT_EQ(names, (std::vector<std::string>{"dictionary", "array", "string", "number", "number",
-                                               "boolean", "data", "date"}));
+                                               "boolean", "data", "date", "number"}));
 }
 
 TEST(PropertyValueTest, AbsentValuesCannotBeStored)

@@ -28,36 +28,35 @@ TEST(PropertyListTextTest, Utf16BecomesUtf8InBothByteOrders)
              Case{{0xD8, 0x3D, 0xDC, 0xE1}, "\xF0\x9F\x93\xA1"        },
              Case{{0xDB, 0xFF, 0xDF, 0xFF}, "\xF4\x8F\xBF\xBF"        },
     }) {
-        EXPECT_EQ(utf8FromUtf16(bytes, std::endian::big).text, text);
+        EXPECT_EQ(utf8FromUtf16(bytes, std::endian::big), text);
         Bytes swapped = bytes;
         for (std::size_t i = 0; i < swapped.size(); i += 2)
             std::swap(swapped[i], swapped[i + 1]);
-        EXPECT_EQ(utf8FromUtf16(swapped, std::endian::little).text, text);
+        EXPECT_EQ(utf8FromUtf16(swapped, std::endian::little), text);
     }
 }
 
-TEST(PropertyListTextTest, MalformedUtf16IsRefusedAtItsFirstWrongUnit)
+TEST(PropertyListTextTest, MalformedUtf16BecomesReplacementCharacters)
 {
     struct Case {
         const char* name;
         Bytes bytes;
-        std::size_t fault;
+        const char* text;
     };
-    for (const auto& [name, bytes, fault] : {
-             Case{"half a unit",               {0},                                 0},
-             Case{"half a unit at the end",    {0, 'a', 0},                         2},
-             Case{"first surrogate at end",    {0, 'a', 0xD8, 0},                   2},
-             Case{"first surrogate cut",       {0, 'a', 0xD8, 0, 0xDC},             2},
-             Case{"first surrogate, letter",   {0xDB, 0xFF, 0, 'a'},                0},
-             Case{"first surrogate twice",     {0xD8, 0, 0xD8, 0, 0xDC, 0},         0},
-             Case{"second surrogate alone",    {0, 'a', 0, 'b', 0xDC, 0},           4},
-             Case{"second surrogate, highest", {0xDF, 0xFF},                        0},
-             Case{"pair, second surrogate",    {0xD8, 0, 0xDC, 0, 0xDC, 0, 0, 'a'}, 4},
-    }) {
-        const Utf16Conversion conversion = utf8FromUtf16(bytes, std::endian::big);
-        EXPECT_FALSE(conversion.text) << name;
-        EXPECT_EQ(conversion.faultOffset, fault) << name;
-    }
+    for (const auto& [name, bytes, text] : {
+             Case{"half a unit",               {0},                         "\uFFFD"          },
+             Case{"half a unit at the end",    {0, 'a', 0},                 "a\uFFFD"         },
+             Case{"first surrogate at end",    {0, 'a', 0xD8, 0},           "a\uFFFD"         },
+             Case{"first surrogate cut",       {0, 'a', 0xD8, 0, 0xDC},     "a\uFFFD\uFFFD"   },
+             Case{"first surrogate, letter",   {0xDB, 0xFF, 0, 'a'},        "\uFFFDa"         },
+             Case{"first surrogate twice",     {0xD8, 0, 0xD8, 0, 0xDC, 0}, "\uFFFD\U00010000"},
+             Case{"second surrogate alone",    {0, 'a', 0, 'b', 0xDC, 0},   "ab\uFFFD"        },
+             Case{"second surrogate, highest", {0xDF, 0xFF},                "\uFFFD"          },
+             Case{"pair, second surrogate",
+                  {0xD8, 0, 0xDC, 0, 0xDC, 0, 0, 'a'},
+                  "\U00010000\uFFFDa"                                                         },
+    })
+        EXPECT_EQ(utf8FromUtf16(bytes, std::endian::big), text) << name;
 }
 
 TEST(PropertyListTextTest, ExcerptsStayOnOneLineAndAreCutBetweenCharacters)
