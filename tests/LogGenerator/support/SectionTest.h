@@ -27,6 +27,16 @@ inline Rows rowsOf(const PropertyValue& value)
     return rows;
 }
 
+// The integers of a list; -1 for any other element.
+inline std::vector<std::int64_t> integersOf(const PropertyValue& list)
+{
+    std::vector<std::int64_t> numbers;
+    if (const PropertyArray* array = list.asArray())
+        for (const PropertyValue& number : *array)
+            numbers.push_back(number.asInteger().value_or(-1));
+    return numbers;
+}
+
 // The rows of each element of a list.
 inline std::vector<Rows> recordsOf(const PropertyValue& list)
 {

@@ -13,6 +13,7 @@
 #include <filesystem>
 #include <iterator>
 #include <memory>
+#include <regex>
 
 namespace orvane
 {
@@ -54,6 +55,12 @@ protected:
                                                int lines = 24, int columns = 80)
     {
         return start({"--demo", "--log", "none"}, more, lines, columns);
+    }
+    // Whether the place shown becomes that of the last row, as in "11/11".
+    static bool waitForLastRow(VirtualTerminal& terminal)
+    {
+        static const std::regex kLastRow(" ([0-9]+)/\\1\\b");
+        return terminal.waitUntil([&] { return std::regex_search(terminal.screen(), kLastRow); });
     }
     // An interactive shell, which can stop and continue the program.
     std::unique_ptr<VirtualTerminal> startShell()
@@ -213,24 +220,24 @@ TEST_F(TerminalProgramTest, AnEndlessAnswerDoesNotKeepTheKeysForEver)
 TEST_F(TerminalProgramTest, TheCodesOfOtherTerminalsForTheSameKeysWorkToo)
 {
     const auto terminal = startDemo({}, 10);
-    ASSERT_TRUE(terminal->waitFor("1/11"));
+    ASSERT_TRUE(terminal->waitFor(" 1/"));
     for (const std::string end : {"[4~", "[F", "[8~", "OF"})
         for (const std::string home : {"[1~", "[H", "[7~", "OH"}) {
             terminal->send(kEscape + end);
-            ASSERT_TRUE(terminal->waitFor("11/11")) << end;
+            ASSERT_TRUE(waitForLastRow(*terminal)) << end;
             terminal->send(kEscape + home);
-            ASSERT_TRUE(terminal->waitFor(" 1/11")) << home;
+            ASSERT_TRUE(terminal->waitFor(" 1/")) << home;
         }
     for (const std::string kind : {"[", "O"}) {
         terminal->send(kEscape + kind + "B");
-        ASSERT_TRUE(terminal->waitFor(" 2/11")) << kind;
+        ASSERT_TRUE(terminal->waitFor(" 2/")) << kind;
         terminal->send(kEscape + kind + "A");
-        ASSERT_TRUE(terminal->waitFor(" 1/11")) << kind;
+        ASSERT_TRUE(terminal->waitFor(" 1/")) << kind;
     }
     terminal->send(std::string(kEscape) + "[6~");
-    ASSERT_TRUE(terminal->waitFor(" 7/11")) << terminal->screen();
+    ASSERT_TRUE(terminal->waitFor(" 7/")) << terminal->screen();
     terminal->send(std::string(kEscape) + "[5~");
-    ASSERT_TRUE(terminal->waitFor(" 1/11"));
+    ASSERT_TRUE(terminal->waitFor(" 1/"));
 }
 
 TEST_F(TerminalProgramTest, APasteWhoseEndIsLostEndsWithAPause)
@@ -396,9 +403,9 @@ TEST_F(TerminalProgramTest, WithoutUtf8OnlyAsciiIsSent)
 TEST_F(TerminalProgramTest, TheMouseOpensAndScrolls)
 {
     const auto terminal = startDemo({}, 10, 80);
-    ASSERT_TRUE(terminal->waitFor("1/11"));
+    ASSERT_TRUE(terminal->waitFor(" 1/"));
     terminal->send("\x1b[<65;5;5M");
-    ASSERT_TRUE(terminal->waitFor("4/11"));
+    ASSERT_TRUE(terminal->waitFor(" 4/"));
     terminal->send("\x1b[<64;5;5M\x1b[<0;5;2M\x1b[<0;5;2m");
     EXPECT_TRUE(terminal->waitFor("Tracking Area Code")) << terminal->screen();
 }
