@@ -115,6 +115,20 @@ void LogChannel::drained()
     _source->resume();
 }
 
+void LogChannel::checkClient()
+{
+    if (_hasEnded)
+        return;
+    if (!_hasStarted && ++_checksBeforeStart > kClientChecks) {
+        logWarning("%s: its client does not start it; closing the channel", _name.c_str());
+        end();
+    } else if ((_fromClient && _fromClientWatch.check(*_fromClient)) ||
+               _toClientWatch.check(*_toClient)) {
+        logWarning("%s: its client does not finish a frame; closing the channel", _name.c_str());
+        end();
+    }
+}
+
 void LogChannel::end()
 {
     if (std::exchange(_hasEnded, true))

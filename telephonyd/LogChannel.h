@@ -3,6 +3,7 @@
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/ports/FrameConnection.h"
+#include "telephonyd/HalfFrameWatch.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <functional>
@@ -39,6 +40,10 @@ public:
 
     [[nodiscard]] const std::string& name() const { return _name; }
 
+    // To be called once a kClientCheckInterval: ends the channel whose client has not started it,
+    // or has left a frame unfinished, for kClientTimeout.
+    void checkClient();
+
 private:
     void accept(std::unique_ptr<FrameConnection> connection);
     void take(const FrameReader::View& frame);
@@ -54,6 +59,9 @@ private:
     std::unique_ptr<FrameConnection> _fromClient;
     std::unique_ptr<FrameConnection> _toClient;
     Events _events;
+    HalfFrameWatch _fromClientWatch;
+    HalfFrameWatch _toClientWatch;
+    int _checksBeforeStart = 0;
     bool _hasStarted = false;
     bool _hasSent = false;
     bool _isBehind = false;

@@ -54,16 +54,34 @@ void LogServer::stop()
     _listener.reset();
     _channels.clear();
     _clients.clear();
+    _clientCheck.reset();
 }
 
 void LogServer::accept(std::unique_ptr<FrameConnection> connection)
 {
     const ClientId client = ++_lastClient;
-    FrameConnection& accepted = *(_clients[client] = std::move(connection));
+    FrameConnection& accepted = *(_clients[client].connection = std::move(connection));
     accepted.setFrameCallback(
         [this, client](const FrameReader::View& frame) { take(client, frame); });
     // By value: the callback goes with its connection, and what it captured.
     accepted.setClosedCallback([this, client] { _clients.erase(ClientId(client)); });
+    if (!_clientCheck)
+        _clientCheck = _queue.repeatingTimer(kClientCheckInterval, [this] { checkClients(); });
+}
+
+void LogServer::checkClients()
+{
+    for (auto client = _clients.begin(); client != _clients.end();) {
+        const auto checked = client++;
+        if (!checked->second.watch.check(*checked->second.connection))
+            continue;
+        logWarning("A client does not finish a frame; closing its connection");
+        _clients.erase(checked);
+    }
+    for (const auto& [number, channel] : _channels)
+        channel->checkClient();
+    if (_clients.empty() && _channels.empty())
+        _clientCheck.reset(); // nobody to wait for
 }
 
 void LogServer::take(ClientId client, const FrameReader::View& frame)
@@ -76,7 +94,7 @@ void LogServer::take(ClientId client, const FrameReader::View& frame)
         reply = replyToRequest(client, frame.data);
     const auto found = _clients.find(client);
     if (found != _clients.end() &&
-        !answerRequest(*found->second, frame.messageId, frame.serial, reply))
+        !answerRequest(*found->second.connection, frame.messageId, frame.serial, reply))
         _clients.erase(found);
 }
 
@@ -184,9 +202,9 @@ void LogServer::notify(ClientId client, const char* name)
     const auto found = _clients.find(client);
     if (found == _clients.end())
         return;
-    found->second->send(kNotificationMessage, 0, false, false,
-                        xmlBytes(PropertyValue::dictionaryOf({
-                            {kNotificationNameKey, name}
+    found->second.connection->send(kNotificationMessage, 0, false, false,
+                                   xmlBytes(PropertyValue::dictionaryOf({
+                                       {kNotificationNameKey, name}
     })));
 }
 

@@ -4,6 +4,7 @@
 #include "platform/ports/FrameConnection.h"
 #include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
+#include "telephonyd/HalfFrameWatch.h"
 #include "telephonyd/phone/LogSource.h"
 
 #include <cstdint>
@@ -56,7 +57,13 @@ private:
     using ClientId = std::uint64_t;
     using ChannelNumber = std::uint64_t;
 
+    struct Client {
+        std::unique_ptr<FrameConnection> connection;
+        HalfFrameWatch watch;
+    };
+
     void accept(std::unique_ptr<FrameConnection> connection);
+    void checkClients();
     void take(ClientId client, const FrameReader::View& frame);
     Bytes replyToRequest(ClientId client, ByteView request);
     // 0 or an error.
@@ -70,7 +77,8 @@ private:
     MainQueue& _queue;
     LogSourceFactory _makeSource;
     std::unique_ptr<FrameListener> _listener;
-    std::map<ClientId, std::unique_ptr<FrameConnection>> _clients;
+    std::map<ClientId, Client> _clients;
+    std::unique_ptr<Timer> _clientCheck; // while there are clients or channels
     std::map<ChannelNumber, std::unique_ptr<LogChannel>> _channels;
     ClientId _lastClient = 0;
     ChannelNumber _lastChannel = 0;

@@ -10,6 +10,7 @@
 #include <chrono>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <vector>
 
 namespace orvane
@@ -34,6 +35,10 @@ public:
               ByteView data);
     bool withdrawLast() { return _out.withdrawLast(); }
     [[nodiscard]] std::size_t queuedBytes() const { return _out.size(); }
+    [[nodiscard]] std::optional<std::uint64_t> unfinishedFrame() const
+    {
+        return isOpen() ? _in.unfinishedFrame() : std::nullopt;
+    }
     bool waitUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout);
     void close();
     // close(), after which the connection must not be called any more.

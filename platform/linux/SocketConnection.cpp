@@ -41,6 +41,11 @@ bool SocketConnection::withdrawLast() { return _stream->withdrawLast(); }
 
 std::size_t SocketConnection::queuedBytes() const { return _stream->queuedBytes(); }
 
+std::optional<std::uint64_t> SocketConnection::unfinishedFrame() const
+{
+    return _stream->unfinishedFrame();
+}
+
 bool SocketConnection::waitUntil(const std::function<bool()>& done,
                                  std::chrono::milliseconds timeout)
 {

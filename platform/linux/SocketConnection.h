@@ -30,6 +30,7 @@ public:
               ByteView data) override;
     bool withdrawLast() override;
     [[nodiscard]] std::size_t queuedBytes() const override;
+    [[nodiscard]] std::optional<std::uint64_t> unfinishedFrame() const override;
     bool waitUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout) override;
     // Writes what the peer takes at once of what is queued, and drops the rest.
     void close() override;

@@ -81,6 +81,7 @@ std::optional<FrameReader::View> FrameReader::next()
     if (rest.size() < kFrameHeaderBytes || rest.size() - kFrameHeaderBytes < length)
         return std::nullopt;
     _start += kFrameHeaderBytes + length;
+    ++_framesRead;
     const std::uint32_t flags = read32(rest, 12);
     return View{static_cast<std::int32_t>(read32(rest, 4)), read32(rest, 8),
                 (flags & kWantsReply) != 0, (flags & kIsReply) != 0,

@@ -46,6 +46,12 @@ public:
         ByteView data;
     };
     std::optional<View> next();
+    // Once next() has returned nullopt: the number of the frame of which a part has come, the
+    // stream's first frame being 0; nullopt where none is unfinished.
+    [[nodiscard]] std::optional<std::uint64_t> unfinishedFrame() const
+    {
+        return _start < _buffer.size() ? std::optional(_framesRead) : std::nullopt;
+    }
     // Whether a frame announced more than kFrameDataLimit bytes: the connection must end.
     [[nodiscard]] bool hasFailed() const { return _failed; }
     // The announced length that made it fail.
@@ -58,6 +64,7 @@ private:
 
     Bytes _buffer;
     std::size_t _start = 0; // of the next frame in _buffer
+    std::uint64_t _framesRead = 0;
     bool _failed = false;
     std::uint32_t _failedLength = 0;
 };

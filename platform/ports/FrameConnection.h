@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace orvane
@@ -36,6 +37,9 @@ public:
     // have been, or where the transport cannot: the frame then stays queued.
     virtual bool withdrawLast() { return false; }
     [[nodiscard]] virtual std::size_t queuedBytes() const = 0;
+    // The number of the frame that has arrived in part, the connection's first being 0; nullopt
+    // where none has.
+    [[nodiscard]] virtual std::optional<std::uint64_t> unfinishedFrame() const = 0;
     // For the few calls that must wait: serves this connection alone (sending what is queued,
     // calling its frame callback) until `done` is true, the timeout is over or the connection has
     // closed. Returns what `done` then says. Other connections, timers and tasks wait meanwhile;

@@ -24,6 +24,10 @@ public:
     void setDrainedCallback(std::function<void()> callback);
     [[nodiscard]] bool isOpen() const { return _open; }
     [[nodiscard]] std::size_t queuedBytes() const { return _unsent.size(); }
+    [[nodiscard]] std::optional<std::uint64_t> unfinishedFrame() const
+    {
+        return _reader.unfinishedFrame();
+    }
     void send(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
               ByteView data);
     bool withdrawLast();
@@ -88,6 +92,10 @@ public:
               ByteView data) override;
     bool withdrawLast() override { return _end->withdrawLast(); }
     [[nodiscard]] std::size_t queuedBytes() const override { return _end->queuedBytes(); }
+    [[nodiscard]] std::optional<std::uint64_t> unfinishedFrame() const override
+    {
+        return _end->unfinishedFrame();
+    }
     bool waitUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout) override;
     void close() override { _end->close(); }
 

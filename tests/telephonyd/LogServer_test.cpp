@@ -439,5 +439,85 @@ TEST_F(LogServerTest, WhatWasPutOffIsDroppedWithTheServer)
     EXPECT_THAT(client->notifications(), IsEmpty());
 }
 
+TEST_F(LogServerTest, AChannelThatIsNotStartedIsClosedAfterThirtySeconds)
+{
+    const auto streaming = streamingClient("streaming");
+    std::vector<std::unique_ptr<TelephonyClient>> idle;
+    while (server.channelCount() < LogServer::kMostChannels)
+        idle.push_back(connectedClient("idle" + std::to_string(idle.size())));
+    queue.advance(29s);
+    EXPECT_EQ(server.channelCount(), LogServer::kMostChannels);
+    const auto refused = connectedClient("refused");
+    EXPECT_EQ(refused->answer()["Error"].asInteger(), LogServer::kNoChannel);
+
+    queue.advance(7s);
+    EXPECT_EQ(server.channelCount(), 1U) << "the one that was started";
+    EXPECT_FALSE(idle.front()->channel->isOpen());
+    sources.front()->send(Bytes{1, 2});
+    queue.runPending();
+    EXPECT_EQ(streaming->messages.size(), 1U);
+    const auto served = connectedClient("served");
+    EXPECT_EQ(served->answer()["Error"].asInteger(), 0);
+}
+
+TEST_F(LogServerTest, AConnectionWithHalfAFrameIsClosedAfterThirtySeconds)
+{
+    Bytes half;
+    appendFrame(half, 1, 1, true, false, Bytes(1000));
+    half.resize(500);
+    const auto idle = streamingClient("idle");
+    std::string error;
+    std::vector<TelephonyClient::Frame> frames;
+    const auto unfinished = idle->connect(kTelephonyServerPort, frames);
+    queue.runPending();
+    transport.injectToPort(kTelephonyServerPort, half);
+    transport.injectToPort("TelephonyServer.Channel.1", half);
+    queue.advance(29s);
+    EXPECT_EQ(server.clientCount(), 2U);
+    EXPECT_EQ(server.channelCount(), 1U);
+    queue.advance(7s);
+    EXPECT_EQ(server.clientCount(), 0U);
+    EXPECT_EQ(server.channelCount(), 0U);
+    EXPECT_FALSE(unfinished->isOpen());
+    EXPECT_EQ(services.log.count("A client does not finish a frame; closing its connection"), 2U);
+}
+
+TEST_F(LogServerTest, APortThatAnswersWithHalfAFrameEndsItsChannel)
+{
+    const auto client = streamingClient("client");
+    transport.injectFromPort("client", Bytes(15));
+    queue.advance(36s);
+    EXPECT_EQ(server.channelCount(), 0U);
+    EXPECT_EQ(server.clientCount(), 1U);
+}
+
+TEST_F(LogServerTest, FramesThatEachComeInPartsButInTimeAreServed)
+{
+    const auto client = streamingClient("client");
+    Bytes frame;
+    appendFrame(frame, 99, 1, true, false, Bytes(1000));
+    const ByteView start = ByteView(frame).first(400);
+    const ByteView rest = ByteView(frame).subspan(400);
+    transport.injectToPort(kTelephonyServerPort, start);
+    for (int i = 0; i < 10; ++i) {
+        queue.advance(20s);
+        transport.injectToPort(kTelephonyServerPort, rest);
+        transport.injectToPort(kTelephonyServerPort, start);
+    }
+    queue.runPending();
+    EXPECT_EQ(server.clientCount(), 1U);
+    EXPECT_EQ(client->serverFrames.size(), 11U) << "with the answer to the request for the channel";
+}
+
+TEST_F(LogServerTest, WithoutClientsNothingWakesTheServer)
+{
+    {
+        const auto client = streamingClient("client");
+        EXPECT_NE(queue.waitingTasks(), 0U);
+    }
+    queue.advance(10s);
+    EXPECT_EQ(queue.waitingTasks(), 0U);
+}
+
 } // namespace
 } // namespace orvane

@@ -545,5 +545,21 @@ TEST_F(SocketConnectionWaitTest, AFrameStaysValidWhileItsCallbackWaitsForAnother
     EXPECT_EQ(atHere[2], (ReceivedFrame{1, 0, false, false, Bytes(20, 0x33)}));
 }
 
+TEST_F(SocketConnectionTest, AFrameThatHasArrivedInPartIsToldFromTheNext)
+{
+    makeHere();
+    here->setFrameCallback(recordTo(atHere));
+    EXPECT_EQ(here->unfinishedFrame(), std::nullopt);
+    const Bytes frame = frameBytes(1, 100);
+    writePlainly(ByteView(frame).first(50));
+    EXPECT_TRUE(runUntil([&] { return here->unfinishedFrame() == 0U; }));
+    writePlainly(ByteView(frame).subspan(50));
+    writePlainly(ByteView(frame).first(50));
+    EXPECT_TRUE(runUntil([&] { return here->unfinishedFrame() == 1U; }));
+    EXPECT_EQ(atHere.size(), 1U);
+    here->close();
+    EXPECT_EQ(here->unfinishedFrame(), std::nullopt);
+}
+
 } // namespace
 } // namespace orvane

@@ -182,6 +182,22 @@ TEST(FrameReaderTest, LooksOnlyAtTheFlagBitsThatHaveAMeaning)
     }
 }
 
+TEST(FrameReaderTest, TellsWhichFrameHasArrivedInPart)
+{
+    FrameReader reader;
+    EXPECT_EQ(reader.unfinishedFrame(), std::nullopt);
+    const Bytes frame = framed(1, 2, false, false, Bytes(10));
+    for (std::uint64_t number = 0; number < 3; ++number) {
+        reader.append(ByteView(frame).first(1));
+        EXPECT_FALSE(reader.next());
+        EXPECT_EQ(reader.unfinishedFrame(), number);
+        reader.append(ByteView(frame).subspan(1));
+        EXPECT_TRUE(reader.next());
+        EXPECT_FALSE(reader.next());
+        EXPECT_EQ(reader.unfinishedFrame(), std::nullopt);
+    }
+}
+
 // Were the rest of the buffer moved once a frame, this would move most of a terabyte.
 TEST(FrameReaderTest, TakesManySmallFramesOfOneReadInLinearTime)
 {
