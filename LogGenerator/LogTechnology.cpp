@@ -3,7 +3,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "app/OrvaneApp.h"
-#include "screens/print/OutputPane.h"
+#include "app/LiveApp.h"
+#include "screens/print/Printer.h"
 
 #include <functional>
 #include <string_view>
@@ -14,7 +14,7 @@ class CommandInterpreter
 {
 public:
     // All are referred to and must outlive this.
-    CommandInterpreter(OrvaneApp& app, OutputPane& output, std::function<void()> quit)
+    CommandInterpreter(LiveApp& app, Printer& output, std::function<void()> quit)
         : _app(app), _output(output), _quit(std::move(quit))
     {
     }
@@ -25,8 +25,8 @@ public:
 private:
     void save(std::string_view description);
 
-    OrvaneApp& _app;
-    OutputPane& _output;
+    LiveApp& _app;
+    Printer& _output;
     std::function<void()> _quit;
 };
 

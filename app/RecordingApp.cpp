@@ -60,8 +60,7 @@ void RecordingApp::applicationWillTerminate()
 void RecordingApp::playLog(const std::string& path, std::shared_ptr<ByteSource> log)
 {
     _playerPath = path;
-    _player =
-        std::make_unique<RecordingPlayer>(_environment.queue, _environment.now, std::move(log),
+    _player = std::make_unique<LogPlayer>(_environment.queue, _environment.now, std::move(log),
                                           _settings, [this] { playerChanged(); });
     _shownNodes = nullptr;
     Screen::main().setPlayback(_player.get());

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/RecordingPlayer.h"
+#include "app/LogPlayer.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/SnapshotTree.h"
 #include "screens/toolkit/NavigationController.h"
@@ -25,7 +25,7 @@ class RecordingApp final : public Shell, public NavigationControllerDelegate
 public:
     struct Environment {
         MainQueue& queue;
-        RecordingPlayer::Now now;
+        LogPlayer::Now now;
         const FileSystem& files;
         // The file as a whole cannot be shown: one line that says why and what to do. Not called
         // by the constructor; the application may be gone afterwards.
@@ -42,7 +42,7 @@ public:
     void applicationWillTerminate();
 
     // The player of the log that is shown; null where none is.
-    [[nodiscard]] RecordingPlayer* player() const { return _player.get(); }
+    [[nodiscard]] LogPlayer* player() const { return _player.get(); }
 
     // A recording cannot be saved again.
     [[nodiscard]] bool allowSaveButton() const override { return false; }
@@ -68,7 +68,7 @@ private:
     RecordingSettings _settings;
     std::optional<SnapshotTree> _snapshot;
     std::string _playerPath; // of the pane that shows the whole of the log
-    std::unique_ptr<RecordingPlayer> _player;
+    std::unique_ptr<LogPlayer> _player;
     NodePointer _shownNodes; // of the player
     std::unique_ptr<Window> _window;
     std::shared_ptr<NavigationController> _navigation;

@@ -81,14 +81,15 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
 
     const std::unique_ptr<LogRecorder> recorder = makeRecorder(options, queue);
     const std::unique_ptr<FrontEnd> frontEnd = makeFrontEnd(kind, options, loop);
-    OrvaneApp app({queue, ports, server, options.refreshInterval, makeUuid, recorder.get()}, files,
-                  preferences, frontEnd->rootPaneMaker());
+    const std::unique_ptr<LiveApp> app =
+        frontEnd->makeApp({queue, ports, server, options.refreshInterval, makeUuid, recorder.get()},
+                          files, preferences);
     const SignalWatcher signals([&loop](int) { loop.quit(); });
 
-    frontEnd->begin(app);
-    app.applicationDidFinishLaunching();
+    frontEnd->begin(*app);
+    app->applicationDidFinishLaunching();
     loop.run();
-    app.applicationWillTerminate();
+    app->applicationWillTerminate();
     return frontEnd->exitStatus();
 }
 

@@ -3,7 +3,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/PropertyValue.h"
-#include "screens/print/JsonPane.h"
+#include "screens/print/JsonPrinter.h"
 #include "ui/tree/OrvaneModelNode.h"
 
 #include <benchmark/benchmark.h>
@@ -61,7 +61,7 @@ void treeToJson(benchmark::State& state)
         OrvaneModelNode::makeTreeFromObject(display(static_cast<int>(state.range(0))), paths);
     std::size_t bytes = 0;
     for (auto _ : state) {
-        JsonPane pane([&bytes](std::string_view text) { bytes += text.size(); }, false);
+        JsonPrinter pane([&bytes](std::string_view text) { bytes += text.size(); }, false);
         pane.reloadWithNode(tree);
         pane.setStatus("Updated 2026-11-21 at 10:00:00", false);
     }

@@ -8,8 +8,8 @@
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
 #include "recordings/LogSurvey.h"
-#include "recordings/LogTimeline.h"
 #include "recordings/RefreshPeriods.h"
+#include "recordings/SeekableLog.h"
 
 #include <benchmark/benchmark.h>
 
@@ -123,12 +123,12 @@ void refreshPeriods(benchmark::State& state)
     state.SetBytesProcessed(bytes);
 }
 
-std::unique_ptr<LogTimeline> readTimeline()
+std::unique_ptr<SeekableLog> readLog()
 {
-    auto timeline = std::make_unique<LogTimeline>(LongDrive::open(), kTechnology);
-    while (timeline->readSlice()) {
+    auto log = std::make_unique<SeekableLog>(LongDrive::open(), "drive.dlf", kTechnology);
+    while (log->readSlice()) {
     }
-    return timeline;
+    return log;
 }
 
 void readForPlaying(benchmark::State& state)
@@ -136,8 +136,8 @@ void readForPlaying(benchmark::State& state)
     const double before = residentMegabytes();
     std::int64_t bytes = 0;
     for (auto _ : state) {
-        const auto timeline = readTimeline();
-        bytes += static_cast<std::int64_t>(timeline->bytesRead());
+        benchmark::DoNotOptimize(readLog());
+        bytes += static_cast<std::int64_t>(LongDrive::open()->size());
         state.counters["grownMB"] = residentMegabytes() - before;
     }
     state.SetBytesProcessed(bytes);
@@ -146,41 +146,41 @@ void readForPlaying(benchmark::State& state)
 template <typename Move>
 void measureMoves(benchmark::State& state, const Move& move)
 {
-    const auto timeline = readTimeline();
+    const auto log = readLog();
     std::mt19937_64 random(1);
     double longest = 0;
     for (auto _ : state) {
         const auto start = std::chrono::steady_clock::now();
-        move(*timeline, random);
+        move(*log, random);
         const std::chrono::duration<double, std::milli> took =
             std::chrono::steady_clock::now() - start;
         longest = std::max(longest, took.count());
-        benchmark::DoNotOptimize(timeline->display());
+        benchmark::DoNotOptimize(log->display());
     }
     state.counters["longestMs"] = longest;
 }
 
 void jumpAnywhere(benchmark::State& state)
 {
-    measureMoves(state, [](LogTimeline& timeline, std::mt19937_64& random) {
-        const auto range = static_cast<std::uint64_t>(timeline.duration().count());
-        timeline.moveTo(LogTime(static_cast<LogTime::rep>(random() % range)));
+    measureMoves(state, [](SeekableLog& log, std::mt19937_64& random) {
+        const auto range = static_cast<std::uint64_t>(log.duration().count());
+        log.moveTo(LogTime(static_cast<LogTime::rep>(random() % range)));
     });
 }
 
 void stepBack(benchmark::State& state)
 {
-    measureMoves(state, [](LogTimeline& timeline, std::mt19937_64&) {
-        timeline.moveTo(timeline.position() - std::chrono::seconds(2));
+    measureMoves(state, [](SeekableLog& log, std::mt19937_64&) {
+        log.moveTo(log.position() - std::chrono::seconds(2));
     });
 }
 
 void nextServingCell(benchmark::State& state)
 {
-    measureMoves(state, [](LogTimeline& timeline, std::mt19937_64&) {
-        if (timeline.position() == timeline.duration())
-            timeline.moveTo(LogTime(0));
-        timeline.moveToNextServingCell();
+    measureMoves(state, [](SeekableLog& log, std::mt19937_64&) {
+        if (log.position() == log.duration())
+            log.moveTo(LogTime(0));
+        log.moveToNextServingCell();
     });
 }
 

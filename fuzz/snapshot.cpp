@@ -4,7 +4,7 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/plist/PropertyList.h"
 #include "platform/services/Services.h"
-#include "recordings/LogTimeline.h"
+#include "recordings/SeekableLog.h"
 #include "recordings/SnapshotTree.h"
 #include "ui/tree/OrvaneModelNode.h"
 
@@ -39,7 +39,7 @@ void play(const std::shared_ptr<ByteSource>& log)
     const auto technology = technologyOfLog(bytes);
     if (!technology)
         return;
-    LogTimeline timeline(log, *technology);
+    SeekableLog timeline(log, *technology);
     while (timeline.readSlice()) {
     }
     const PropertyValue atEnd = timeline.display().deepCopy();

@@ -14,7 +14,8 @@ constexpr std::size_t kFewest = 8;
 
 // The last of those for which the test holds, it being true for those up to some place.
 template <typename Test>
-const LogPlay::Checkpoint* lastOf(const std::vector<LogPlay::Checkpoint>& all, const Test& test)
+const LogDecoder::Checkpoint* lastOf(const std::vector<LogDecoder::Checkpoint>& all,
+                                     const Test& test)
 {
     const auto behind = std::partition_point(all.begin(), all.end(), test);
     return behind == all.begin() ? nullptr : &*std::prev(behind);
@@ -22,11 +23,11 @@ const LogPlay::Checkpoint* lastOf(const std::vector<LogPlay::Checkpoint>& all, c
 
 } // namespace
 
-void Checkpoints::pass(const LogPlay& play)
+void Checkpoints::pass(const LogDecoder& decoder)
 {
-    if (play.itemsTaken() % _spacing != 0)
+    if (decoder.itemsTaken() % _spacing != 0)
         return;
-    _all.push_back(play.checkpoint());
+    _all.push_back(decoder.checkpoint());
     _bytes += _all.back().bytes();
     while (_all.size() > kMost || (_bytes > kMostBytes && _all.size() > kFewest))
         thinOut();
@@ -35,24 +36,24 @@ void Checkpoints::pass(const LogPlay& play)
 void Checkpoints::thinOut()
 {
     _spacing *= 2;
-    std::erase_if(_all, [this](const LogPlay::Checkpoint& each) {
+    std::erase_if(_all, [this](const LogDecoder::Checkpoint& each) {
         return each.place.itemsTaken % _spacing != 0;
     });
     _bytes = 0;
-    for (const LogPlay::Checkpoint& each : _all)
+    for (const LogDecoder::Checkpoint& each : _all)
         _bytes += each.bytes();
 }
 
-const LogPlay::Checkpoint* Checkpoints::before(LogTime time) const
+const LogDecoder::Checkpoint* Checkpoints::before(LogTime time) const
 {
-    return lastOf(_all, [time](const LogPlay::Checkpoint& each) {
+    return lastOf(_all, [time](const LogDecoder::Checkpoint& each) {
         return each.place.itemsTaken == 0 || each.place.time < time;
     });
 }
 
-const LogPlay::Checkpoint* Checkpoints::withCellChanges(std::uint64_t most) const
+const LogDecoder::Checkpoint* Checkpoints::withCellChanges(std::uint64_t most) const
 {
-    return lastOf(_all, [most](const LogPlay::Checkpoint& each) {
+    return lastOf(_all, [most](const LogDecoder::Checkpoint& each) {
         return each.place.servingCellChanges <= most;
     });
 }

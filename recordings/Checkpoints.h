@@ -1,6 +1,6 @@
 #pragma once
 
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -19,13 +19,13 @@ public:
     static constexpr std::size_t kMostBytes = 32 << 20;
 
     // Takes a checkpoint if it is time for one. Call at the log's start and after every item.
-    void pass(const LogPlay& play);
+    void pass(const LogDecoder& decoder);
 
     // The last one whose items are all of earlier times than `time`; the log's start if there is no
     // other. Null before the first call of pass().
-    [[nodiscard]] const LogPlay::Checkpoint* before(LogTime time) const;
+    [[nodiscard]] const LogDecoder::Checkpoint* before(LogTime time) const;
     // The last one at which the serving cell had changed no more often than that.
-    [[nodiscard]] const LogPlay::Checkpoint* withCellChanges(std::uint64_t most) const;
+    [[nodiscard]] const LogDecoder::Checkpoint* withCellChanges(std::uint64_t most) const;
 
     [[nodiscard]] std::size_t size() const { return _all.size(); }
     // Items from one to the next.
@@ -34,7 +34,7 @@ public:
 private:
     void thinOut();
 
-    std::vector<LogPlay::Checkpoint> _all;
+    std::vector<LogDecoder::Checkpoint> _all;
     std::size_t _bytes = 0;
     std::uint64_t _spacing = 256;
 };

@@ -1,7 +1,7 @@
 #include "recordings/LogSurvey.h"
 
 #include "dlf/DlfTime.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "platform/base/Technology.h"
 #include "recordings/LogSlice.h"
 
@@ -15,12 +15,20 @@ namespace
 
 constexpr std::size_t kNamedRanges = 3;
 
+// The survey's part of the time that it takes to read a log and decode it, about.
+constexpr double kShareOfTime = 0.05;
+
 } // namespace
 
-LogSurvey::LogSurvey(std::shared_ptr<ByteSource> log) : _log(std::move(log)), _reader(_log) {}
+LogSurvey::LogSurvey(std::shared_ptr<ByteSource> log, std::optional<std::string> technology)
+    : _log(std::move(log)), _given(std::move(technology)), _reader(_log)
+{
+}
 
 bool LogSurvey::takeSlice()
 {
+    if (_given)
+        return false;
     for (LogSlice slice(_reader); slice.goesOn();) {
         const auto item = _reader.next(LogSlice::kBytes);
         if (!item)
@@ -51,12 +59,21 @@ void LogSurvey::take(const DlfItem& item)
 
 double LogSurvey::progress() const
 {
+    if (_given)
+        return 1;
     const auto size = static_cast<double>(_log->size());
     return size > 0 ? std::min(static_cast<double>(_reader.position()) / size, 1.0) : 1.0;
 }
 
-// Nearly any two bytes are a length that fits, so most of any file could be items. Only those of a
-// log have timestamps that agree with each other.
+double LogSurvey::progressWith(double decoded) const
+{
+    if (_given)
+        return decoded;
+    return kShareOfTime * progress() + (1 - kShareOfTime) * decoded;
+}
+
+// Almost any two bytes are a plausible length, so most of any file could be items. Only the items
+// of a log have timestamps that agree with each other.
 bool LogSurvey::isLog() const
 {
     return _beginsWithReport ||
@@ -65,6 +82,8 @@ bool LogSurvey::isLog() const
 
 std::optional<std::string> LogSurvey::technology() const
 {
+    if (_given)
+        return _given;
     return isLog() ? _finder.technology() : std::nullopt;
 }
 
@@ -73,7 +92,7 @@ std::string LogSurvey::complaint(const std::string& path) const
     if (isLog() && !_hasItems)
         return "\"" + path +
                "\": the log is empty, nothing follows its version report: name another file";
-    // Without a report only times that agree tell a log of unknown codes from foreign bytes.
+    // Without a report only agreeing times distinguish a log of unknown codes from foreign bytes.
     if (isLog() && (_beginsWithReport || _timelyItems > 1))
         return "\"" + path +
                "\" holds no log codes that tell its technology: name it with --technology, one "

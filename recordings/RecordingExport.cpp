@@ -2,7 +2,6 @@
 
 #include "platform/base/PropertyValue.h"
 #include "platform/base/Technology.h"
-#include "recordings/LogSurvey.h"
 
 #include <utility>
 
@@ -17,81 +16,51 @@ RecordingExport::RecordingExport(ExportRequest request, RowWriter& writer, Progr
 
 std::optional<std::string> RecordingExport::run()
 {
-    const OpenedRecording recording = openRecording(_request.file);
+    OpenedRecording recording = openRecording(_request.file);
     if (recording.error)
         return recording.error;
-    if (recording.snapshot)
-        takeEntries(*recording.snapshot);
-    else if (auto problem = takeLog(recording.log))
-        return problem;
-    return finish();
-}
-
-std::optional<std::string> RecordingExport::takeLog(const std::shared_ptr<ByteSource>& log)
-{
-    _technology = _request.technology;
-    if (!_technology) {
-        LogSurvey survey(log);
-        while (_isReadOn && survey.takeSlice())
-            goOnIf(_progress(LogSurvey::kShareOfTime * survey.progress()));
-        if (!_isReadOn)
-            return std::nullopt;
-        _technology = survey.technology();
-        if (!_technology)
-            return survey.complaint(_request.file);
-    }
-    RefreshPeriods periods(log, *_technology, _request.period);
-    while (takeSlice(periods))
-        goOnIf(_progress(LogSurvey::kShareOfTime +
-                         (1 - LogSurvey::kShareOfTime) * periods.progress()));
-    goOnIf(_progress(1));
-    if (const std::string remark = periods.remark(); _isReadOn && !remark.empty())
+    RecordingWalk walk(std::move(recording), {_request.file, _request.technology, _request.period});
+    while (takeSlice(walk))
+        _progress(walk.progress());
+    if (walk.failure())
+        return walk.failure();
+    _progress(1);
+    if (const std::string remark = walk.remark(); _isReadOn && !remark.empty())
         _remarks.push_back(_request.file + ": " + remark);
-    return std::nullopt;
+    return finish(walk);
 }
 
-// False at the end.
-bool RecordingExport::takeSlice(RefreshPeriods& periods)
+// False at the end, or if nobody reads on.
+bool RecordingExport::takeSlice(RecordingWalk& walk)
 {
-    if (!_isReadOn)
-        return false;
-    const auto reached = periods.takeSlice();
-    if (reached == RefreshPeriods::Reached::Period)
-        take(periods.play().clock().isoText(periods.time()), periods.play().display());
-    return reached != RefreshPeriods::Reached::End;
+    const auto reached = walk.takeSlice();
+    // An entry of a snapshot without a display gives no line.
+    if (reached == RecordingWalk::Reached::Display && (walk.display() || !walk.snapshot())) {
+        _table.take(walk.display());
+        _isReadOn = _writer.takePeriod(walk.isoTime().value_or(""), _table);
+    }
+    return _isReadOn && reached != RecordingWalk::Reached::End;
 }
 
-void RecordingExport::takeEntries(const Snapshot& snapshot)
-{
-    for (const Snapshot::Entry& entry : snapshot.entries)
-        if (entry.display && _isReadOn)
-            take(entry.isoDate().value_or(""), entry.display);
-}
-
-void RecordingExport::take(const std::string& time, const PropertyValue& display)
-{
-    _table.take(display);
-    goOnIf(_writer.takePeriod(time, _table));
-}
-
-std::optional<std::string> RecordingExport::finish()
+std::optional<std::string> RecordingExport::finish(const RecordingWalk& walk)
 {
     if (_isReadOn) {
         const std::vector<std::string> missing = _table.missingPaths();
         if (!missing.empty() && missing.size() == _request.paths.size())
             return missingText(missing.front());
         for (const std::string& path : missing)
-            _remarks.push_back(_request.paths.empty() ? emptyText() : missingText(path));
+            _remarks.push_back(_request.paths.empty() ? emptyText(walk.technology())
+                                                      : missingText(path));
         _writer.finish(_table);
     }
     return _writer.problem();
 }
 
-std::string RecordingExport::emptyText() const
+std::string RecordingExport::emptyText(const std::optional<std::string>& technology) const
 {
-    if (!_technology)
+    if (!technology)
         return _request.file + ": no row occurs";
-    return _request.file + ": no row occurs in it as a log of \"" + nameOfTechnology(*_technology) +
+    return _request.file + ": no row occurs in it as a log of \"" + nameOfTechnology(*technology) +
            "\": for another technology name it with --technology, one of " + technologyNames();
 }
 

@@ -10,27 +10,27 @@ namespace orvane
 
 RefreshPeriods::RefreshPeriods(std::shared_ptr<ByteSource> log, const std::string& technology,
                                LogTime period)
-    : _bytesAtFirst(log->size()), _play(std::move(log), technology), _period(period)
+    : _bytesAtFirst(log->size()), _decoder(std::move(log), technology), _period(period)
 {
-    _play.setTellsErrors(true);
+    _decoder.setTellsErrors(true);
 }
 
 RefreshPeriods::Reached RefreshPeriods::takeSlice()
 {
-    for (LogSlice slice(_play.reader()); slice.goesOn();) {
-        _play.lookAhead();
-        if (!_play.hasNext()) {
-            if (!_play.isAtEnd())
+    for (LogSlice slice(_decoder.reader()); slice.goesOn();) {
+        _decoder.lookAhead();
+        if (!_decoder.hasNext()) {
+            if (!_decoder.isAtEnd())
                 return Reached::Nothing;
             return std::exchange(_isOpen, false) ? Reached::Period : Reached::End;
         }
-        const auto next = _play.nextTime() / _period;
-        if (_isOpen && next > _play.time() / _period) {
+        const auto next = _decoder.nextTime() / _period;
+        if (_isOpen && next > _decoder.time() / _period) {
             _isOpen = false;
             return Reached::Period;
         }
         _isOpen = true;
-        _play.takeNext();
+        _decoder.takeNext();
     }
     return Reached::Nothing;
 }
@@ -38,12 +38,12 @@ RefreshPeriods::Reached RefreshPeriods::takeSlice()
 double RefreshPeriods::progress() const
 {
     const auto size = static_cast<double>(_bytesAtFirst);
-    return size > 0 ? static_cast<double>(_play.reader().position()) / size : 1;
+    return size > 0 ? static_cast<double>(_decoder.reader().position()) / size : 1;
 }
 
 std::string RefreshPeriods::remark() const
 {
-    return remarkOn(_play.reader(), _play.impossibleTimes(), _bytesAtFirst);
+    return remarkOn(_decoder.reader(), _decoder.impossibleTimes(), _bytesAtFirst);
 }
 
 } // namespace orvane

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 
 namespace orvane
 {
@@ -13,7 +13,7 @@ class RefreshPeriods
 public:
     enum class Reached {
         Nothing, // the slice is over: call again
-        Period,  // play() is at the end of a period
+        Period,  // decoder() is at the end of a period
         End,     // no further period
     };
 
@@ -24,8 +24,8 @@ public:
     Reached takeSlice();
 
     // The time of the period's last item, and what is shown at its end.
-    [[nodiscard]] LogTime time() const { return _play.time(); }
-    [[nodiscard]] const LogPlay& play() const { return _play; }
+    [[nodiscard]] LogTime time() const { return _decoder.time(); }
+    [[nodiscard]] const LogDecoder& decoder() const { return _decoder; }
 
     // How much of the log has been read, 0 to 1.
     [[nodiscard]] double progress() const;
@@ -35,7 +35,7 @@ public:
 
 private:
     std::uint64_t _bytesAtFirst;
-    LogPlay _play;
+    LogDecoder _decoder;
     LogTime _period;
     bool _isOpen = false; // items of the period that is under way have been taken
 };

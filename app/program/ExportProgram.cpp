@@ -17,13 +17,19 @@ namespace orvane
 namespace
 {
 
-volatile std::sig_atomic_t isInterrupted = 0;
+volatile std::sig_atomic_t isProgressShown = 0;
 
-// Lets SIGINT and SIGTERM end the export, also while it waits for the reader of its output.
+// SIGINT and SIGTERM end the export at once, whatever it is doing: reading a large file, decoding,
+// or waiting for the reader of its output. Nothing has to be cleaned up: rows that are put aside on
+// disk are in a file without a name.
 void endOnSignals()
 {
     struct sigaction action = {};
-    action.sa_handler = [](int) { isInterrupted = 1; };
+    action.sa_handler = [](int) {
+        if (isProgressShown) [[maybe_unused]]
+            const ssize_t ignored = ::write(STDERR_FILENO, "\n", 1);
+        ::_exit(0);
+    };
     for (const int signal : {SIGINT, SIGTERM})
         sigaction(signal, &action, nullptr);
 }
@@ -32,7 +38,7 @@ void endOnSignals()
 class Output
 {
 public:
-    // False where nobody reads on, or nothing can be written.
+    // False if nobody reads on, or nothing can be written.
     bool write(std::string_view lines)
     {
         _pending += lines;
@@ -42,13 +48,12 @@ public:
     {
         const auto state = _descriptor.write(_pending);
         _pending.clear();
-        return state == OutputDescriptor::State::Open && isInterrupted == 0;
+        return state == OutputDescriptor::State::Open;
     }
-    // The exit status; tells what is wrong.
+    // Returns the exit status; tells what is wrong.
     [[nodiscard]] int end()
     {
-        if (isInterrupted == 0)
-            flush();
+        flush();
         return exitStatusOf(_descriptor);
     }
 
@@ -83,9 +88,10 @@ int exportRecording(const AppOptions& options)
     RecordingExport recordingExport(std::move(request), *writer, [&progress](double done) {
         if (progress)
             progress->show(done);
-        return isInterrupted == 0;
     });
+    isProgressShown = progress != nullptr;
     const auto problem = recordingExport.run();
+    isProgressShown = 0;
     progress.reset();
     if (problem)
         complain(*problem);

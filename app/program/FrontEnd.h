@@ -15,10 +15,15 @@ class FrontEnd
 {
 public:
     virtual ~FrontEnd() = default;
-    // Makes the application's root pane, where it is one of the front end's own; null else.
-    [[nodiscard]] virtual OrvaneApp::MakeRootPane rootPaneMaker() { return nullptr; }
+    // Makes the live view that this front end shows: one with panes unless overridden. What is
+    // passed is referred to and must outlive it.
+    [[nodiscard]] virtual std::unique_ptr<LiveApp>
+    makeApp(ModelEnvironment environment, const FileSystem& files, PreferencesStore& preferences)
+    {
+        return std::make_unique<OrvaneApp>(std::move(environment), files, preferences);
+    }
     // The application is about to start. It must not be used once the event loop has ended.
-    virtual void begin(OrvaneApp&) {}
+    virtual void begin(LiveApp&) {}
     // What the program ends with; what is wrong has been told then.
     [[nodiscard]] virtual int exitStatus() { return 0; }
 };

@@ -33,7 +33,7 @@ RecordingSettings settingsOf(const AppOptions& options)
 }
 
 // Commands of a front end that prints: there is nothing to save.
-void takeLine(std::string_view line, OutputPane& output, QtEventLoop& loop)
+void takeLine(std::string_view line, Printer& output, QtEventLoop& loop)
 {
     if (line.ends_with('\r'))
         line.remove_suffix(1);
@@ -52,14 +52,14 @@ int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& lo
     auto progress = progressOnTerminal("Reading " + options.file);
     std::unique_ptr<RecordingPrinter> printer;
     printer = std::make_unique<RecordingPrinter>(queue, opened(options), settingsOf(options),
-                                                 output.pane(), [&] {
+                                                 output.printer(), [&] {
                                                      if (progress)
                                                          progress->show(printer->progress());
                                                      if (printer->hasEnded())
                                                          loop.quit();
                                                  });
     const LineReader lines(
-        STDIN_FILENO, [&](std::string_view line, bool) { takeLine(line, output.pane(), loop); });
+        STDIN_FILENO, [&](std::string_view line, bool) { takeLine(line, output.printer(), loop); });
     const SignalWatcher signals([&loop](int) { loop.quit(); });
     loop.run();
     progress.reset();

@@ -1,5 +1,5 @@
 #include "app/CommandInterpreter.h"
-#include "app/PrintingPaneController.h"
+#include "app/PrintingApp.h"
 #include "app/program/FrontEnd.h"
 #include "app/program/PrintedOutput.h"
 #include "platform/linux/LineReader.h"
@@ -24,19 +24,20 @@ public:
     {
     }
 
-    [[nodiscard]] OrvaneApp::MakeRootPane rootPaneMaker() override
+    [[nodiscard]] std::unique_ptr<LiveApp> makeApp(ModelEnvironment environment,
+                                                   const FileSystem& files,
+                                                   PreferencesStore& preferences) override
     {
-        return [this](Shell& shell) {
-            return std::make_shared<PrintingPaneController>(shell, _output.pane());
-        };
+        return std::make_unique<PrintingApp>(std::move(environment), files, preferences,
+                                             _output.printer());
     }
 
-    void begin(OrvaneApp& app) override
+    void begin(LiveApp& app) override
     {
         // In the background of a terminal, reading it would stop the program; ignored, it is the
         // end of the input, which ends nothing.
         std::signal(SIGTTIN, SIG_IGN);
-        _commands.emplace(app, _output.pane(), [this] { _loop.quit(); });
+        _commands.emplace(app, _output.printer(), [this] { _loop.quit(); });
         _lines.emplace(STDIN_FILENO, [this](std::string_view line, bool wasCut) {
             _commands->takeLine(line, wasCut);
         });

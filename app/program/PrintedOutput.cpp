@@ -2,8 +2,8 @@
 
 #include "app/program/FrontEnd.h"
 #include "platform/linux/QtEventLoop.h"
-#include "screens/print/JsonPane.h"
-#include "screens/print/TextPane.h"
+#include "screens/print/JsonPrinter.h"
+#include "screens/print/TextPrinter.h"
 
 #include <unistd.h>
 
@@ -13,11 +13,11 @@ namespace orvane
 PrintedOutput::PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& loop)
     : _loop(loop), _output(STDOUT_FILENO)
 {
-    const OutputPane::Write write = [this](std::string_view text) { print(text); };
+    const Printer::Write write = [this](std::string_view text) { print(text); };
     if (kind == FrontEndKind::Json)
-        _pane = std::make_unique<JsonPane>(write, isSimulated);
+        _printer = std::make_unique<JsonPrinter>(write, isSimulated);
     else
-        _pane = std::make_unique<TextPane>(write, isSimulated);
+        _printer = std::make_unique<TextPrinter>(write, isSimulated);
 }
 
 int exitStatusOf(const OutputDescriptor& output)

@@ -2,7 +2,7 @@
 
 #include "app/AppOptions.h"
 #include "platform/services/OutputDescriptor.h"
-#include "screens/print/OutputPane.h"
+#include "screens/print/Printer.h"
 
 #include <memory>
 
@@ -22,7 +22,7 @@ public:
     // The loop is referred to and must outlive it.
     PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& loop);
 
-    [[nodiscard]] OutputPane& pane() { return *_pane; }
+    [[nodiscard]] Printer& printer() { return *_printer; }
     // What the program ends with; tells what is wrong.
     [[nodiscard]] int exitStatus() const { return exitStatusOf(_output); }
 
@@ -31,7 +31,7 @@ private:
 
     QtEventLoop& _loop;
     OutputDescriptor _output;
-    std::unique_ptr<OutputPane> _pane;
+    std::unique_ptr<Printer> _printer;
 };
 
 } // namespace orvane

@@ -1,6 +1,6 @@
 #include "app/program/SimulatedPhone.h"
 
-#include "app/OrvaneApp.h"
+#include "app/LiveApp.h"
 #include "platform/linux/SocketTransport.h"
 #include "platform/services/FileSystem.h"
 #include "telephonyd/LogServer.h"

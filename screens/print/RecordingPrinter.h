@@ -1,63 +1,50 @@
 #pragma once
 
-#include "platform/base/PropertyValue.h"
 #include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
-#include "recordings/LogSurvey.h"
-#include "recordings/OpenedRecording.h"
-#include "recordings/RecordingSettings.h"
-#include "recordings/RefreshPeriods.h"
-#include "screens/print/OutputPane.h"
+#include "recordings/RecordingWalk.h"
+#include "screens/print/Printer.h"
 
 #include <functional>
-#include <memory>
 #include <optional>
 #include <string>
 
 namespace orvane
 {
 
-// Prints a recording once, as fast as it can: of a log what is shown at the end of each refresh
-// period, of a snapshot each of its entries. Works a little a turn of the queue, and never ahead of
-// what the output takes.
+// Prints every display of a recording once, as fast as the printer takes them, a little in each
+// turn of the queue.
 class RecordingPrinter
 {
 public:
-    // There is news: more has been read, or all is done. Never called by the constructor.
+    // More has been read, or everything has been printed. Never called by the constructor.
     using OnChange = std::function<void()>;
 
-    // Queue and output are referred to and must outlive it. The recording is one without an error.
+    // Queue and printer are referred to and must outlive this. The recording is one without an
+    // error.
     RecordingPrinter(MainQueue& queue, OpenedRecording recording, RecordingSettings settings,
-                     OutputPane& output, OnChange onChange);
+                     Printer& printer, OnChange onChange);
 
     // How much has been read, 0 to 1.
-    [[nodiscard]] double progress() const;
+    [[nodiscard]] double progress() const { return _hasEnded ? 1 : _walk.progress(); }
     [[nodiscard]] bool hasEnded() const { return _hasEnded; }
-    // Then: one line that says why it could not be printed, and what to do.
-    [[nodiscard]] const std::optional<std::string>& failure() const { return _failure; }
-    // Then: what a person should know about the file; empty where all is well.
-    [[nodiscard]] std::string remark() const;
+    // Then: one line that says why the recording could not be printed, and what to do.
+    [[nodiscard]] const std::optional<std::string>& failure() const { return _walk.failure(); }
+    // Then: what the user should know about the file; empty if nothing is wrong.
+    [[nodiscard]] std::string remark() const { return _walk.remark(); }
 
 private:
-    void goOnLater();
-    void goOn();
-    void goOnWithSurvey();
-    void goOnWithLog();
-    void goOnWithSnapshot(const Snapshot& snapshot);
-    void begin(const std::string& technology);
-    void print(std::optional<std::string> time, const std::string& status,
-               const PropertyValue& display);
+    void takeSliceLater();
+    void takeSlice();
+    void printNote();
+    void printDisplay();
 
     MainQueue& _queue;
-    OpenedRecording _recording;
-    RecordingSettings _settings;
-    OutputPane& _output;
+    RecordingWalk _walk;
+    Printer& _printer;
     OnChange _onChange;
-    std::optional<LogSurvey> _survey;
-    std::optional<RefreshPeriods> _periods;
-    std::size_t _entriesPrinted = 0;
+    bool _hasBegun = false;
     bool _hasEnded = false;
-    std::optional<std::string> _failure;
     Lifetime _lifetime;
 };
 

@@ -1,7 +1,7 @@
 #include "LogGenerator/VRNLogGenerator.h"
 
 #include "LogGenerator/StateKeys.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "platform/base/PacketView.h"
 #include "platform/base/PropertyValue.h"
 #include "support/Recording.h"

@@ -1,12 +1,12 @@
 #include "app/CommandInterpreter.h"
+#include "app/PrintingApp.h"
 
 #include "doubles/FakePreferencesStore.h"
-#include "doubles/FakeScreen.h"
 #include "doubles/LoopbackTransport.h"
 #include "platform/plist/PropertyList.h"
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
-#include "screens/print/JsonPane.h"
+#include "screens/print/JsonPrinter.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 
@@ -39,9 +39,11 @@ protected:
     std::vector<std::string> answersTo(std::string_view line, bool wasCut = false)
     {
         answers.clear();
-        OrvaneApp app({queue, ports, client, std::chrono::seconds(2), [] { return std::nullopt; }},
-                      files, preferences);
+        PrintingApp app(
+            {queue, ports, client, std::chrono::seconds(2), [] { return std::nullopt; }}, files,
+            preferences, output);
         app.applicationDidFinishLaunching();
+        answers.clear();
         CommandInterpreter commands(app, output, [this] { ++quits; });
         commands.takeLine(line, wasCut);
         return answers;
@@ -63,9 +65,8 @@ protected:
     FramePorts ports{transport, queue};
     FrameTelephonyServer client{transport, ports, queue};
     FakePreferencesStore preferences;
-    FakeScreen screen;
     std::vector<std::string> answers;
-    JsonPane output{[this](std::string_view line) { answers.emplace_back(line); }, false};
+    JsonPrinter output{[this](std::string_view line) { answers.emplace_back(line); }, false};
     int quits = 0;
 };
 

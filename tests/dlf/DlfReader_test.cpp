@@ -1,7 +1,7 @@
 #include "dlf/DlfReader.h"
 
 #include "dlf/DlfTime.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "support/Paths.h"
 
 #include <gtest/gtest.h>

@@ -3,7 +3,7 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
 
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"
 
@@ -94,7 +94,7 @@ TEST(ServingCellTest, EachTechnologysDrivesHaveServingCells)
     TestServices services;
     services.useShippedResources();
     for (const RecordedDrive& drive : kDrives) {
-        LogPlay play(recordedLog(drive.file), drive.technology);
+        LogDecoder play(recordedLog(drive.file), drive.technology);
         for (play.lookAhead(); play.hasNext();)
             play.takeNext();
         EXPECT_GT(play.servingCellChanges(), 2U) << drive.file;

@@ -1,5 +1,5 @@
 #include "dlf/DlfReader.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/Paths.h"

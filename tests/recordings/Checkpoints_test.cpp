@@ -24,7 +24,7 @@ protected:
     // Plays all, passing every item by.
     void pass(const std::shared_ptr<ByteSource>& log)
     {
-        LogPlay play(log, kLte);
+        LogDecoder play(log, kLte);
         play.lookAhead();
         checkpoints.pass(play);
         while (play.hasNext()) {

@@ -7,7 +7,7 @@
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/PacketBuilder.h"
 #include "dlf/DlfReader.h"
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 #include "doubles/ManualMainQueue.h"
 #include "platform/services/FileSystem.h"
 #include "support/Paths.h"

@@ -3,8 +3,8 @@
 #include "dlf/FileWindow.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "recordings/LogTimeline.h"
 #include "recordings/RefreshPeriods.h"
+#include "recordings/SeekableLog.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"
 #include "support/Sanitizers.h"
@@ -81,19 +81,19 @@ protected:
 
 TEST_F(LongLogTest, IsReadAndMovedAboutInWithoutGrowing)
 {
-    LogTimeline timeline(open(), kLte);
+    SeekableLog log(open(), path, kLte);
     int slices = 0;
-    while (timeline.readSlice())
+    while (log.readSlice())
         ++slices;
     EXPECT_GT(slices, 40);
-    EXPECT_EQ(timeline.duration(), std::chrono::seconds(seconds - 1) + 1250us);
+    EXPECT_EQ(log.duration(), std::chrono::seconds(seconds - 1) + 1250us);
     expectNoGrowth();
 
     std::mt19937_64 random(1);
     for (int i = 0; i < 100; ++i) {
         const std::uint64_t second = random() % (seconds - 1);
-        timeline.moveTo(std::chrono::seconds(second) + 1ms);
-        ASSERT_EQ(channel(timeline.display()), std::to_string(second));
+        log.moveTo(std::chrono::seconds(second) + 1ms);
+        ASSERT_EQ(channel(log.display()), std::to_string(second));
     }
     expectNoGrowth();
 }
@@ -107,7 +107,7 @@ TEST_F(LongLogTest, IsGoneThroughByPeriodsWithoutGrowing)
         if (reached == RefreshPeriods::Reached::Period) {
             ++count;
             const std::uint64_t last = std::min(count * 100, seconds) - 1;
-            ASSERT_EQ(channel(periods.play().display()), std::to_string(last));
+            ASSERT_EQ(channel(periods.decoder().display()), std::to_string(last));
         }
     EXPECT_EQ(count, (seconds + 99) / 100);
     expectNoGrowth();

@@ -39,10 +39,8 @@ protected:
     // What is wrong, or "".
     std::string run(RowWriter& writer)
     {
-        RecordingExport recordingExport(request, writer, [this](double done) {
-            progress.push_back(done);
-            return progress.size() < slicesWanted;
-        });
+        RecordingExport recordingExport(request, writer,
+                                        [this](double done) { progress.push_back(done); });
         const auto problem = recordingExport.run();
         remarks = recordingExport.remarks();
         return problem.value_or("");
@@ -73,7 +71,6 @@ protected:
     std::string written;
     int linesWanted = 1'000'000;
     std::vector<double> progress;
-    std::size_t slicesWanted = SIZE_MAX;
     std::vector<std::string> remarks;
 };
 
@@ -187,19 +184,17 @@ TEST_F(RecordingExportTest, ARecordingWithoutAnyRowSaysWhatItWasReadAs)
                              "cdma-evening.dlf: no row occurs in it as a log of \"lte\"")));
 }
 
-TEST_F(RecordingExportTest, LookingForTheTechnologyTellsItsProgressAndCanBeGivenUp)
+TEST_F(RecordingExportTest, LookingForTheTechnologyTellsItsProgress)
 {
     LogBuilder builder;
     for (std::uint64_t i = 0; i < 5000; ++i)
         builder.measurement(kLogStart + i * kLogStep, 1);
     write(builder.bytes);
-    slicesWanted = 2;
     EXPECT_EQ(runJson(), "");
-    ASSERT_EQ(progress.size(), 2U);
+    ASSERT_GT(progress.size(), 2U);
     EXPECT_GT(progress[0], 0);
     EXPECT_GT(progress[1], progress[0]);
     EXPECT_LT(progress[1], 0.05);
-    EXPECT_EQ(written, "");
 }
 
 TEST_F(RecordingExportTest, AnImpossibleTimeIsToldAndLeavesThePeriodsAsTheyAre)
@@ -232,18 +227,6 @@ TEST_F(RecordingExportTest, StopsOnceNobodyReads)
     EXPECT_EQ(runJson(), "");
     EXPECT_EQ(std::count(written.begin(), written.end(), '\n'), 3);
     EXPECT_LT(progress.size(), 20U) << "the rest is not read";
-}
-
-TEST_F(RecordingExportTest, GivesUpWhereItIsAskedTo)
-{
-    request.file = testDataPath("lte-drive.dlf");
-    request.technology = kTSLogChannelTechnology_Varnel_LTE; // not looked for in slices of its own
-    slicesWanted = 3;
-    EXPECT_EQ(runCsv(), "");
-    EXPECT_EQ(written, "") << "no part of a table";
-    progress.clear();
-    EXPECT_EQ(runJson(), "");
-    EXPECT_EQ(std::count(written.begin(), written.end(), '\n'), 3);
 }
 
 TEST_F(RecordingExportTest, TellsItsProgress)

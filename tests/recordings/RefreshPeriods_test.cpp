@@ -32,9 +32,10 @@ protected:
         for (auto reached = periods.takeSlice(); reached != RefreshPeriods::Reached::End;
              reached = periods.takeSlice())
             if (reached == RefreshPeriods::Reached::Period)
-                found.emplace_back(
-                    periods.time(),
-                    periods.play().display()["Serving Cell Measurements"]["E-ARFCN"].description());
+                found.emplace_back(periods.time(),
+                                   periods.decoder()
+                                       .display()["Serving Cell Measurements"]["E-ARFCN"]
+                                       .description());
         EXPECT_EQ(periods.takeSlice(), RefreshPeriods::Reached::End);
         return found;
     }
@@ -56,7 +57,7 @@ TEST_F(RefreshPeriodsTest, EachPeriodShowsWhatALiveViewWouldShowAtItsEnd)
                     continue;
                 ASSERT_LT(count, expected.size());
                 ASSERT_EQ(periods.time(), expected[count].time);
-                ASSERT_EQ(periods.play().display().description(), expected[count].display);
+                ASSERT_EQ(periods.decoder().display().description(), expected[count].display);
                 ++count;
             }
             EXPECT_EQ(count, expected.size()) << drive.file;

@@ -7,7 +7,7 @@
 #include "LogGenerator/StateKeys.h"
 #include "LogGenerator/support/RecordedMessages.h"
 #include "platform/plist/PropertyList.h"
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 #include "recordings/OpenedRecording.h"
 #include "recordings/support/LogFiles.h"
 #include "support/Recording.h"
@@ -83,7 +83,7 @@ TEST_P(SavedSnapshotTest, WhatWasSavedOpensToTheSameDisplaysAndItsLogToTheLastOn
     EXPECT_FALSE(last.display);
     ASSERT_TRUE(last.log);
 
-    LogPlay play(last.log, GetParam().technology);
+    LogDecoder play(last.log, GetParam().technology);
     play.lookAhead();
     while (play.hasNext())
         play.takeNext();

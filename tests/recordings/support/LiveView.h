@@ -47,7 +47,7 @@ struct LiveView {
     }
 
     [[nodiscard]] LogTime duration() const { return moments.back().time; }
-    // After all items before that time; at 0 and at the end see LogTimeline::moveTo().
+    // After all items before that time; at 0 and at the end see SeekableLog::moveTo().
     [[nodiscard]] std::string at(LogTime time) const
     {
         if (time >= duration())

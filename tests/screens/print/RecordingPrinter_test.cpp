@@ -5,8 +5,8 @@
 
 #include "doubles/ManualMainQueue.h"
 #include "recordings/support/LiveView.h"
-#include "screens/print/JsonPane.h"
-#include "screens/print/TextPane.h"
+#include "screens/print/JsonPrinter.h"
+#include "screens/print/TextPrinter.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>
@@ -58,7 +58,7 @@ class RecordingPrinterTest : public ::testing::Test
 protected:
     RecordingPrinterTest() { services.useShippedResources(); }
 
-    void printAs(OutputPane& pane, OpenedRecording recording,
+    void printAs(Printer& pane, OpenedRecording recording,
                  RecordingSettings settings = {"a.dlf", {}})
     {
         printer = std::make_unique<RecordingPrinter>(
@@ -68,7 +68,7 @@ protected:
     std::vector<std::string> json(OpenedRecording recording,
                                   RecordingSettings settings = {"a.dlf", {}})
     {
-        JsonPane pane([this](std::string_view text) { lines.emplace_back(text); }, false);
+        JsonPrinter pane([this](std::string_view text) { lines.emplace_back(text); }, false);
         printAs(pane, std::move(recording), std::move(settings));
         return lines;
     }
@@ -124,7 +124,7 @@ TEST_F(RecordingPrinterTest, ASnapshotIsALineAnEntry)
 
 TEST_F(RecordingPrinterTest, AsTextASnapshotBeginsWithWhatTheUserWroteAboutIt)
 {
-    TextPane pane([this](std::string_view text) { lines.emplace_back(text); }, false);
+    TextPrinter pane([this](std::string_view text) { lines.emplace_back(text); }, false);
     printAs(pane, snapshot());
     EXPECT_THAT(lines, ElementsAre("Snapshot of 2026-11-21 10:00:06 +0000: by the river\n\n",
                                    "Snapshot (2026-11-21 10:00:00 +0000)\nOrvane\n  Cell ID: 7\n\n",
@@ -156,7 +156,7 @@ TEST_F(RecordingPrinterTest, ALogOfNoTechnologyFailsUnlessItIsNamed)
 
 TEST_F(RecordingPrinterTest, APrinterThatGoesPrintsNoMore)
 {
-    JsonPane pane([this](std::string_view text) { lines.emplace_back(text); }, false);
+    JsonPrinter pane([this](std::string_view text) { lines.emplace_back(text); }, false);
     printer = std::make_unique<RecordingPrinter>(queue, log(recordedLog("lte-drive.dlf")),
                                                  RecordingSettings{"a.dlf", {}}, pane, nullptr);
     printer.reset();

@@ -1,18 +1,18 @@
 #pragma once
 
-#include "screens/print/OutputPane.h"
+#include "screens/print/Printer.h"
 
 namespace orvane
 {
 
 // Prints blocks parted by a blank line: the status, then the tree as an outline, two spaces a
 // level, "NAME: VALUE" or "NAME".
-class TextPane final : public OutputPane
+class TextPrinter final : public Printer
 {
 public:
     // On a simulated phone the status line ends with " (simulated phone)".
-    TextPane(Write write, bool isSimulated)
-        : OutputPane(std::move(write)), _isSimulated(isSimulated)
+    TextPrinter(Write write, bool isSimulated)
+        : Printer(std::move(write)), _isSimulated(isSimulated)
     {
     }
 

@@ -1,4 +1,4 @@
-#include "screens/print/TextPane.h"
+#include "screens/print/TextPrinter.h"
 
 #include "platform/base/Utf8.h"
 
@@ -25,8 +25,8 @@ std::string block(std::string lines) { return lines + "\n"; }
 
 } // namespace
 
-std::string TextPane::statusOutput(const std::string& status, bool,
-                                   const OrvaneModelNode* tree) const
+std::string TextPrinter::statusOutput(const std::string& status, bool,
+                                      const OrvaneModelNode* tree) const
 {
     std::string lines = status + (_isSimulated ? " (simulated phone)\n" : "\n");
     if (tree)
@@ -34,22 +34,22 @@ std::string TextPane::statusOutput(const std::string& status, bool,
     return block(std::move(lines));
 }
 
-std::string TextPane::savedOutput(const std::string& path) const
+std::string TextPrinter::savedOutput(const std::string& path) const
 {
     return block("Saved to " + shownText(path) + "\n");
 }
 
-std::string TextPane::alertOutput(const std::string& title, const std::string& message) const
+std::string TextPrinter::alertOutput(const std::string& title, const std::string& message) const
 {
     return block(title + ": " + message + "\n");
 }
 
-std::string TextPane::errorOutput(const std::string& text) const
+std::string TextPrinter::errorOutput(const std::string& text) const
 {
     return block("Error: " + shownText(text) + "\n");
 }
 
-std::string TextPane::noteOutput(const std::string& text) const
+std::string TextPrinter::noteOutput(const std::string& text) const
 {
     return block(shownText(text) + "\n");
 }

@@ -1,4 +1,4 @@
-#include "dlf/DlfWriter.h"
+#include "dlf/VersionReport.h"
 
 #include <gtest/gtest.h>
 
@@ -11,7 +11,7 @@ namespace orvane
 namespace
 {
 
-class DlfWriterTest : public testing::Test
+class VersionReportTest : public testing::Test
 {
 protected:
     int write(std::size_t size = kDlfVersionReportBytes)
@@ -51,7 +51,7 @@ std::string field(const std::string& text, std::size_t width)
     return padded;
 }
 
-TEST_F(DlfWriterTest, EveryByteOfTheReportIsInItsPlace)
+TEST_F(VersionReportTest, EveryByteOfTheReportIsInItsPlace)
 {
     ASSERT_EQ(write(), 0);
     EXPECT_EQ(written, 161U);
@@ -71,7 +71,7 @@ TEST_F(DlfWriterTest, EveryByteOfTheReportIsInItsPlace)
     EXPECT_EQ(textAt(0, 161), expected);
 }
 
-TEST_F(DlfWriterTest, VersionTextIsCutToSixCharacters)
+TEST_F(VersionReportTest, VersionTextIsCutToSixCharacters)
 {
     write();
     EXPECT_EQ(textAt(16, 7), field("Orvane", 7));
@@ -83,7 +83,7 @@ TEST_F(DlfWriterTest, VersionTextIsCutToSixCharacters)
     EXPECT_EQ(textAt(16, 7), field("Or", 7));
 }
 
-TEST_F(DlfWriterTest, LongTextsAreCutAndEndInANul)
+TEST_F(VersionReportTest, LongTextsAreCutAndEndInANul)
 {
     program = "EXECUTABLE_NAME_AND_MORE";
     built = "Jun 13 2017 22:04:20 and more";
@@ -92,7 +92,7 @@ TEST_F(DlfWriterTest, LongTextsAreCutAndEndInANul)
     EXPECT_EQ(textAt(63, 18), field("Jun 13 2017 22:04", 18));
 }
 
-TEST_F(DlfWriterTest, ZoneIsTwosComplementMinutes)
+TEST_F(VersionReportTest, ZoneIsTwosComplementMinutes)
 {
     struct Case {
         std::int16_t minutes;
@@ -111,7 +111,7 @@ TEST_F(DlfWriterTest, ZoneIsTwosComplementMinutes)
     }
 }
 
-TEST_F(DlfWriterTest, VersionsTimeAndFlagAreStoredWhole)
+TEST_F(VersionReportTest, VersionsTimeAndFlagAreStoredWhole)
 {
     firstVersion = 0x1234;
     secondVersion = 0xFEDC;
@@ -126,7 +126,7 @@ TEST_F(DlfWriterTest, VersionsTimeAndFlagAreStoredWhole)
     EXPECT_EQ(at(87, 2), (std::vector<std::uint8_t>{1, 0}));
 }
 
-TEST_F(DlfWriterTest, ShortBufferGivesThreeAndIsLeftAlone)
+TEST_F(VersionReportTest, ShortBufferGivesThreeAndIsLeftAlone)
 {
     for (std::size_t size = 0; size < kDlfVersionReportBytes; ++size) {
         written = 99;
@@ -136,7 +136,7 @@ TEST_F(DlfWriterTest, ShortBufferGivesThreeAndIsLeftAlone)
     }
 }
 
-TEST_F(DlfWriterTest, LongBufferIsLeftAloneBehindTheReport)
+TEST_F(VersionReportTest, LongBufferIsLeftAloneBehindTheReport)
 {
     ASSERT_EQ(write(170), 0);
     EXPECT_EQ(written, 161U);
@@ -144,7 +144,7 @@ TEST_F(DlfWriterTest, LongBufferIsLeftAloneBehindTheReport)
               (std::vector<std::uint8_t>{0, 0xAA, 0xAA, 0xAA, 0xAA, 0xAA, 0xAA, 0xAA, 0xAA, 0xAA}));
 }
 
-TEST_F(DlfWriterTest, AbsentTextsAreStoredEmptyAndAnAbsentCountIsNotWritten)
+TEST_F(VersionReportTest, AbsentTextsAreStoredEmptyAndAnAbsentCountIsNotWritten)
 {
     version = program = built = nullptr;
     ASSERT_EQ(write(), 0);
@@ -155,7 +155,7 @@ TEST_F(DlfWriterTest, AbsentTextsAreStoredEmptyAndAnAbsentCountIsNotWritten)
     EXPECT_EQ(VRTDLFAddVersionReport(bytes.data(), 160, nullptr, 1, 1, "a", "b", "c", 0, 0, 0), 3);
 }
 
-TEST_F(DlfWriterTest, AbsentBufferCountsAsTooShort)
+TEST_F(VersionReportTest, AbsentBufferCountsAsTooShort)
 {
     EXPECT_EQ(VRTDLFAddVersionReport(nullptr, 161, &written, 1, 1, "a", "b", "c", 0, 0, 0), 3);
     EXPECT_EQ(written, 0U);

@@ -1,7 +1,7 @@
 #include "platform/base/JsonText.h"
 #include "platform/base/PropertyValue.h"
-#include "screens/print/JsonPane.h"
-#include "screens/print/TextPane.h"
+#include "screens/print/JsonPrinter.h"
+#include "screens/print/TextPrinter.h"
 
 #include <gtest/gtest.h>
 
@@ -37,21 +37,21 @@ protected:
     std::string output;
 };
 
-using JsonPaneTest = PaneFixture<JsonPane>;
-using TextPaneTest = PaneFixture<TextPane>;
+using JsonPrinterTest = PaneFixture<JsonPrinter>;
+using TextPrinterTest = PaneFixture<TextPrinter>;
 
 } // namespace
 
-TEST_F(JsonPaneTest, BeforeAnyTreeTheTreeIsNull)
+TEST_F(JsonPrinterTest, BeforeAnyTreeTheTreeIsNull)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.setStatus("Connecting", true);
     EXPECT_EQ(output, "{\"status\":\"Connecting\",\"loading\":true,\"tree\":null}\n");
 }
 
-TEST_F(JsonPaneTest, AReloadAndItsStatusAreOneLine)
+TEST_F(JsonPrinterTest, AReloadAndItsStatusAreOneLine)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.reloadWithNode(tree(sampleDisplay()));
     EXPECT_EQ(output, "");
     pane.setStatus("Updated 2026-11-21 at 10:00:00", false);
@@ -62,9 +62,9 @@ TEST_F(JsonPaneTest, AReloadAndItsStatusAreOneLine)
                       "{\"name\":\"Detected Cells\",\"children\":[]}]}}\n");
 }
 
-TEST_F(JsonPaneTest, AStatusThatDoesNotChangePrintsNothingUnlessReloaded)
+TEST_F(JsonPrinterTest, AStatusThatDoesNotChangePrintsNothingUnlessReloaded)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.setStatus("Connecting...", false);
     output.clear();
     pane.setStatus("Connecting...", false);
@@ -74,18 +74,18 @@ TEST_F(JsonPaneTest, AStatusThatDoesNotChangePrintsNothingUnlessReloaded)
     EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":false,\"tree\":null}\n");
 }
 
-TEST_F(JsonPaneTest, AChangeOfTheBusyStateAloneIsAChange)
+TEST_F(JsonPrinterTest, AChangeOfTheBusyStateAloneIsAChange)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.setStatus("Connecting...", false);
     output.clear();
     pane.setStatus("Connecting...", true);
     EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":true,\"tree\":null}\n");
 }
 
-TEST_F(JsonPaneTest, AChangeOfTheStatusAloneCarriesTheTreeOnTheScreen)
+TEST_F(JsonPrinterTest, AChangeOfTheStatusAloneCarriesTheTreeOnTheScreen)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.reloadWithNode(tree("text"));
     pane.setStatus("Updated", false);
     output.clear();
@@ -94,16 +94,16 @@ TEST_F(JsonPaneTest, AChangeOfTheStatusAloneCarriesTheTreeOnTheScreen)
                       "\"tree\":{\"name\":\"Orvane\",\"value\":\"text\"}}\n");
 }
 
-TEST_F(JsonPaneTest, NoStatusIsAnEmptyOne)
+TEST_F(JsonPrinterTest, NoStatusIsAnEmptyOne)
 {
-    JsonPane pane = make();
+    JsonPrinter pane = make();
     pane.setStatus(std::nullopt, true);
     EXPECT_EQ(output, "{\"status\":\"\",\"loading\":true,\"tree\":null}\n");
 }
 
-TEST_F(JsonPaneTest, EveryObjectOfASimulatedPhoneSaysSo)
+TEST_F(JsonPrinterTest, EveryObjectOfASimulatedPhoneSaysSo)
 {
-    JsonPane pane = make(true);
+    JsonPrinter pane = make(true);
     pane.setStatus("Connecting", true);
     pane.showSaved("/root/a.orvane");
     pane.showAlert("File Error", "Unable to write file to disk");
@@ -137,9 +137,9 @@ TEST(JsonText, EscapesWhatJsonCannotHold)
     }
 }
 
-TEST_F(TextPaneTest, PrintsTheStatusAndAnOutlineAsBlocksPartedByABlankLine)
+TEST_F(TextPrinterTest, PrintsTheStatusAndAnOutlineAsBlocksPartedByABlankLine)
 {
-    TextPane pane = make();
+    TextPrinter pane = make();
     pane.setStatus("Connecting", true);
     pane.reloadWithNode(tree(sampleDisplay()));
     pane.setStatus("Updated 2026-11-21 at 10:00:00", false);
@@ -153,16 +153,16 @@ TEST_F(TextPaneTest, PrintsTheStatusAndAnOutlineAsBlocksPartedByABlankLine)
                       "\n");
 }
 
-TEST_F(TextPaneTest, MarksTheStatusOfASimulatedPhone)
+TEST_F(TextPrinterTest, MarksTheStatusOfASimulatedPhone)
 {
-    TextPane pane = make(true);
+    TextPrinter pane = make(true);
     pane.setStatus("Connecting", true);
     EXPECT_EQ(output, "Connecting (simulated phone)\n\n");
 }
 
-TEST_F(TextPaneTest, AnswersInWords)
+TEST_F(TextPrinterTest, AnswersInWords)
 {
-    TextPane pane = make();
+    TextPrinter pane = make();
     pane.showSaved("/root/a.orvane");
     pane.showAlert("File Error", "Unable to write file to disk");
     pane.showError("unknown command \"x\"");
@@ -171,9 +171,9 @@ TEST_F(TextPaneTest, AnswersInWords)
                       "Error: unknown command \"x\"\n\n");
 }
 
-TEST_F(TextPaneTest, ARowStaysOnItsLine)
+TEST_F(TextPrinterTest, ARowStaysOnItsLine)
 {
-    TextPane pane = make();
+    TextPrinter pane = make();
     pane.reloadWithNode(tree(PropertyValue::dictionaryOf({
         {"two\nlines", "a\nb"}
     })));

@@ -1,18 +1,18 @@
-#include "screens/print/OutputPane.h"
+#include "screens/print/Printer.h"
 
 #include <utility>
 
 namespace orvane
 {
 
-void OutputPane::reloadWithNode(NodePointer node)
+void Printer::reloadWithNode(NodePointer node)
 {
     _node = std::move(node);
     // Printed with the status that comes next.
     _isReloaded = true;
 }
 
-void OutputPane::setStatus(std::optional<std::string> status, bool isLoading)
+void Printer::setStatus(std::optional<std::string> status, bool isLoading)
 {
     std::string text = std::move(status).value_or("");
     if (!_isReloaded && _status == text && _isLoading == isLoading)
@@ -23,21 +23,21 @@ void OutputPane::setStatus(std::optional<std::string> status, bool isLoading)
     _write(statusOutput(*_status, _isLoading, _node.get()));
 }
 
-void OutputPane::setTime(std::optional<std::string> time) { _time = std::move(time); }
+void Printer::setTime(std::optional<std::string> time) { _time = std::move(time); }
 
-void OutputPane::showNote(const std::string& text)
+void Printer::showNote(const std::string& text)
 {
     if (const std::string output = noteOutput(text); !output.empty())
         _write(output);
 }
 
-void OutputPane::showSaved(const std::string& path) { _write(savedOutput(path)); }
+void Printer::showSaved(const std::string& path) { _write(savedOutput(path)); }
 
-void OutputPane::showAlert(const std::string& title, const std::string& message)
+void Printer::showAlert(const std::string& title, const std::string& message)
 {
     _write(alertOutput(title, message));
 }
 
-void OutputPane::showError(const std::string& text) { _write(errorOutput(text)); }
+void Printer::showError(const std::string& text) { _write(errorOutput(text)); }
 
 } // namespace orvane

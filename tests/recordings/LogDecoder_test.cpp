@@ -1,4 +1,4 @@
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 
 #include "platform/base/TelephonyConstants.h"
 
@@ -20,12 +20,12 @@ using testing::IsEmpty;
 
 constexpr const char* kLte = kTSLogChannelTechnology_Varnel_LTE;
 
-class LogPlayTest : public ::testing::Test
+class LogDecoderTest : public ::testing::Test
 {
 protected:
-    LogPlayTest() { services.useShippedResources(); }
+    LogDecoderTest() { services.useShippedResources(); }
 
-    static void takeAll(LogPlay& play)
+    static void takeAll(LogDecoder& play)
     {
         while (!play.isAtEnd()) {
             play.lookAhead();
@@ -36,11 +36,11 @@ protected:
     TestServices services;
 };
 
-TEST_F(LogPlayTest, EveryItemShowsWhatALiveViewWouldShow)
+TEST_F(LogDecoderTest, EveryItemShowsWhatALiveViewWouldShow)
 {
     for (const RecordedDrive& drive : kDrives) {
         const LiveView& live = liveViewOf(drive);
-        LogPlay play(recordedLog(drive.file), drive.technology);
+        LogDecoder play(recordedLog(drive.file), drive.technology);
         play.lookAhead();
         for (const LiveView::Moment& moment : live.moments) {
             ASSERT_TRUE(play.hasNext());
@@ -54,7 +54,7 @@ TEST_F(LogPlayTest, EveryItemShowsWhatALiveViewWouldShow)
     }
 }
 
-TEST_F(LogPlayTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
+TEST_F(LogDecoderTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
 {
     const auto log = LogBuilder()
                          .measurement(0, 1) // no timestamp
@@ -65,7 +65,7 @@ TEST_F(LogPlayTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
                          .measurement(kLogStart - 9 * kLogSecond, 6)
                          .measurement(kLogStart + 4 * kLogSecond, 7)
                          .source();
-    LogPlay play(log, kLte);
+    LogDecoder play(log, kLte);
     std::vector<LogTime> times;
     play.lookAhead();
     while (play.hasNext()) {
@@ -76,20 +76,20 @@ TEST_F(LogPlayTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
     EXPECT_EQ(play.clock().isoText(play.time()), "2017-07-11T04:34:12.000Z");
 }
 
-TEST_F(LogPlayTest, AnItemOfAnImpossibleTimeHasThatOfTheOneBefore)
+TEST_F(LogDecoderTest, AnItemOfAnImpossibleTimeHasThatOfTheOneBefore)
 {
     constexpr std::uint64_t kWild = std::uint64_t{0x7FFF} << 48;
-    LogPlay play(LogBuilder()
-                     .measurement(kWild, 1)
-                     .measurement(kLogStart, 2)
-                     .measurement(kLogStart + kLogSecond, 3)
-                     .measurement(kWild, 4)
-                     .measurement(kWild + kLogSecond, 5)
-                     .measurement(kLogStart + 2 * kLogSecond, 6)
-                     .measurement(kLogStart + 3 * kLogSecond, 7)
-                     .measurement(kWild, 8)
-                     .source(),
-                 kLte);
+    LogDecoder play(LogBuilder()
+                        .measurement(kWild, 1)
+                        .measurement(kLogStart, 2)
+                        .measurement(kLogStart + kLogSecond, 3)
+                        .measurement(kWild, 4)
+                        .measurement(kWild + kLogSecond, 5)
+                        .measurement(kLogStart + 2 * kLogSecond, 6)
+                        .measurement(kLogStart + 3 * kLogSecond, 7)
+                        .measurement(kWild, 8)
+                        .source(),
+                    kLte);
     std::vector<LogTime> times;
     play.lookAhead();
     while (play.hasNext()) {
@@ -101,9 +101,9 @@ TEST_F(LogPlayTest, AnItemOfAnImpossibleTimeHasThatOfTheOneBefore)
     EXPECT_EQ(play.clock().isoText(0s), "2017-07-11T04:34:08.000Z");
 }
 
-TEST_F(LogPlayTest, NothingIsShownBeforeTheFirstItem)
+TEST_F(LogDecoderTest, NothingIsShownBeforeTheFirstItem)
 {
-    LogPlay play(LogBuilder().measurement(kLogStart, 1).source(), kLte);
+    LogDecoder play(LogBuilder().measurement(kLogStart, 1).source(), kLte);
     EXPECT_FALSE(play.display());
     EXPECT_FALSE(play.hasNext());
     EXPECT_FALSE(play.isAtEnd());
@@ -113,17 +113,17 @@ TEST_F(LogPlayTest, NothingIsShownBeforeTheFirstItem)
     EXPECT_TRUE(play.display());
 }
 
-TEST_F(LogPlayTest, ALogWithoutItemsIsAtItsEnd)
+TEST_F(LogDecoderTest, ALogWithoutItemsIsAtItsEnd)
 {
-    LogPlay play(sourceOf({}), kLte);
+    LogDecoder play(sourceOf({}), kLte);
     EXPECT_TRUE(play.isAtEnd());
-    LogPlay foreign(sourceOf(Bytes(100, 0xED)), kLte);
+    LogDecoder foreign(sourceOf(Bytes(100, 0xED)), kLte);
     takeAll(foreign);
     EXPECT_EQ(foreign.itemsTaken(), 0U);
     EXPECT_EQ(foreign.reader().unplacedBytes(), 100U);
 }
 
-TEST_F(LogPlayTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
+TEST_F(LogDecoderTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
 {
     LogBuilder builder;
     builder.measurement(kLogStart, 1);
@@ -133,7 +133,7 @@ TEST_F(LogPlayTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
     builder.bytes.push_back(0xFF);
     builder.item(2, kLogStart + 3 * kLogStep, Bytes(5, 1)); // data connections that are none
     builder.measurement(kLogStart + 4 * kLogStep, 3);
-    LogPlay play(builder.source(), kTSLogChannelTechnology_IFX);
+    LogDecoder play(builder.source(), kTSLogChannelTechnology_IFX);
     play.setTellsErrors(true);
     services.log.lines.clear();
     takeAll(play); // every item is a message that this generator cannot read
@@ -142,15 +142,15 @@ TEST_F(LogPlayTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
     EXPECT_THAT(services.log.errors().front(), testing::StartsWith("Dropping a message of 77 "));
 }
 
-TEST_F(LogPlayTest, OnlyErrorsAboutMessagesAreToldAndOnlyWhereTheyShall)
+TEST_F(LogDecoderTest, OnlyErrorsAboutMessagesAreToldAndOnlyWhereTheyShall)
 {
     services.log.lines.clear();
     {
-        LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+        LogDecoder play(recordedLog("lte-drive.dlf"), kLte);
         takeAll(play);
     }
     EXPECT_THAT(services.log.lines, IsEmpty());
-    LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+    LogDecoder play(recordedLog("lte-drive.dlf"), kLte);
     play.setTellsErrors(true);
     takeAll(play);
     EXPECT_EQ(services.log.errors().size(), 24U);
@@ -158,38 +158,38 @@ TEST_F(LogPlayTest, OnlyErrorsAboutMessagesAreToldAndOnlyWhereTheyShall)
     EXPECT_THAT(services.console.lines, IsEmpty());
 }
 
-TEST_F(LogPlayTest, ServingCellChangesAreCounted)
+TEST_F(LogDecoderTest, ServingCellChangesAreCounted)
 {
-    LogPlay play(recordedLog("lte-drive.dlf"), kLte);
+    LogDecoder play(recordedLog("lte-drive.dlf"), kLte);
     takeAll(play);
     EXPECT_EQ(play.servingCellChanges(), 24U); // the first one and 23 more
 }
 
-TEST_F(LogPlayTest, ServingCellsOfOneMomentCountAsTheLastOfThem)
+TEST_F(LogDecoderTest, ServingCellsOfOneMomentCountAsTheLastOfThem)
 {
-    LogPlay play(LogBuilder()
-                     .servingCell(kLogStart, 1)
-                     .servingCell(kLogStart + kLogSecond, 2)
-                     .servingCell(kLogStart + kLogSecond, 1)
-                     .servingCell(kLogStart + 2 * kLogSecond, 3)
-                     .source(),
-                 kLte);
+    LogDecoder play(LogBuilder()
+                        .servingCell(kLogStart, 1)
+                        .servingCell(kLogStart + kLogSecond, 2)
+                        .servingCell(kLogStart + kLogSecond, 1)
+                        .servingCell(kLogStart + 2 * kLogSecond, 3)
+                        .source(),
+                    kLte);
     takeAll(play);
     EXPECT_EQ(play.servingCellChanges(), 2U);
 }
 
-TEST_F(LogPlayTest, ARestoredPlayGoesOnFromAnyItemAsBefore)
+TEST_F(LogDecoderTest, ARestoredPlayGoesOnFromAnyItemAsBefore)
 {
     for (const RecordedDrive& drive : kDrives) {
         const LiveView& live = liveViewOf(drive);
         const auto log = recordedLog(drive.file);
-        LogPlay play(log, drive.technology);
-        LogPlay other(log, drive.technology);
+        LogDecoder play(log, drive.technology);
+        LogDecoder other(log, drive.technology);
         play.lookAhead();
         for (std::size_t i = 0; i < live.moments.size(); i += 5 + i % 3) {
             while (play.itemsTaken() < i)
                 play.takeNext();
-            const LogPlay::Checkpoint checkpoint = play.checkpoint();
+            const LogDecoder::Checkpoint checkpoint = play.checkpoint();
             EXPECT_GT(checkpoint.bytes(), sizeof checkpoint);
             other.restore(checkpoint);
             ASSERT_EQ(other.itemsTaken(), i);
@@ -205,9 +205,9 @@ TEST_F(LogPlayTest, ARestoredPlayGoesOnFromAnyItemAsBefore)
     }
 }
 
-TEST_F(LogPlayTest, AnUnknownTechnologyIsRefused)
+TEST_F(LogDecoderTest, AnUnknownTechnologyIsRefused)
 {
-    EXPECT_THROW(LogPlay(sourceOf({}), "lte"), std::invalid_argument);
+    EXPECT_THROW(LogDecoder(sourceOf({}), "lte"), std::invalid_argument);
 }
 
 } // namespace

@@ -1,4 +1,4 @@
-#include "app/RecordingPlayer.h"
+#include "app/LogPlayer.h"
 
 #include "recordings/TypedTime.h"
 
@@ -32,38 +32,38 @@ LogTime timeOf(double seconds)
 
 } // namespace
 
-RecordingPlayer::RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
-                                 RecordingSettings settings, OnChange onChange)
+LogPlayer::LogPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
+                     RecordingSettings settings, OnChange onChange)
     : _queue(queue), _now(std::move(now)), _settings(std::move(settings)),
-      _onChange(std::move(onChange)), _reading(std::move(log), _settings.name, _settings.technology)
+      _onChange(std::move(onChange)), _log(std::move(log), _settings.name, _settings.technology)
 {
     readLater();
 }
 
-void RecordingPlayer::readLater()
+void LogPlayer::readLater()
 {
     _queue.async(_lifetime.whileAlive([this] { read(); }));
 }
 
-void RecordingPlayer::read()
+void LogPlayer::read()
 {
     if (failure() || isReady())
         return;
-    if (_reading.readSlice())
+    if (_log.readSlice())
         readLater();
     tellOrBegin();
 }
 
-void RecordingPlayer::stopReading()
+void LogPlayer::stopReading()
 {
     if (failure() || isReady())
         return;
-    _reading.stop();
+    _log.stopReading();
     tellOrBegin();
 }
 
 // Once the log has been read, it stands at the end of its first period.
-void RecordingPlayer::tellOrBegin()
+void LogPlayer::tellOrBegin()
 {
     if (isReady())
         moveTo(_settings.refreshPeriod);
@@ -71,73 +71,66 @@ void RecordingPlayer::tellOrBegin()
         tell();
 }
 
-NodePointer RecordingPlayer::topLevelNodes()
+NodePointer LogPlayer::topLevelNodes()
 {
     if (!_nodes && isReady())
-        _nodes = OrvaneModelNode::makeTreeFromObject(timeline()->display(), _nodesByPath);
+        _nodes = OrvaneModelNode::makeTreeFromObject(_log.display(), _nodesByPath);
     return _nodes;
 }
 
-NodePointer RecordingPlayer::nodeAtPath(const std::string& path)
+NodePointer LogPlayer::nodeAtPath(const std::string& path)
 {
     topLevelNodes();
     const auto found = _nodesByPath.find(path);
     return found == _nodesByPath.end() ? nullptr : found->second;
 }
 
-double RecordingPlayer::position() const
+double LogPlayer::position() const { return secondsOf(_log.position()); }
+
+double LogPlayer::duration() const { return secondsOf(_log.duration()); }
+
+std::string LogPlayer::positionText() const
 {
-    return timeline() ? secondsOf(timeline()->position()) : 0;
+    return isReady() ? _log.clock().text(_log.position()) : "";
 }
 
-double RecordingPlayer::duration() const
-{
-    return timeline() ? secondsOf(timeline()->duration()) : 0;
-}
+std::string LogPlayer::remark() const { return _log.remark(); }
 
-std::string RecordingPlayer::positionText() const
-{
-    return isReady() ? timeline()->clock().text(timeline()->position()) : "";
-}
+double LogPlayer::speed() const { return kSpeeds[_speed]; }
 
-std::string RecordingPlayer::remark() const { return timeline() ? timeline()->remark() : ""; }
-
-double RecordingPlayer::speed() const { return kSpeeds[_speed]; }
-
-void RecordingPlayer::play()
+void LogPlayer::play()
 {
     if (!isReady() || isPlaying())
         return;
-    if (timeline()->position() == timeline()->duration())
-        timeline()->moveTo(LogTime(0));
+    if (_log.position() == _log.duration())
+        _log.moveTo(LogTime(0));
     _playedTo = _now();
     startTimer();
     moved();
 }
 
-void RecordingPlayer::startTimer()
+void LogPlayer::startTimer()
 {
     const nanoseconds turn = std::max(_settings.refreshPeriod / kSpeeds[_speed], kShortestTurn);
     _timer = _queue.repeatingTimer(turn, [this] { goOn(); });
 }
 
 // As many whole refresh periods as have passed at this speed since the last time.
-void RecordingPlayer::goOn()
+void LogPlayer::goOn()
 {
     const nanoseconds perPeriod = _settings.refreshPeriod / kSpeeds[_speed];
     const auto periods = (_now() - _playedTo) / std::max(perPeriod, nanoseconds(1));
     if (periods <= 0)
         return;
     _playedTo += periods * perPeriod;
-    const LogTime left = timeline()->duration() - timeline()->position();
+    const LogTime left = _log.duration() - _log.position();
     const bool isEnd = periods >= left / _settings.refreshPeriod + 1;
-    moveTo(isEnd ? timeline()->duration()
-                 : timeline()->position() + periods * _settings.refreshPeriod);
-    if (timeline()->position() == timeline()->duration())
+    moveTo(isEnd ? _log.duration() : _log.position() + periods * _settings.refreshPeriod);
+    if (_log.position() == _log.duration())
         pause();
 }
 
-void RecordingPlayer::pause()
+void LogPlayer::pause()
 {
     if (!isPlaying())
         return;
@@ -145,7 +138,7 @@ void RecordingPlayer::pause()
     tell();
 }
 
-void RecordingPlayer::faster()
+void LogPlayer::faster()
 {
     if (!isReady() || _speed + 1 >= std::size(kSpeeds))
         return;
@@ -155,7 +148,7 @@ void RecordingPlayer::faster()
     tell();
 }
 
-void RecordingPlayer::slower()
+void LogPlayer::slower()
 {
     if (!isReady() || _speed == 0)
         return;
@@ -165,66 +158,61 @@ void RecordingPlayer::slower()
     tell();
 }
 
-void RecordingPlayer::step()
+void LogPlayer::step()
 {
     if (!isReady())
         return;
     _timer.reset();
-    const LogTime left = timeline()->duration() - timeline()->position();
-    moveTo(timeline()->position() + std::min(left, LogTime(_settings.refreshPeriod)));
+    const LogTime left = _log.duration() - _log.position();
+    moveTo(_log.position() + std::min(left, LogTime(_settings.refreshPeriod)));
 }
 
-void RecordingPlayer::stepBack()
+void LogPlayer::stepBack()
 {
     if (!isReady())
         return;
     _timer.reset();
-    moveTo(timeline()->position() - _settings.refreshPeriod);
+    moveTo(_log.position() - _settings.refreshPeriod);
 }
 
-void RecordingPlayer::jumpTo(double position) { moveTo(timeOf(position)); }
+void LogPlayer::jumpTo(double position) { moveTo(timeOf(position)); }
 
-void RecordingPlayer::jumpToEnd()
-{
-    if (timeline())
-        moveTo(timeline()->duration());
-}
+void LogPlayer::jumpToEnd() { moveTo(_log.duration()); }
 
-void RecordingPlayer::jumpToNextServingCell()
+void LogPlayer::jumpToNextServingCell()
 {
     if (!isReady())
         return;
-    timeline()->moveToNextServingCell();
+    _log.moveToNextServingCell();
     moved();
 }
 
-bool RecordingPlayer::jumpToText(const std::string& text)
+bool LogPlayer::jumpToText(const std::string& text)
 {
     if (!isReady())
         return false;
-    const auto time =
-        typedTime(text, timeline()->clock(), timeline()->position(), timeline()->duration());
+    const auto time = typedTime(text, _log.clock(), _log.position(), _log.duration());
     if (time)
         moveTo(*time);
     return time.has_value();
 }
 
-void RecordingPlayer::moveTo(LogTime position)
+void LogPlayer::moveTo(LogTime position)
 {
     if (!isReady())
         return;
-    timeline()->moveTo(position);
+    _log.moveTo(position);
     moved();
 }
 
-void RecordingPlayer::moved()
+void LogPlayer::moved()
 {
     _nodes = nullptr;
     _nodesByPath.clear();
     tell();
 }
 
-void RecordingPlayer::tell() const
+void LogPlayer::tell() const
 {
     if (_onChange)
         _onChange();

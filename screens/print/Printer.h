@@ -13,16 +13,16 @@ namespace orvane
 // What a front end that prints shows: one output for every change of the status and for every
 // reload, a reload and the status that comes with it being one. Answers to commands are printed in
 // between. JSON and text differ in the forms only.
-class OutputPane
+class Printer
 {
 public:
     // Takes one finished output, newline included.
     using Write = std::function<void(std::string_view output)>;
 
-    explicit OutputPane(Write write) : _write(std::move(write)) {}
-    virtual ~OutputPane() = default;
-    OutputPane(const OutputPane&) = default;
-    OutputPane& operator=(const OutputPane&) = delete;
+    explicit Printer(Write write) : _write(std::move(write)) {}
+    virtual ~Printer() = default;
+    Printer(const Printer&) = default;
+    Printer& operator=(const Printer&) = delete;
 
     // Another tree, or none: printed with the status that comes next.
     void reloadWithNode(NodePointer node);

@@ -20,12 +20,12 @@ namespace orvane
 // The time is that of the latest item taken. It never goes back, and an item without a timestamp,
 // or with one that those of the next items contradict, has the time of the one before. What a
 // message makes a decoder throw costs that message only.
-class LogPlay
+class LogDecoder
 {
 public:
     // `technology` is a technology constant; throws std::invalid_argument for any other text.
-    LogPlay(std::shared_ptr<ByteSource> log, const std::string& technology);
-    ~LogPlay();
+    LogDecoder(std::shared_ptr<ByteSource> log, const std::string& technology);
+    ~LogDecoder();
 
     // Looks for the next item where that has not been found yet, and gives up for now after a
     // megabyte that holds none.

@@ -1,17 +1,17 @@
 #pragma once
 
-#include "screens/print/OutputPane.h"
+#include "screens/print/Printer.h"
 
 namespace orvane
 {
 
 // Prints one JSON object a line, members in a fixed order, without spaces between them.
-class JsonPane final : public OutputPane
+class JsonPrinter final : public Printer
 {
 public:
     // Each object of a simulated phone ends with "simulated":true.
-    JsonPane(Write write, bool isSimulated)
-        : OutputPane(std::move(write)), _isSimulated(isSimulated)
+    JsonPrinter(Write write, bool isSimulated)
+        : Printer(std::move(write)), _isSimulated(isSimulated)
     {
     }
 

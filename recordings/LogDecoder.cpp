@@ -1,4 +1,4 @@
-#include "recordings/LogPlay.h"
+#include "recordings/LogDecoder.h"
 
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
@@ -28,19 +28,19 @@ std::unique_ptr<LogGenerator> newGenerator(const std::string& technology)
 
 } // namespace
 
-LogPlay::LogPlay(std::shared_ptr<ByteSource> log, const std::string& technology)
+LogDecoder::LogDecoder(std::shared_ptr<ByteSource> log, const std::string& technology)
     : _place{DlfReader(std::move(log)), ServingCell(technology)},
       _generator(newGenerator(technology))
 {
 }
 
-LogPlay::~LogPlay()
+LogDecoder::~LogDecoder()
 {
     const Silence silence;
     _generator.reset();
 }
 
-void LogPlay::lookAhead()
+void LogDecoder::lookAhead()
 {
     if (_place.hasNext)
         return;
@@ -59,7 +59,7 @@ void LogPlay::lookAhead()
 }
 
 // Whether the next item's time counts. The first one that does sets the clock.
-bool LogPlay::believe(std::uint64_t timestamp)
+bool LogDecoder::believe(std::uint64_t timestamp)
 {
     if (_place.hasClock) {
         const bool isLeap = _place.clock.timeOf(timestamp) - _place.time > TimesAhead::kLongestStep;
@@ -72,7 +72,7 @@ bool LogPlay::believe(std::uint64_t timestamp)
     return true;
 }
 
-void LogPlay::takeNext()
+void LogDecoder::takeNext()
 {
     if (!_place.hasNext)
         return;
@@ -86,7 +86,7 @@ void LogPlay::takeNext()
         ++_place.servingCellChanges;
 }
 
-void LogPlay::decodeNext()
+void LogDecoder::decodeNext()
 {
     const Silence silence(_tellsErrors ? Silence::Of::AllButErrors : Silence::Of::Everything);
     try {
@@ -96,16 +96,19 @@ void LogPlay::decodeNext()
     }
 }
 
-const PropertyValue& LogPlay::display() const { return _state[kDisplayKey]; }
+const PropertyValue& LogDecoder::display() const { return _state[kDisplayKey]; }
 
-std::size_t LogPlay::Checkpoint::bytes() const
+std::size_t LogDecoder::Checkpoint::bytes() const
 {
     return sizeof *this + generator.bytes + place.nextMessage.size() + place.reader.bytesKept();
 }
 
-LogPlay::Checkpoint LogPlay::checkpoint() const { return {_place, _generator->checkpoint(_state)}; }
+LogDecoder::Checkpoint LogDecoder::checkpoint() const
+{
+    return {_place, _generator->checkpoint(_state)};
+}
 
-void LogPlay::restore(const Checkpoint& checkpoint)
+void LogDecoder::restore(const Checkpoint& checkpoint)
 {
     _place = checkpoint.place;
     _generator->restore(_state, checkpoint.generator);

@@ -1,4 +1,4 @@
-#include "app/RecordingPlayer.h"
+#include "app/LogPlayer.h"
 
 #include "platform/base/TelephonyConstants.h"
 
@@ -27,14 +27,14 @@ std::shared_ptr<ByteSource> everySecond(std::uint16_t seconds = 600)
     return builder.source();
 }
 
-class RecordingPlayerTest : public ::testing::Test
+class LogPlayerTest : public ::testing::Test
 {
 protected:
-    RecordingPlayerTest() { services.useShippedResources(); }
+    LogPlayerTest() { services.useShippedResources(); }
 
     void open(std::shared_ptr<ByteSource> log, RecordingSettings settings = {"a.dlf", {}})
     {
-        player = std::make_unique<RecordingPlayer>(
+        player = std::make_unique<LogPlayer>(
             queue, [this] { return queue.now(); }, std::move(log), std::move(settings),
             [this] { ++changes; });
     }
@@ -52,11 +52,11 @@ protected:
 
     TestServices services;
     ManualMainQueue queue;
-    std::unique_ptr<RecordingPlayer> player;
+    std::unique_ptr<LogPlayer> player;
     int changes = 0;
 };
 
-TEST_F(RecordingPlayerTest, ALogIsReadInTurnsOfTheQueueAndThenShowsItsFirstPeriod)
+TEST_F(LogPlayerTest, ALogIsReadInTurnsOfTheQueueAndThenShowsItsFirstPeriod)
 {
     open(recordedLog("lte-drive.dlf"));
     EXPECT_EQ(changes, 0);
@@ -79,7 +79,7 @@ TEST_F(RecordingPlayerTest, ALogIsReadInTurnsOfTheQueueAndThenShowsItsFirstPerio
                           *player->nodeAtPath("/Serving Cell Info/Cell Identity")->value()));
 }
 
-TEST_F(RecordingPlayerTest, ProgressGoesOnWhileALongLogIsRead)
+TEST_F(LogPlayerTest, ProgressGoesOnWhileALongLogIsRead)
 {
     LogBuilder builder;
     for (std::uint64_t i = 0; i < 20'000; ++i)
@@ -100,7 +100,7 @@ TEST_F(RecordingPlayerTest, ProgressGoesOnWhileALongLogIsRead)
     EXPECT_EQ(progress.back(), 1);
 }
 
-TEST_F(RecordingPlayerTest, PlayingGoesOnByRefreshPeriods)
+TEST_F(LogPlayerTest, PlayingGoesOnByRefreshPeriods)
 {
     openAndRead(everySecond());
     EXPECT_EQ(channel(), "1"); // of seconds 0 and 1
@@ -117,7 +117,7 @@ TEST_F(RecordingPlayerTest, PlayingGoesOnByRefreshPeriods)
     EXPECT_EQ(channel(), "23");
 }
 
-TEST_F(RecordingPlayerTest, PausingStopsItWhereItIs)
+TEST_F(LogPlayerTest, PausingStopsItWhereItIs)
 {
     openAndRead(everySecond());
     player->play();
@@ -133,7 +133,7 @@ TEST_F(RecordingPlayerTest, PausingStopsItWhereItIs)
     EXPECT_EQ(player->position(), 10);
 }
 
-TEST_F(RecordingPlayerTest, SpeedsAreFromOneToAThousand)
+TEST_F(LogPlayerTest, SpeedsAreFromOneToAThousand)
 {
     openAndRead(everySecond());
     std::vector<double> speeds = {player->speed()};
@@ -148,7 +148,7 @@ TEST_F(RecordingPlayerTest, SpeedsAreFromOneToAThousand)
     EXPECT_EQ(player->speed(), 1);
 }
 
-TEST_F(RecordingPlayerTest, FasterPlayingShowsTheSamePeriods)
+TEST_F(LogPlayerTest, FasterPlayingShowsTheSamePeriods)
 {
     openAndRead(everySecond());
     player->play();
@@ -164,7 +164,7 @@ TEST_F(RecordingPlayerTest, FasterPlayingShowsTheSamePeriods)
     EXPECT_EQ(channel(), std::to_string(static_cast<int>(player->position()) - 1));
 }
 
-TEST_F(RecordingPlayerTest, PlayingEndsAtTheEndAndThenStartsOver)
+TEST_F(LogPlayerTest, PlayingEndsAtTheEndAndThenStartsOver)
 {
     openAndRead(everySecond(7));
     player->play();
@@ -179,7 +179,7 @@ TEST_F(RecordingPlayerTest, PlayingEndsAtTheEndAndThenStartsOver)
     EXPECT_EQ(channel(), "1");
 }
 
-TEST_F(RecordingPlayerTest, StepsAreOneRefreshPeriodAndPause)
+TEST_F(LogPlayerTest, StepsAreOneRefreshPeriodAndPause)
 {
     openAndRead(everySecond());
     player->play();
@@ -200,7 +200,7 @@ TEST_F(RecordingPlayerTest, StepsAreOneRefreshPeriodAndPause)
     EXPECT_EQ(player->position(), 600);
 }
 
-TEST_F(RecordingPlayerTest, JumpsGoAnywhere)
+TEST_F(LogPlayerTest, JumpsGoAnywhere)
 {
     openAndRead(everySecond());
     player->jumpTo(100.5);
@@ -224,7 +224,7 @@ TEST_F(RecordingPlayerTest, JumpsGoAnywhere)
     EXPECT_EQ(changes, 0);
 }
 
-TEST_F(RecordingPlayerTest, JumpsDoNotStopIt)
+TEST_F(LogPlayerTest, JumpsDoNotStopIt)
 {
     openAndRead(everySecond());
     player->play();
@@ -234,7 +234,7 @@ TEST_F(RecordingPlayerTest, JumpsDoNotStopIt)
     EXPECT_EQ(player->position(), 302);
 }
 
-TEST_F(RecordingPlayerTest, TheNextServingCellIsFound)
+TEST_F(LogPlayerTest, TheNextServingCellIsFound)
 {
     openAndRead(LogBuilder()
                     .servingCell(kLogStart, 1)
@@ -253,7 +253,7 @@ TEST_F(RecordingPlayerTest, TheNextServingCellIsFound)
     EXPECT_EQ(player->position(), 30);
 }
 
-TEST_F(RecordingPlayerTest, EveryChangeIsTold)
+TEST_F(LogPlayerTest, EveryChangeIsTold)
 {
     openAndRead(everySecond());
     const auto told = [this](const auto& action) {
@@ -273,7 +273,7 @@ TEST_F(RecordingPlayerTest, EveryChangeIsTold)
     EXPECT_TRUE(told([this] { player->jumpToNextServingCell(); }));
 }
 
-TEST_F(RecordingPlayerTest, ReadingCanBeStopped)
+TEST_F(LogPlayerTest, ReadingCanBeStopped)
 {
     open(everySecond(), {"a.dlf", kLte});
     player->stopReading();
@@ -293,7 +293,7 @@ TEST_F(RecordingPlayerTest, ReadingCanBeStopped)
     EXPECT_EQ(channel(), "1");
 }
 
-TEST_F(RecordingPlayerTest, ReadingCanBeStoppedWhileTheTechnologyIsSought)
+TEST_F(LogPlayerTest, ReadingCanBeStoppedWhileTheTechnologyIsSought)
 {
     LogBuilder builder;
     for (std::uint16_t i = 0; i < 3000; ++i)
@@ -307,7 +307,7 @@ TEST_F(RecordingPlayerTest, ReadingCanBeStoppedWhileTheTechnologyIsSought)
     EXPECT_EQ(player->duration(), 999);
 }
 
-TEST_F(RecordingPlayerTest, NothingPlaysBeforeTheLogHasBeenRead)
+TEST_F(LogPlayerTest, NothingPlaysBeforeTheLogHasBeenRead)
 {
     open(everySecond());
     player->play();
@@ -321,7 +321,7 @@ TEST_F(RecordingPlayerTest, NothingPlaysBeforeTheLogHasBeenRead)
     EXPECT_EQ(player->position(), 0);
 }
 
-TEST_F(RecordingPlayerTest, ALogThatFitsNoTechnologySaysWhatToDo)
+TEST_F(LogPlayerTest, ALogThatFitsNoTechnologySaysWhatToDo)
 {
     open(LogBuilder().item(0x1234, kLogStart, {}).item(0x1235, kLogStart, {}).source());
     queue.runPending();
@@ -340,7 +340,7 @@ TEST_F(RecordingPlayerTest, ALogThatFitsNoTechnologySaysWhatToDo)
     EXPECT_TRUE(player->isReady());
 }
 
-TEST_F(RecordingPlayerTest, AFileThatIsNoLogSaysSo)
+TEST_F(LogPlayerTest, AFileThatIsNoLogSaysSo)
 {
     open(sourceOf(Bytes(5000, 0)));
     queue.runPending();
@@ -348,7 +348,7 @@ TEST_F(RecordingPlayerTest, AFileThatIsNoLogSaysSo)
                 HasSubstr("is neither a diagnostic log (.dlf) nor a snapshot (.orvane)"));
 }
 
-TEST_F(RecordingPlayerTest, APlayerThatGoesLeavesNothingBehindInTheQueue)
+TEST_F(LogPlayerTest, APlayerThatGoesLeavesNothingBehindInTheQueue)
 {
     open(everySecond());
     player.reset();

@@ -2,8 +2,8 @@
 
 #include "platform/services/Lifetime.h"
 #include "platform/services/MainQueue.h"
-#include "recordings/LogReading.h"
 #include "recordings/RecordingSettings.h"
+#include "recordings/SeekableLog.h"
 #include "screens/toolkit/Playback.h"
 #include "ui/tree/OrvaneModelNode.h"
 
@@ -16,32 +16,32 @@
 namespace orvane
 {
 
-// Plays a diagnostic log as if it were a live view that refreshes every refresh period, from the
-// queue of the main thread. First the log is read, a slice a turn of the queue; then it stands at
-// the end of its first period. While it plays, it goes on by whole refresh periods of the
-// recording, at a higher speed several at once.
-class RecordingPlayer final : public Playback
+// Plays a diagnostic log as if it were a live view that refreshes every refresh period. First the
+// log is read, a slice in each turn of the main queue; then the position is the end of its first
+// period. While it plays, the position moves by whole refresh periods of the recording, at a higher
+// speed by several at once.
+class LogPlayer final : public Playback
 {
 public:
-    // Time that goes on steadily, from any start.
+    // A steady clock, from any start.
     using Now = std::function<std::chrono::nanoseconds()>;
     // Something that is asked for here has changed. Never called by the constructor.
     using OnChange = std::function<void()>;
 
     // The queue must outlive the player.
-    RecordingPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
-                    RecordingSettings settings, OnChange onChange);
+    LogPlayer(MainQueue& queue, Now now, std::shared_ptr<ByteSource> log,
+              RecordingSettings settings, OnChange onChange);
 
     // One line that says why the log cannot be played, and what to do. Reading has ended then.
-    [[nodiscard]] const std::optional<std::string>& failure() const { return _reading.failure(); }
-    [[nodiscard]] bool isReady() const { return _reading.isRead(); }
+    [[nodiscard]] const std::optional<std::string>& failure() const { return _log.failure(); }
+    [[nodiscard]] bool isReady() const { return _log.isRead(); }
 
     // The display at the position, as a live view's: null before the log has been read.
     NodePointer topLevelNodes();
     // The node under that path or null.
     NodePointer nodeAtPath(const std::string& path);
 
-    [[nodiscard]] double progress() const override { return _reading.progress(); }
+    [[nodiscard]] double progress() const override { return _log.progress(); }
     void stopReading() override;
     [[nodiscard]] double position() const override;
     [[nodiscard]] double duration() const override;
@@ -64,8 +64,6 @@ private:
     void readLater();
     void read();
     void tellOrBegin();
-    // Null until the technology is known.
-    [[nodiscard]] LogTimeline* timeline() const { return _reading.timeline(); }
     void startTimer();
     void goOn();
     void moveTo(LogTime position);
@@ -76,7 +74,7 @@ private:
     Now _now;
     RecordingSettings _settings;
     OnChange _onChange;
-    LogReading _reading;
+    SeekableLog _log;
     NodePointer _nodes;
     PathDictionary _nodesByPath;
     std::unique_ptr<Timer> _timer; // while playing

@@ -1,4 +1,4 @@
-#include "screens/print/JsonPane.h"
+#include "screens/print/JsonPrinter.h"
 
 #include "platform/base/JsonText.h"
 
@@ -31,13 +31,13 @@ void appendJsonNode(std::string& to, const OrvaneModelNode* node)
     to += '}';
 }
 
-std::string JsonPane::line(std::string members) const
+std::string JsonPrinter::line(std::string members) const
 {
     return "{" + std::move(members) + (_isSimulated ? ",\"simulated\":true}\n" : "}\n");
 }
 
-std::string JsonPane::statusOutput(const std::string& status, bool isLoading,
-                                   const OrvaneModelNode* tree) const
+std::string JsonPrinter::statusOutput(const std::string& status, bool isLoading,
+                                      const OrvaneModelNode* tree) const
 {
     std::string members = "\"status\":";
     appendJsonString(members, status);
@@ -51,14 +51,14 @@ std::string JsonPane::statusOutput(const std::string& status, bool isLoading,
     return line(std::move(members));
 }
 
-std::string JsonPane::savedOutput(const std::string& path) const
+std::string JsonPrinter::savedOutput(const std::string& path) const
 {
     std::string members = "\"saved\":";
     appendJsonString(members, path);
     return line(std::move(members));
 }
 
-std::string JsonPane::alertOutput(const std::string& title, const std::string& message) const
+std::string JsonPrinter::alertOutput(const std::string& title, const std::string& message) const
 {
     std::string members = "\"alert\":";
     appendJsonString(members, title);
@@ -67,7 +67,7 @@ std::string JsonPane::alertOutput(const std::string& title, const std::string& m
     return line(std::move(members));
 }
 
-std::string JsonPane::errorOutput(const std::string& text) const
+std::string JsonPrinter::errorOutput(const std::string& text) const
 {
     std::string members = "\"error\":";
     appendJsonString(members, text);
