@@ -7,7 +7,7 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/services/FileSystem.h"
-#include "screens/print/TextPane.h"
+#include "screens/print/TextPrinter.h"
 #include "support/Recording.h"
 #include "telephonyd/StartCommand.h"
 #include "telephonyd/TypedMessages.h"
@@ -38,7 +38,7 @@ std::string printed(const PropertyValue& display)
 {
     PathDictionary paths;
     std::string text;
-    TextPane pane([&text](std::string_view output) { text += output; }, false);
+    TextPrinter pane([&text](std::string_view output) { text += output; }, false);
     pane.reloadWithNode(OrvaneModelNode::makeTreeFromObject(display, paths));
     pane.setStatus("Updated", false);
     return text;
