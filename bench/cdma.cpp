@@ -15,7 +15,7 @@ namespace
 
 using namespace orvane;
 
-// A message of the code, zero but for what is put.
+// A message of the code, with zeros where nothing is put.
 class Message
 {
 public:
@@ -73,7 +73,7 @@ void fingers(benchmark::State& state)
     decode<C2KLogGenerator>(state, message.bytes());
 }
 
-// 255 pilots, a row each, behind a system state and a radio that say little.
+// 255 pilots, a row each, after a short system state and a short radio subpacket.
 void status(benchmark::State& state)
 {
     constexpr unsigned kActiveSet = 39;

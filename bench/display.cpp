@@ -1,4 +1,4 @@
-// From a display to its tree and to a line of JSON: what every refresh costs.
+// The cost of a refresh: from a display to its tree and to a line of JSON.
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/StateKeys.h"

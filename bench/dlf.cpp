@@ -1,4 +1,4 @@
-// Diagnostic logs: reading 10 MB, plain, as exported, and damaged here and there; exporting the
+// Diagnostic logs: reading 10 MB (plain, as exported, and damaged in places), and exporting the
 // history of a busy channel.
 
 #include "LogGenerator/StateKeys.h"

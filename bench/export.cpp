@@ -1,5 +1,4 @@
-// Recordings on the way out: exporting rows of an LTE drive, two of them and all, and recording a
-// busy channel to disk.
+// Exporting rows of an LTE drive (two of them, and all), and recording a busy channel to disk.
 
 #include "dlf/DlfReader.h"
 #include "dlf/DlfTime.h"
@@ -31,7 +30,7 @@ std::string temporaryFile(const char* name)
            ("orvane-bench-" + std::to_string(getpid()) + name);
 }
 
-// The drive over and over, an hour later each time.
+// The drive repeated, each round an hour later.
 class LongDrive
 {
 public:
@@ -92,7 +91,7 @@ void exportTwoRowsAsCsv(benchmark::State& state)
 void exportAllRowsAsCsv(benchmark::State& state) { exportRows<CsvRowWriter>(state, {}); }
 void exportAllRowsAsJson(benchmark::State& state) { exportRows<JsonRowWriter>(state, {}); }
 
-// Does nothing: what is measured is each message's own cost.
+// Does nothing, so that only the cost of each message is measured.
 class RestingQueue final : public MainQueue
 {
 public:

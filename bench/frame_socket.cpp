@@ -1,5 +1,5 @@
-// Frames over a real socket between two processes: how many small ones a second, how fast large
-// ones, and how long a request waits for its answer.
+// Frames over a real socket between two processes: small ones a second, bytes of large ones a
+// second, and the time from a request to its answer.
 
 #include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
@@ -26,7 +26,7 @@ constexpr const char* kPortName = "Sender";
 constexpr std::size_t kQueueLimit = 256U * 1024;
 constexpr std::size_t kSmallFrame = 60;
 
-// How the sender is asked to send, as message id; the serial says how many frames.
+// The message id tells the sender how to send, the serial how many frames.
 enum Request : std::int32_t { Burst = 1, OneATurn = 2, Large = 3, Echo = 4 };
 
 // The other process: sends as it is asked to.
@@ -83,7 +83,7 @@ private:
     Bytes _large = Bytes(1024 * 1024, 0x5a);
 };
 
-// Starts the other process, which must be before this one makes its first Qt object.
+// Starts the other process. This must come before the first Qt object of this one.
 class SenderProcess
 {
 public:

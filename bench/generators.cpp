@@ -31,7 +31,7 @@ std::vector<Bytes> recordedMessages(const char* path)
     return messages;
 }
 
-// A message of the code, all ones behind it.
+// A message of the code whose payload bits are all 1.
 Bytes largestMessage(std::uint16_t logCode, std::size_t bytes)
 {
     Bytes message(bytes, 0xFF);

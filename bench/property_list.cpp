@@ -1,4 +1,4 @@
-// What a message with a cell array costs to read, in both formats, and a list to write.
+// The cost of reading a message with a cell array, in both formats, and of writing a list.
 
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
@@ -37,8 +37,8 @@ PropertyValue cellArray()
     return cells;
 }
 
-// A binary list of dictionaries of integers and strings, each key and each string one object, as
-// writers of that format make it. All object indexes and offsets have two bytes.
+// A binary list of dictionaries of integers and strings. Equal keys and strings share one object,
+// as in lists of common writers. All object indexes and offsets have two bytes.
 class BinaryWriter
 {
 public:

@@ -1,6 +1,6 @@
-// Recordings: reading a long log, going through it by refresh periods, and moving about in it. The
-// log is the LTE drive again and again, each round later than the one before, 10 MB in all or as
-// many as ORVANE_BENCH_MEGABYTES says.
+// Recordings: reading a long log, playing it by refresh periods, and jumping in it. The log is the
+// LTE drive repeated, each round later than the one before: 10 MB, or as many as
+// ORVANE_BENCH_MEGABYTES says.
 
 #include "LogGenerator/LogTechnology.h"
 #include "dlf/FileWindow.h"
@@ -36,7 +36,7 @@ std::size_t wantedBytes()
     return (megabytes ? std::strtoul(megabytes, nullptr, 10) : 10) * 1'000'000;
 }
 
-// The long log in a file that goes with the program.
+// The long log in a file that is removed at the program's end.
 class LongDrive
 {
 public:
@@ -70,7 +70,7 @@ public:
     static std::shared_ptr<FileWindow> open()
     {
         static const LongDrive drive;
-        // Without their log and console, sections tell nothing.
+        // Without a log and a console, sections write nothing.
         static NullLog log;
         static DirectoryResources resources(ORVANE_RESOURCES);
         Services::current().setLog(&log);

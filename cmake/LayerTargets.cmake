@@ -1,11 +1,11 @@
-# Builds every layer and nothing else.
+# Builds every layer, but no program and no test.
 add_custom_target(layers)
 
 # Makes a layer: a static library orvane_NAME of the sources below FOLDER, without the folders of
 # other layers, of app/program/ and of the programs' main.cpp.
 #
-# A layer sees the headers of the layers behind USES, and of those that they use, and no others: each
-# has an include directory of its own that holds nothing but a link to its folder. tests/layers makes
+# A layer sees only the headers of the layers after USES and of those that they use: each layer has
+# an include directory of its own, which holds only a link to its folder. tests/layers makes
 # its cases from the properties ORVANE_LAYERS, ORVANE_FOLDER_<name> and ORVANE_SEES_<name>.
 function(orvane_layer name)
   cmake_parse_arguments(LAYER "" "FOLDER" "USES" ${ARGN})

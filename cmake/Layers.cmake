@@ -1,5 +1,5 @@
-# The layers, lowest first: what each may include is what stands behind USES, and what those use in
-# turn. docs/architecture.md says what each is for.
+# The layers, lowest first. Each may include the layers after USES, and those that they use in turn.
+# docs/architecture.md says what each is for.
 include(cmake/LayerTargets.cmake)
 
 orvane_layer(base FOLDER platform/base)

@@ -10,7 +10,7 @@ target_compile_options(
             -Wnon-virtual-dtor
             -Woverloaded-virtual
             $<$<BOOL:${ORVANE_WARNINGS_AS_ERRORS}>:-Werror>
-            # g++ 12 takes "text" + std::string for overlapping copies when it optimises fully.
+            # With full optimisation g++ 12 warns of overlapping copies in "text" + std::string.
             $<$<AND:$<CONFIG:Release>,$<CXX_COMPILER_ID:GNU>>:-Wno-restrict>)
 
 if(ORVANE_SANITIZERS)

@@ -19,11 +19,11 @@ public:
     void write(LogPriority, std::string_view) override {}
 };
 
-// What the generators' targets do with their input: it is a sequence of messages, each behind its
-// length in two bytes, little-endian; a length beyond the input's end stands for the rest. They are
-// played through a new generator with the templates that the program ships, as a channel's messages
-// are: what one throws ends that message only. At the end the display is made twice, since a
-// generator may have none to show the first time, and read through.
+// Runs the input of a generator's target: a sequence of messages, each after its length in two
+// bytes, little-endian. A length beyond the input's end stands for the rest. The messages are
+// played through a new generator with the shipped templates, as those of a channel are: an
+// exception ends that message only. At the end the display is made twice, since a generator may
+// have none the first time, and all of it is read.
 template <typename Generator>
 int playMessages(const std::uint8_t* data, std::size_t size)
 {

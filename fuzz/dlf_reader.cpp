@@ -1,4 +1,4 @@
-// Any file: items lie inside of it, one after the other, and every byte is accounted for.
+// Any file. Items lie inside it, one after the other, and every byte is counted.
 
 #include "dlf/DlfReader.h"
 #include "dlf/DlfTime.h"

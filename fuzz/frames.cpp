@@ -1,5 +1,4 @@
-// Frames out of an arbitrary stream in arbitrary pieces: the same as out of the stream in one
-// piece.
+// A stream in arbitrary pieces gives the same frames as the stream in one piece.
 //
 // The input's first byte is the number of piece lengths that follow it, one byte each; they are
 // used in turn, again and again. The rest is the stream.
@@ -65,7 +64,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const Parsed whole = parse(stream, {});
     if (parse(stream, pieces) != whole)
         std::abort();
-    // What was read and written again reads as the same.
+    // Frames that are written again read as the same frames.
     const Parsed again = parse(whole.frames, pieces);
     if (again.frames != whole.frames || again.count != whole.count || again.failed)
         std::abort();

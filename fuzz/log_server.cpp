@@ -1,5 +1,5 @@
-// Clients of a telephony server that send anything: requests, commands and bytes that are neither,
-// to the server's port and to a channel's.
+// Clients of a telephony server that send requests, commands and other bytes to the server's port
+// and to the port of a channel.
 
 #include "doubles/LoopbackTransport.h"
 #include "platform/base/PropertyValue.h"

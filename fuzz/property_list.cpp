@@ -1,4 +1,5 @@
-// Both formats of property lists. What reads must survive being written and read again.
+// Both formats of property lists. A list that can be read stays the same when it is written and
+// read again.
 
 #include "platform/base/PropertyValue.h"
 #include "platform/base/Utf8.h"
@@ -28,8 +29,8 @@ bool isXmlText(std::string_view text)
            text.find("\xEF\xBF\xBF") == std::string_view::npos;
 }
 
-// Drops the fractions of dates and the signs of not-a-numbers, which XML has not, and tells whether
-// XML can carry the rest.
+// Drops the fractions of dates and the signs of not-a-numbers, which XML does not have. Returns
+// whether XML can hold the rest.
 bool makeWritable(PropertyValue& value)
 {
     bool isWritable = true;

@@ -1,4 +1,4 @@
-// Any property list: what a snapshot file holds is shown as a tree, and its logs are played.
+// Any property list as a snapshot file: it is shown as a tree, and its logs are played.
 
 #include "LogGenerator/LogTechnology.h"
 #include "platform/base/PropertyValue.h"
@@ -22,7 +22,7 @@ void require(bool holds)
         std::abort();
 }
 
-// Every node is found; a row has a value and a group has not.
+// Every node is found. A row has a value, a group has none.
 std::size_t walk(const SnapshotTree& tree, const OrvaneModelNode& node)
 {
     std::size_t nodes = 1;

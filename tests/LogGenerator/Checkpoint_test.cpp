@@ -23,7 +23,7 @@ struct Viewer {
         : generator(LogGenerator::generatorFromTechnology(technology))
     {
     }
-    // What is shown after the message; what decoders throw ends it only.
+    // The display after the message. An exception of a decoder ends that message only.
     std::string after(const Bytes& message)
     {
         try {
@@ -62,7 +62,7 @@ class CheckpointTest : public ::testing::TestWithParam<Case>
 protected:
     CheckpointTest() { services.useShippedResources(); }
 
-    // The recording, with items of the server in it here and there.
+    // The recording with some items of the server inserted.
     static std::vector<Bytes> messages()
     {
         std::vector<Bytes> all = recordedMessages(GetParam().recording);
@@ -81,7 +81,7 @@ protected:
     }
 
     TestServices services;
-    const Silence silence; // the decoders' lines would only cost time
+    const Silence silence; // the decoders' log lines only cost time
 };
 
 TEST_P(CheckpointTest, ARestoredGeneratorGoesOnFromAnyItem)
@@ -97,7 +97,7 @@ TEST_P(CheckpointTest, ARestoredGeneratorGoesOnFromAnyItem)
     }
     ASSERT_NE(shown.front(), shown.back());
 
-    // Backwards, so that what the other generator has in it is always wrong.
+    // Backwards, so that the other generator's own state is always the wrong one.
     Viewer other(GetParam().technology);
     for (std::size_t start = all.size(); start-- > 0;) {
         other.restore(checkpoints[start]);
@@ -215,7 +215,7 @@ TEST(EmptyCheckpointTest, AGeneratorRestoredToItsBeginningBuildsItsDisplayAnew)
 
 TEST(EmptyCheckpointTest, AGeneratorWithoutATemplateCanBeRestored)
 {
-    TestServices services; // UTRAN's template is not there
+    TestServices services; // UTRAN's template is missing
     Viewer viewer(kTSLogChannelTechnology_Varnel_UTRAN2);
     viewer.restore(viewer.checkpoint());
     EXPECT_EQ(viewer.after(Bytes(13, 1)), PropertyValue().description());

@@ -1,5 +1,5 @@
-// Plays recordings through their generators. What is expected was decoded from the recordings by
-// other means than the sections.
+// Plays recordings through their generators. The expected values were decoded from the recordings
+// without the sections.
 
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/StateKeys.h"
@@ -125,7 +125,7 @@ TEST_F(RecordingsTest, ADriveThroughLte)
               "({Candidate Priority = 5; Candidate RAT Type = LTE; E ARFCN = 1300; Cell ID = 270}, "
               "{Candidate Priority = 1300; Candidate RAT Type = ??})");
 
-    // Each of the packets about antennas is reported, nothing else is.
+    // Each packet about antennas is reported, and nothing else.
     EXPECT_EQ(services.log.errors(),
               std::vector<std::string>(24, "Received an unknown log message: 45249"));
 }

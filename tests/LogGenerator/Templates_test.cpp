@@ -1,4 +1,4 @@
-// Holds every class index against the template that the program ships for it.
+// Compares every class index with the template that the program ships for it.
 
 #include "LogGenerator/DictionaryResource.h"
 #include "LogGenerator/GSM/VRN_GSMClassIndex.h"

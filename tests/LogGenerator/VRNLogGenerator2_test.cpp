@@ -48,7 +48,7 @@ protected:
         const Bytes exact(message.begin(), message.end());
         generator->updateState(state, exact);
     }
-    // What has been gathered, which this moves into the state.
+    // The messages gathered so far. Moves them into the state.
     Bytes gathered()
     {
         generator->generateLogUsingState(state);
@@ -154,7 +154,7 @@ TEST_F(VRNLogGenerator2Test, TheServersItemsHaveExtendedCodes)
     ASSERT_EQ(lamp->calls.size(), 1U);
     EXPECT_EQ(lamp->calls[0].logCode, 16711682U);
     EXPECT_THAT(doors->calls, IsEmpty());
-    // The modem's code of that number is another one.
+    // The modem's code with that number is a different code.
     send(PacketBuilder(2, 13));
     EXPECT_EQ(lamp->calls.size(), 1U);
 }

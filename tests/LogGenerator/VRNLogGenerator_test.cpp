@@ -47,7 +47,7 @@ protected:
             snapshot.asDictionary()->set(kDisplayStateKey, displayState);
         state[kHistoryKey].asArray()->append(snapshot);
     }
-    // What stands behind the version report.
+    // The bytes after the version report.
     [[nodiscard]] Bytes items() const
     {
         const auto dlf = VRNLogGenerator::generateDlfFromState(state);

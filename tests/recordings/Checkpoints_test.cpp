@@ -21,7 +21,7 @@ class CheckpointsTest : public ::testing::Test
 protected:
     CheckpointsTest() { services.useShippedResources(); }
 
-    // Plays all, passing every item by.
+    // Plays all items and offers each of them for a checkpoint.
     void pass(const std::shared_ptr<ByteSource>& log)
     {
         LogDecoder play(log, kLte);
@@ -49,7 +49,7 @@ TEST_F(CheckpointsTest, TheirNumberIsBoundedHoweverLongTheLogIs)
     EXPECT_LE(checkpoints.size(), Checkpoints::kMost);
     EXPECT_GT(checkpoints.size(), Checkpoints::kMost / 2 - 1);
     EXPECT_EQ(checkpoints.spacing(), 2048U);
-    // None is further from the next than the spacing.
+    // No gap between two of them is wider than the spacing.
     for (LogTime time = 0ns; time < 300s; time += 1s) {
         const auto* before = checkpoints.before(time);
         ASSERT_TRUE(before);

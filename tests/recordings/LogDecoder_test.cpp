@@ -107,7 +107,7 @@ TEST_F(LogDecoderTest, NothingIsShownBeforeTheFirstItem)
     EXPECT_FALSE(play.display());
     EXPECT_FALSE(play.hasNext());
     EXPECT_FALSE(play.isAtEnd());
-    play.takeNext(); // none was found yet
+    play.takeNext(); // no item was found yet
     EXPECT_EQ(play.itemsTaken(), 0U);
     takeAll(play);
     EXPECT_TRUE(play.display());
@@ -128,10 +128,10 @@ TEST_F(LogDecoderTest, AMessageThatMakesADecoderThrowCostsThatMessageOnly)
     LogBuilder builder;
     builder.measurement(kLogStart, 1);
     builder.bytes.push_back(0xFF);                      // made by the server:
-    builder.item(1, kLogStart + kLogStep, Bytes(5, 1)); // a cell array that is none
+    builder.item(1, kLogStart + kLogStep, Bytes(5, 1)); // not a cell array
     builder.measurement(kLogStart + 2 * kLogStep, 2);
     builder.bytes.push_back(0xFF);
-    builder.item(2, kLogStart + 3 * kLogStep, Bytes(5, 1)); // data connections that are none
+    builder.item(2, kLogStart + 3 * kLogStep, Bytes(5, 1)); // not a list of data connections
     builder.measurement(kLogStart + 4 * kLogStep, 3);
     LogDecoder play(builder.source(), kTSLogChannelTechnology_IFX);
     play.setTellsErrors(true);

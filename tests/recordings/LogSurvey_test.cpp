@@ -57,7 +57,7 @@ TEST_F(LogSurveyTest, ALogIsReadInSlices)
 
 TEST_F(LogSurveyTest, FilesOfForeignBytesAreNoLogs)
 {
-    // Among them, by chance, is something that could be an item of LTE.
+    // By chance some of these bytes look like an item of LTE.
     LogBuilder builder;
     builder.foreign(50);
     builder.bytes.insert(builder.bytes.end(), 5000, 0x20);
@@ -72,7 +72,7 @@ TEST_F(LogSurveyTest, FilesOfForeignBytesAreNoLogs)
     EXPECT_FALSE(read(sourceOf({})).technology());
 }
 
-// Nearly all of it is placed: any two bytes are a length that fits.
+// Nearly all of it can be read as items: any two bytes are a possible length.
 TEST_F(LogSurveyTest, RandomBytesAreNoLogs)
 {
     std::mt19937 random(1);
@@ -102,7 +102,7 @@ TEST_F(LogSurveyTest, TextsAndProgramsAreNoLogs)
     EXPECT_FALSE(program.technology());
     EXPECT_THAT(program.complaint("x"), HasSubstr("is neither a diagnostic log"));
 
-    // As a program's tables are: addresses and small numbers.
+    // Like a program's tables: addresses and small numbers.
     Bytes table;
     for (std::uint64_t row = 0; row < 30'000; ++row)
         for (const std::uint64_t number : {0x401000 + row * 24, row % 97})

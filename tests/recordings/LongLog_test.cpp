@@ -1,4 +1,4 @@
-// A log of 100 MB: nothing may grow with it.
+// A log of 100 MB. Memory must not grow with its size.
 
 #include "dlf/FileWindow.h"
 #include "platform/base/PropertyValue.h"
@@ -36,7 +36,8 @@ long residentBytes()
     return pages * sysconf(_SC_PAGESIZE);
 }
 
-// Each second a measurement, whose channel is the second, and a long item that nobody decodes.
+// For each second a measurement, whose channel is the number of the second, and a long item that
+// no decoder takes.
 class LongLogTest : public ::testing::Test
 {
 protected:

@@ -36,7 +36,7 @@ protected:
     RecordingExportTest() { services.useShippedResources(); }
 
     void write(const Bytes& content) { ASSERT_TRUE(writeFile(request.file, content)); }
-    // What is wrong, or "".
+    // The error, or "".
     std::string run(RowWriter& writer)
     {
         RecordingExport recordingExport(request, writer,
@@ -294,8 +294,8 @@ TEST_F(RecordingExportTest, EveryTruncationOfALogGivesTheLinesThatItHolds)
     for (std::size_t length = 0; length < start.size(); ++length) {
         write(Bytes(start.begin(), start.begin() + static_cast<std::ptrdiff_t>(length)));
         EXPECT_EQ(runJson(), "");
-        // Of the last period some items may be missing, and what is left of an item that was cut
-        // may happen to look like a shorter one.
+        // The last period may lack items, and the rest of an item that was cut off may look like a
+        // shorter item.
         EXPECT_TRUE(whole.starts_with(without(written, 2))) << length;
         most = std::max(most, std::count(written.begin(), written.end(), '\n'));
     }

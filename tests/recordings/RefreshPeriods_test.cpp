@@ -123,7 +123,7 @@ TEST_F(RefreshPeriodsTest, EveryTruncationShowsAllThatCanBePlaced)
         const auto found = channels(sourceOf(cut), 1s);
         const std::size_t whole = length / 76;
         const bool isCut = length % 76 != 0;
-        // What comes before an item that was cut short cannot be told from one itself.
+        // The bytes before an item that was cut off look like an item themselves.
         ASSERT_EQ(found.size(), isCut && whole > 0 ? whole - 1 : whole) << length;
         for (std::size_t i = 0; i < found.size(); ++i)
             ASSERT_EQ(found[i].second, std::to_string(i));

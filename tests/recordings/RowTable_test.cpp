@@ -34,7 +34,7 @@ std::vector<std::string> orderedPaths(const RowTable& table)
     return paths;
 }
 
-// What the rows show, absent ones as "-", changed ones with a "!".
+// The texts of the rows: "-" for an absent row, and "!" after a changed one.
 std::vector<std::string> shown(const RowTable& table)
 {
     std::vector<std::string> texts;

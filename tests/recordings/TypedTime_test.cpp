@@ -9,7 +9,7 @@ namespace
 
 using namespace std::chrono_literals;
 
-// From 2017-07-11 04:34:08 UTC on.
+// Begins at 2017-07-11 04:34:08 UTC.
 const LogClock kClock(std::uint64_t{1183782848} * 800 << 16);
 
 std::optional<LogTime> typed(const std::string& text, LogTime position = 0s,

@@ -201,7 +201,7 @@ TEST_F(LogServerTest, ASecondStartCommandChangesNothing)
     queue.runPending();
     EXPECT_THAT(sources[0]->selection->modemCodes, ElementsAre(1));
     EXPECT_EQ(sources.size(), 1U);
-    ASSERT_EQ(client->channelFrames.size(), 1U); // the reply that was wanted, without data
+    ASSERT_EQ(client->channelFrames.size(), 1U); // the reply that was asked for, without data
     EXPECT_THAT(client->channelFrames[0].data, IsEmpty());
     EXPECT_THAT(services.log.warnings(),
                 ElementsAre("TelephonyServer.Channel.1: ignoring a second start command"));
@@ -338,7 +338,7 @@ TEST_F(LogServerTest, ASourceLearnsThatItsClientIsBehindAndWhenItHasCaughtUp)
     EXPECT_TRUE(sources[0]->send(message));
     EXPECT_TRUE(sources[0]->send(message));
     EXPECT_TRUE(sources[0]->send(message));
-    EXPECT_FALSE(sources[0]->send(message)); // the headers make it more than that
+    EXPECT_FALSE(sources[0]->send(message)); // with its header it is too large
     queue.runPending();
     EXPECT_EQ(sources[0]->resumes, 0);
     transport.stopReading("client", LogChannel::kBehindBytes / 4); // a little is taken
@@ -431,7 +431,7 @@ TEST_F(LogServerTest, WhatWasPutOffIsDroppedWithTheServer)
     auto third = std::make_unique<LogServer>(transport, queue, [this] { return makeSource(); });
     EXPECT_FALSE(third->start());
     const auto client = streamingClient("client");
-    sources[0]->send(Bytes{1}); // puts the notification off
+    sources[0]->send(Bytes{1}); // queues the notification
     client->channel.reset();    // and soon the channel's end
     third.reset();
     queue.advance(1s);

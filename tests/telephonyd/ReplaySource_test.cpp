@@ -23,7 +23,7 @@ void put(Bytes& to, std::uint64_t value, unsigned width)
         to.push_back(static_cast<std::uint8_t>(value >> 8 * i & 0xFF));
 }
 
-// An item whose payload is one byte, by which a test knows it again.
+// An item whose payload is one byte, by which a test recognises it.
 Bytes item(std::uint16_t code, std::uint64_t timestamp, std::uint8_t mark)
 {
     Bytes bytes;

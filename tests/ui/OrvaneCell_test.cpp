@@ -11,7 +11,7 @@ namespace
 {
 
 // Bold characters are 9 points wide and a line of size 15 is 18 points high. A row without an
-// accessory keeps 10 points free at its right: content of 310 points in a row of 320.
+// accessory keeps 10 points free at its right: 310 points of content in a row of 320.
 class OrvaneCellTest : public ::testing::Test
 {
 protected:

@@ -169,7 +169,7 @@ TEST_F(OneXPacketsTest, ActiveSetWithoutPilotsHoldsOnlyItsSortingMark)
 TEST_F(OneXPacketsTest, ActiveSetShowsEachPilotAndMarksTheReference)
 {
     // v = 2 E / (9 * 64 * 64) - 1 / 64: E = 1000 gives 0.03863, E = 100 gives the floor.
-    // A pad of 1, for without one a record's energy is the next record's pilot.
+    // A pad of 1. Without it a record's energy would be the next record's pilot.
     send(status(8, 2, 1)
              .put16(pilot(0, 1) + 12, 20)
              .put16(pilot(0, 1) + 28, 1000)
@@ -199,10 +199,10 @@ TEST_F(OneXPacketsTest, PilotRecordsAreSpacedByTheirPadRoundedUpToFour)
 
 TEST_F(OneXPacketsTest, ZeroDivisorsComeOutAsArithmeticGivesThem)
 {
-    // Energy over zero less a finite number: infinite.
+    // Energy divided by zero, minus a finite number, is infinite.
     send(status(8, 1).put8(kActiveSet + 6, 0).put16(pilot(0) + 12, 1).put16(pilot(0) + 24, 9));
     EXPECT_THAT(sortedRows("k1xActiveSetInfo"), ElementsAre("0;1=+inf dB"));
-    // Infinite less infinite is no number, which no comparison floors.
+    // Infinity minus infinity is not a number. No comparison raises that to the floor.
     send(status(8, 1).put16(kActiveSet + 4, 0).put16(pilot(0) + 12, 1).put16(pilot(0) + 24, 9));
     EXPECT_THAT(sortedRows("k1xActiveSetInfo"),
                 ElementsAre(::testing::MatchesRegex("0;1=.nan dB")));

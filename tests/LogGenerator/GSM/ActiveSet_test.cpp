@@ -18,7 +18,7 @@ constexpr std::uint32_t kMinusFive = 166442; // the weakest ratio of the band of
 
 using ActiveSetTest = SectionTest<ActiveSet>;
 
-// A packet of `count` cells, all records there, every cell of set 7 until it is put elsewhere.
+// A packet of `count` cells with all records. Every cell is in set 7 until it is put elsewhere.
 class ActiveSetPacket
 {
 public:
@@ -183,7 +183,7 @@ TEST_F(ActiveSetTest, ACellNeedsItsWholeFingerRecord)
 
 TEST_F(ActiveSetTest, FingerRecordsAreFoundByTheClaimedCount)
 {
-    // The readings stand where they belong for one cell, but the packet claims two.
+    // The readings are at their places for one cell, but the packet claims two.
     PacketBuilder packet(kCode, 16 + 15 + 44);
     packet.put8(15, 2).put16(16 + 7, 9).put32(16 + 15 + 32, kMinusFive);
     send(kCode, packet);

@@ -84,7 +84,7 @@ TEST_F(GSMLogGeneratorTest, WhatTakesADictionarysPlaceIsNotTestedAgain)
     const PropertyValue array = PropertyValue::arrayOf({"first", dictionary("k", "x")});
     EXPECT_EQ(simple(dictionary("A", dictionary("B", array))),
               dictionary("A", PropertyValue::arrayOf({"x"})));
-    // A value that is a one-entry dictionary only after its own simplification stays within.
+    // A value that becomes a one-entry dictionary only by its own simplification is kept.
     const PropertyValue inner = dictionary("C", two("x", "y"));
     EXPECT_EQ(simple(dictionary("A", dictionary("B", inner))), dictionary("A", two("x", "y")));
 }

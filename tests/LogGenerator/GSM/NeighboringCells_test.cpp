@@ -20,7 +20,7 @@ constexpr std::uint32_t kBsicList = 0x51FF;
 
 using NeighboringCellsTest = SectionTest<NeighboringCells>;
 
-// One measured neighbour for each channel, with its place as level and ten times that as C1.
+// One measured neighbour for each channel. Its level is its place in the list, C1 ten times that.
 Bytes measurement(const std::vector<std::uint32_t>& channels)
 {
     PacketBuilder packet(kMeasurement, 29 + 14 * channels.size());
@@ -98,7 +98,7 @@ TEST_F(NeighboringCellsTest, ACountBeyondThePacketShowsTheWholeRecords)
 {
     Bytes packet = measurement({975, 12});
     packet[28] = 255;
-    // The last seven bytes of a record are not read, so that it is whole without them.
+    // The last seven bytes of a record are not read, so it is whole without them.
     const std::pair<std::size_t, std::size_t> kCells[] = {
         {29,          0},
         {29 + 6,      0},
@@ -193,7 +193,7 @@ TEST_F(NeighboringCellsTest, ABsicCountBeyondThePacketTakesTheWholeEntries)
         {12,  5 }
     });
     list[14] = 255;
-    // The last byte of an entry is not read, so that it is whole without it.
+    // The last byte of an entry is not read, so it is whole without it.
     sendCut(kBsicList, list, 15 + 4 + 2);
     send(kMeasurement, measurement({975, 12}));
     EXPECT_THAT(records(),

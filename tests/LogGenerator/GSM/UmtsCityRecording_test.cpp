@@ -1,5 +1,5 @@
-// Five minutes of GSM and UMTS in a city, played through the generator. The values were worked out
-// from the file by other means.
+// Five minutes of GSM and UMTS in a city, played through the generator. The expected
+// values were decoded from the file without the sections.
 
 #include "LogGenerator/GSM/VRN_GSMLogGenerator.h"
 #include "LogGenerator/support/RecordedMessages.h"
@@ -26,7 +26,7 @@ protected:
         services.log.lines.clear();
     }
 
-    // Plays the first `count` messages that were not played yet up to then.
+    // Plays on until the first `count` messages have been played.
     void playUpTo(std::size_t count)
     {
         for (; played < count && played < messages.size(); ++played)

@@ -57,7 +57,7 @@ TEST_F(VRN_GSMLogGeneratorTest, SaysWhenItIsMadeAndWhenItGoes)
     EXPECT_THAT(services.log.errors(), ElementsAre("Creating VRN_GSMLogGenerator object"));
     services.log.lines.clear();
     generator.reset();
-    // The base says the same once more.
+    // The base class logs the same line again.
     EXPECT_THAT(services.log.warnings(),
                 ElementsAre(StartsWith("VRN_GSMLogGenerator is destructed 0x"),
                             StartsWith("VRN_GSMLogGenerator is destructed 0x")));

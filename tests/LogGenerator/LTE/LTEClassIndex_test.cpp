@@ -52,7 +52,7 @@ TEST_F(LTEClassIndexTest, SectionsShareCodesInTheOrderInWhichTheyAreMade)
                 ElementsAre("Reselection Candidates", "Reselection Candidates List"));
     EXPECT_THAT(subscribers(index, 0xFF0000), ElementsAre("SIM Info"));
     EXPECT_THAT(subscribers(index, 0xFF0002), ElementsAre("PDP Context Info"));
-    EXPECT_EQ(index.getSubscribers(0x4221), nullptr); // HSDPA is of another technology
+    EXPECT_EQ(index.getSubscribers(0x4221), nullptr); // HSDPA belongs to another technology
 }
 
 TEST_F(LTEClassIndexTest, TheStartCommandAsksForTheCodesInTheOrderOfTheSections)

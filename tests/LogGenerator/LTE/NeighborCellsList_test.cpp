@@ -108,7 +108,7 @@ TEST_F(NeighborCellsListTest, EachFieldReadsItsOwnBitsOnly)
 TEST_F(NeighborCellsListTest, TheSecondAntennaRepeatsTheFirst)
 {
     PacketBuilder builder(kCode, kFirst + kStride);
-    // All bytes behind the first antenna's fields differ from them.
+    // All bytes after the first antenna's fields differ from those fields.
     for (std::size_t i = kFirst + 16; i < kFirst + kStride; ++i)
         builder.put8(i, 0xAA);
     send(kCode, builder.putBits(kFirst + 12, 0, 11, 5).putBits(kFirst + 13, 3, 19, 7));

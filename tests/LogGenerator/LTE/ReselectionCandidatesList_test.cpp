@@ -17,7 +17,7 @@ constexpr std::size_t kFirst = 21;
 
 using ReselectionCandidatesListTest = SectionTest<ReselectionCandidatesList>;
 
-// The packet says `count` and holds `payload` bytes behind the fixed part.
+// The packet says `count` and holds `payload` bytes after the fixed part.
 PacketBuilder packet(std::uint32_t count, std::size_t payload)
 {
     PacketBuilder builder(kCode, kFirst + payload);
@@ -174,7 +174,8 @@ TEST_F(ReselectionCandidatesListTest, ACandidateWhoseBodyIsNotWholeEndsTheWalk)
 
 TEST_F(ReselectionCandidatesListTest, ACountBeyondThePacketShowsItsWholeCandidates)
 {
-    // A whole one, one whose body is cut off, and one whose header alone would be whole.
+    // A whole candidate, one whose body is cut off, and one of which only the header would be
+    // whole.
     send(kCode, packet(255, 14).put16(23, 1).put16(27, 3).put16(31, 7));
     EXPECT_EQ(records().size(), 1U);
 }

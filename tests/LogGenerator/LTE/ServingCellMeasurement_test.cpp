@@ -89,7 +89,7 @@ TEST_F(ServingCellMeasurementTest, FillsItsRowsInOrderAndLogsItsName)
                 ElementsAre(RecordingLog::Line{LogPriority::Warning, "Serving Cell Measurements"}));
 }
 
-// What each field takes of its neighbours' bits shows when all others are set.
+// With all other bits set, a field that also reads bits of its neighbours is found out.
 TEST_F(ServingCellMeasurementTest, EachFieldReadsItsOwnBitsOnly)
 {
     const struct {

@@ -30,7 +30,7 @@ PacketBuilder packet()
         .put8(25, 1);
 }
 
-// The serving cell whose numbers count on from `first`.
+// A serving cell whose numbers are `first` and the ones that follow it.
 PropertyValue servingCell(std::int64_t first)
 {
     return cellOf(kTSCellMonitorRadioAccessTechnologyUTRAN2, kTSCellMonitorCellTypeServing,

@@ -10,7 +10,7 @@
 namespace orvane
 {
 
-// A diagnostic log message of exactly `size` bytes, zero but for its header and what is put.
+// A diagnostic log message of exactly `size` bytes: its header, and zeros where nothing is put.
 // Storing outside the message is a mistake of the test and throws.
 class PacketBuilder
 {

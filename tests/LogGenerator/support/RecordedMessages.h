@@ -11,7 +11,7 @@
 namespace orvane
 {
 
-// The items of a recording among the tests' data as the messages that they came in, in file order.
+// The messages whose items are in a recording of the tests' data, in file order.
 inline std::vector<Bytes> recordedMessages(const std::string& fileName)
 {
     std::ifstream file(testDataPath(fileName), std::ios::binary);

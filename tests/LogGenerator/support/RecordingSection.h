@@ -12,7 +12,7 @@
 namespace orvane
 {
 
-// A section of a test's own: takes the codes that it is given and keeps what it is sent.
+// A section for tests: subscribes to the codes that it is given and keeps each call.
 class RecordingSection final : public Base
 {
 public:

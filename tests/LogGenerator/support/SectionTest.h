@@ -82,7 +82,8 @@ protected:
     // The rows of each element of a list section.
     [[nodiscard]] std::vector<Rows> records() const { return recordsOf(display); }
 
-    // Every cut of the packet below `minimum` bytes leaves the display as it is, and says nothing.
+    // Every cut of the packet below `minimum` bytes changes nothing in the display and logs no
+    // error.
     void expectShorterIsIgnored(std::uint32_t code, const Bytes& packet, std::size_t minimum)
     {
         const PropertyValue before = display.deepCopy();

@@ -8,7 +8,7 @@ namespace orvane
 namespace
 {
 
-// Whether another thread can take the lock, which it then gives back.
+// Whether another thread can take the lock. It releases the lock again.
 bool isFreeForAnotherThread()
 {
     bool isFree = false;
@@ -29,7 +29,7 @@ TEST(ArrayLockTest, LockOnceThenUnlockFreesIt)
     EXPECT_TRUE(isFreeForAnotherThread());
 }
 
-// Nested pairs take the lock several times but release it only once. This is meant.
+// Deliberate: nested pairs take the lock several times but release it only once.
 TEST(ArrayLockTest, LockTwiceThenUnlockTwiceLeavesItTakenOnce)
 {
     ArrayLock::lockArray();
@@ -58,7 +58,7 @@ TEST(ArrayLockTest, ThreadThatHoldsTheLeftoverTakesTheLockAgain)
     EXPECT_TRUE(isFreeForAnotherThread());
 }
 
-// The depth is counted in 8 bits. This is meant.
+// Deliberate: the depth is counted in 8 bits.
 TEST(ArrayLockTest, DepthIsCountedModulo256)
 {
     constexpr int kTimes = 257;

@@ -100,7 +100,7 @@ TEST(CalendarTest, AbsoluteTextIsInUtcWithoutFraction)
 TEST(CalendarTest, AbsoluteTextOfAnySecondHasItsForm)
 {
     const double infinity = std::numeric_limits<double>::infinity();
-    // What is beyond any calendar is cut to its ends.
+    // Times beyond the calendar are cut to its ends.
     EXPECT_EQ(absoluteDateText(std::nan("")), "1970-01-01 00:00:00 +0000");
     EXPECT_EQ(absoluteDateText(infinity), absoluteDateText(1e15));
     EXPECT_EQ(absoluteDateText(1e300), absoluteDateText(1e15));

@@ -78,7 +78,7 @@ TEST(OrderedMapTest, ClearedMapTakesKeysAgain)
     }
 }
 
-// From 32 keys on there is an index: the same must be seen on both sides of that size.
+// A map of 32 keys or more has an index. It must behave the same above and below that size.
 TEST(OrderedMapTest, MapsOfEverySizeFindAndRemoveWhatTheyHold)
 {
     for (int size = 28; size <= 36; ++size) {
@@ -100,7 +100,7 @@ TEST(OrderedMapTest, MapsOfEverySizeFindAndRemoveWhatTheyHold)
     }
 }
 
-// Against a plain list that is searched through.
+// Compared with a plain list that is searched from start to end.
 TEST(OrderedMapTest, AnySequenceOfChangesKeepsOrderAndValues)
 {
     std::mt19937 random(1);

@@ -230,7 +230,7 @@ TEST(PropertyValueTest, AbsentValuesCannotBeStored)
                  std::invalid_argument);
     EXPECT_THROW(PropertyValue::newArray().asArray()->append(PropertyValue()),
                  std::invalid_argument);
-    // A refused value leaves what was there.
+    // A refused value leaves the earlier value in place.
     const PropertyValue dictionary = PropertyValue::dictionaryOf({
         {"key", "value"}
     });

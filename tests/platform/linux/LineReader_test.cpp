@@ -142,7 +142,7 @@ TEST_F(LineReaderTest, WhatCannotBeReadIsAtItsEnd)
         ends = 0;
         read(descriptor);
         EXPECT_EQ(ends, 0);
-        readEnd.reset(); // so that polling the writing end says something
+        readEnd.reset(); // so that poll() reports an event for the writing end
         EXPECT_TRUE(runToEnd()) << descriptor;
     }
     EXPECT_TRUE(lines.empty());

@@ -49,7 +49,7 @@ protected:
 
 TEST_F(PortSocketTest, OneOfManyThatFindTheSameStaleSocketGetsIt)
 {
-    constexpr int kRounds = 500; // plain removal goes wrong once in some 300
+    constexpr int kRounds = 500; // plain removal fails about once in 300
     constexpr std::size_t kClaimants = 4;
     for (int round = 0; round < kRounds; ++round) {
         leaveStaleSocket(directory.path() + "/Port");
@@ -148,7 +148,7 @@ protected:
         error.clear();
         return PortSocket::claim(*shared, name, error);
     }
-    // What the listener, and the caller, think of the other end.
+    // Whether the listener accepts the caller, and the caller the listener.
     struct Trust {
         bool ofCaller;
         bool ofListener;
@@ -250,7 +250,7 @@ TEST_F(SharedPortSocketTest, TheServerServesTheMembersOfTheGroupAndRoot)
     const auto callFrom = [&](uid_t user, gid_t group, const std::vector<gid_t>& groups) {
         return trust(*server, kOwner, "TelephonyServer", user, group, groups);
     };
-    // More groups than one answer of the system is read for at first.
+    // More groups than fit into the first buffer.
     std::vector<gid_t> many(200);
     std::iota(many.begin(), many.end(), 4000);
     many.back() = kGroup;

@@ -32,7 +32,7 @@ protected:
         return _base.path() + '/' + name;
     }
 
-    // The path that is opened, or else why not.
+    // The path that is opened, or the error.
     static std::string open(const std::string& option)
     {
         std::string error;

@@ -18,7 +18,7 @@ protected:
     {
         return loop.runUntil(done, std::chrono::seconds{30});
     }
-    // Tries until one attempt succeeds, for what a busy machine may hinder now and then.
+    // Repeats attempts until one succeeds, for things that a busy machine sometimes prevents.
     static bool eventually(const std::function<bool()>& attempt)
     {
         const auto end = std::chrono::steady_clock::now() + std::chrono::seconds{30};
@@ -28,7 +28,7 @@ protected:
         } while (std::chrono::steady_clock::now() < end);
         return false;
     }
-    // Serves whatever there is to serve now.
+    // Runs everything that is pending now.
     void turnOnce()
     {
         loop.runUntil([] { return false; }, std::chrono::milliseconds{0});

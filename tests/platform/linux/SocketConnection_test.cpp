@@ -72,7 +72,7 @@ protected:
         return sent;
     }
 
-    // The plain ends of the pair, for tests in which one side is no connection.
+    // The plain ends of the pair, for tests in which one side is a bare socket.
     FileDescriptor plainHere;
     FileDescriptor plainThere;
     std::unique_ptr<FrameConnection> here;

@@ -18,7 +18,7 @@ namespace
 class SocketTransportTest : public TransportTest
 {
 protected:
-    // A socket file as a program leaves it that did not end well.
+    // A socket file as a killed program leaves it.
     void leaveStaleSocket(const std::string& name)
     {
         const auto address = socketAddress(pathOf(name), error);
@@ -100,7 +100,7 @@ TEST_F(SocketTransportTest, NamesThatAreNoneAreRefused)
 
 TEST_F(SocketTransportTest, APathLongerThanAnAddressIsRefusedInPlainWords)
 {
-    // 107 bytes are what an address holds, beside the one that ends it.
+    // An address holds 107 bytes and the zero byte that ends it.
     for (const std::size_t length : {107U, 108U, 250U}) {
         const std::string name(20, 'P');
         const std::size_t folder = length - pathOf("").size() - name.size() - 1;
@@ -199,8 +199,8 @@ TEST_F(SocketTransportTest, SocketsAreNotInherited)
     EXPECT_GE(sockets, 3);
 }
 
-// The sanitizer of undefined behaviour takes descriptors of its own for its checks of objects, and
-// its reports are wrong where there are none.
+// The undefined-behaviour sanitizer opens descriptors for its checks of objects. Its reports are
+// wrong if it cannot.
 #ifdef __has_feature
 #define ORVANE_UNDEFINED_SANITIZER __has_feature(undefined_behavior_sanitizer)
 #else

@@ -10,7 +10,7 @@
 namespace orvane
 {
 
-// Leaves a socket file at the path, as a program does that is killed.
+// Leaves a socket file at the path, as a killed program does.
 inline void leaveStaleSocket(const std::string& path)
 {
     std::string error;

@@ -12,7 +12,7 @@ namespace orvane
 namespace
 {
 
-// Where the first object stands.
+// Offset of the first object.
 constexpr std::size_t kFirst = 8;
 
 std::string at(std::size_t offset) { return " at byte " + std::to_string(offset); }
@@ -31,7 +31,7 @@ void expectFault(const Bytes& list, const std::string& error)
     EXPECT_EQ(result.error, error);
 }
 
-// The value of a list of that one object.
+// The value of a list whose only object has these bytes.
 PropertyListResult readObject(const Bytes& object)
 {
     BinaryListBuilder list;
@@ -41,7 +41,7 @@ PropertyListResult readObject(const Bytes& object)
 
 TEST(PropertyListBinaryReaderTest, IntegersOfEveryWidthAreRead)
 {
-    // Up to 4 bytes there is no sign.
+    // Integers of up to 4 bytes have no sign.
     struct Case {
         const char* object;
         std::int64_t number;
@@ -119,7 +119,7 @@ TEST(PropertyListBinaryReaderTest, RealsBooleansAndDatesAreRead)
 
 TEST(PropertyListBinaryReaderTest, DataAndTextsOfEveryLengthAreRead)
 {
-    // Below 15 the count stands in the marker, from 15 on behind it.
+    // A count below 15 is in the marker, a larger one after it.
     for (const unsigned length : {0U, 1U, 14U, 15U, 16U, 255U, 256U, 70000U}) {
         BinaryListBuilder data(4);
         data.data(Bytes(length, 0xA5));
@@ -249,7 +249,7 @@ TEST(PropertyListBinaryReaderTest, ObjectsOfOtherTypesAreRefused)
     EXPECT_EQ(readObject(hexBytes("83 01 02 03 04")).error,
               "UID objects are not accepted" + at(kFirst));
 
-    // Also where nothing refers to them.
+    // Even if nothing refers to them.
     BinaryListBuilder list;
     list.raw(hexBytes("00"));
     list.boolean(true);
@@ -300,7 +300,7 @@ TEST(PropertyListBinaryReaderTest, ReferenceCyclesAreRefused)
     pair.dictionary({0}, {1});
     expectFault(pair, "reference cycle through the object" + at(kFirst + 4));
 
-    // Far apart, behind elements that are fine.
+    // Far apart, after valid elements.
     BinaryListBuilder ring;
     ring.array({50, 50});
     for (std::size_t i = 1; i <= 50; ++i)
@@ -310,7 +310,7 @@ TEST(PropertyListBinaryReaderTest, ReferenceCyclesAreRefused)
 
 TEST(PropertyListBinaryReaderTest, OverlappingObjectsAreRefused)
 {
-    // "ab" and, inside it, what reads as a text of its own.
+    // "Qb" as a text, and inside it bytes that are also a valid text.
     BinaryListBuilder inside;
     inside.raw(hexBytes("52 51 62"));
     inside.offsets.push_back(kFirst + 1);
@@ -322,8 +322,8 @@ TEST(PropertyListBinaryReaderTest, OverlappingObjectsAreRefused)
     same.offsets.push_back(kFirst);
     expectFault(same, "overlapping objects" + at(kFirst));
 
-    // More objects than bytes, which no reading of offsets is needed for: the count at the
-    // trailer's ninth byte is told.
+    // More objects than bytes. That is found without reading offsets, so the error names the count,
+    // at the trailer's ninth byte.
     BinaryListBuilder crowded;
     crowded.boolean(true);
     crowded.offsets.push_back(kFirst);
@@ -386,7 +386,7 @@ TEST(PropertyListBinaryReaderTest, ObjectsThatReachBeyondTheObjectsAreRefused)
 
 TEST(PropertyListBinaryReaderTest, ObjectOffsetsOutOfRangeAreRefused)
 {
-    // In the magic, at the table, in the trailer, behind all.
+    // In the magic, at the table, in the trailer, beyond the end.
     for (const unsigned offset : {0U, 7U, 10U, 11U, 13U, 40U, 255U}) {
         BinaryListBuilder list;
         list.boolean(true);
@@ -430,12 +430,12 @@ TEST(PropertyListBinaryReaderTest, WrongTrailersAreRefused)
          {std::uint64_t{0}, std::uint64_t{7}, std::uint64_t{trailer + 1}, UINT64_MAX})
         expectFaultWith(24, 8, table, "offset table out of range");
 
-    // A table whose bytes are no whole number of entries.
+    // A table that is not a whole number of entries.
     Bytes odd = whole;
     odd[trailer + 6] = 3;
     odd[trailer + 15] = 0;
     expectFault(odd, "number of objects does not fit the offset table" + at(trailer + 8));
-    // A list of no objects has no root.
+    // A list without objects has no root.
     Bytes none = bytesOf("bplist00");
     none.insert(none.end(), {0, 0, 0, 0, 0, 0, 1, 1});
     for (const unsigned number : {0U, 0U, 8U})
@@ -510,7 +510,7 @@ TEST(PropertyListBinaryReaderTest, NestingIsReadUpToTheLimit)
         const PropertyListResult deepest = nested(kPropertyListDepthLimit, inDictionaries).read();
         EXPECT_EQ(deepest.error, "");
         EXPECT_TRUE(writeXmlPropertyList(deepest.value));
-        // The innermost container stands first, behind the key.
+        // The innermost container is the first object after the key.
         expectFault(nested(kPropertyListDepthLimit + 1, inDictionaries),
                     "nested deeper than 512 levels" + at(kFirst + 2));
         EXPECT_EQ(nested(5000, inDictionaries).read().error.find("nested deeper than 512 levels"),
@@ -541,7 +541,8 @@ TEST(PropertyListBinaryReaderTest, ListThatExpandsWithoutBoundIsRefused)
 
 TEST(PropertyListBinaryReaderTest, SharingThatRealWritersMakeIsRead)
 {
-    // Few distinct objects, each referenced often, as writers make that store equal scalars once.
+    // Few distinct objects, each referenced often: the work of a writer that stores equal scalars
+    // once.
     BinaryListBuilder list(3, 2);
     BinaryListBuilder::References keys;
     BinaryListBuilder::References values;

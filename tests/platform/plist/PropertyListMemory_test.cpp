@@ -12,7 +12,7 @@ namespace orvane
 namespace
 {
 
-// What a list may cost, as multiples of its size and a part of its own.
+// A list may take this much memory, plus this much for each of its bytes.
 constexpr std::size_t kAllowance = std::size_t{64} << 20;
 constexpr std::size_t kBytesAByte = 20;
 
@@ -47,7 +47,7 @@ protected:
     }
 };
 
-// Makes a list that refers again and again to what it holds. `spread` is how often.
+// Fills a list that refers `spread` times to the same object.
 struct Hostile {
     const char* name;
     std::function<void(BinaryListBuilder& list, std::size_t spread)> fill;
@@ -166,7 +166,7 @@ TEST_F(PropertyListMemoryTest, ManySmallObjectsStayWithinTheBound)
 
 TEST_F(PropertyListMemoryTest, DistinctEntriesOfALargeListAreRead)
 {
-    // What a real writer makes of many cells: nothing is refused although the list is large.
+    // As a real writer makes it of many cells. A large list is read.
     BinaryListBuilder list(3, 3);
     BinaryListBuilder::References cells;
     for (int i = 0; i < 60000; ++i) {

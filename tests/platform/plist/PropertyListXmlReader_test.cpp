@@ -19,7 +19,7 @@ void expectFault(const std::string& text, const std::string& error)
     EXPECT_EQ(result.error, error) << text;
 }
 
-// For what Expat finds within a declaration: the column is somewhere in it.
+// For errors that Expat finds within a declaration. The column is somewhere in it.
 void expectFaultOnLine(const std::string& text, const std::string& error)
 {
     const PropertyListResult result = readText(text);
@@ -234,7 +234,7 @@ TEST(PropertyListXmlReaderTest, NestingIsReadUpToTheLimit)
         EXPECT_EQ(deeper.error.find("nested deeper than 512 levels at line 1, column "), 0U)
             << deeper.error;
     }
-    // The container beyond the limit is refused at its own start, however deep the text goes on.
+    // The first container beyond the limit is refused, at its start, however deep the text is.
     const std::string text = nested(200000, "<array>", "</array>", "");
     EXPECT_EQ(readText(text).error,
               "nested deeper than 512 levels at line 1, column " + std::to_string(22 + 512 * 7));
@@ -268,7 +268,7 @@ TEST(PropertyListXmlReaderTest, EntityDeclarationsAreRefused)
 
 TEST(PropertyListXmlReaderTest, EntitiesThatAnExternalDtdMightDeclareAreRefused)
 {
-    // Expat would leave them out of the text.
+    // Expat alone would leave them out of the text.
     expectFault("<!DOCTYPE plist SYSTEM \"list.dtd\">\n" + xmlList("<string>a&b;c</string>"),
                 "undefined entity at line 2, column 31");
     expectFault("<!DOCTYPE plist [%a;]>\n" + xmlList("<array>&b;</array>"),

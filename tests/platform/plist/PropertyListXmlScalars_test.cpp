@@ -17,7 +17,8 @@ PropertyValue valueOf(const std::string& element)
     return result.value;
 }
 
-// What is wrong with the element. Its position, that of its first byte, is checked and cut off.
+// The error of a list of that element, without the position. Checks that the position is that of
+// the element's first byte.
 std::string faultOf(const std::string& element)
 {
     const PropertyListResult result = readText(xmlList(element));
@@ -55,7 +56,7 @@ TEST(PropertyListXmlScalarsTest, IntegersAreReadInEveryForm)
             << text;
 }
 
-// What is read is that large number, and is written as it was read.
+// Expects that the element is read as that large number and written as it was read.
 void expectLargeNumber(const std::string& element, const PropertyLargeNumber& number)
 {
     const PropertyValue value = valueOf(element);

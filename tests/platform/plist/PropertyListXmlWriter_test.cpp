@@ -81,7 +81,7 @@ TEST(PropertyListXmlWriterTest, LongDataIsWrapped)
 TEST(PropertyListXmlWriterTest, WhatXmlCannotCarryIsNotWritten)
 {
     const auto isWritten = [](const PropertyValue& value) {
-        // Neither alone nor inside.
+        // Neither alone nor inside a text.
         const bool alone = writeXmlPropertyList(value).has_value();
         const PropertyValue outer = PropertyValue::newArray();
         outer.asArray()->replaceElements({value});

@@ -276,7 +276,7 @@ TEST_F(FramePortsTest, NothingTakenInTimeIsMinus1AndThePortStaysValid)
     EXPECT_TRUE(remote->isValid());
     EXPECT_EQ(static_cast<int>(SendStatus::SendTimeout), -1);
 
-    // What was given up never arrives.
+    // A request that was given up never arrives.
     transport.resumeReading("peer");
     EXPECT_EQ(send(*remote, 3, {3}), SendStatus::Success);
     queue.runPending();
@@ -558,7 +558,7 @@ TEST_F(FramePortsTest, AMessageCallbackMayDestroyItsPort)
     std::vector<std::int32_t> seen;
     port = ports.createLocal("own", [&](LocalMessagePort&, std::int32_t id, ByteView) {
         port.reset();
-        seen.push_back(id); // what it captured is still there
+        seen.push_back(id); // what it captured still exists
         return std::optional<Bytes>(Bytes{1});
     });
     port->setDispatchQueue(queue);
@@ -709,7 +709,7 @@ TEST_F(FramePortsTest, AnInvalidationCallbackMayDestroyItsPort)
     int calls = 0;
     remote->setInvalidationCallback([&](MessagePort&) {
         remote.reset();
-        ++calls; // what it captured is still there
+        ++calls; // what it captured still exists
     });
     queue.runPending();
     transport.cutConnections("peer");

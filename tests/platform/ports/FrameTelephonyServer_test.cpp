@@ -55,7 +55,7 @@ protected:
         return answer;
     }
 
-    // What a request for a channel comes to where the server gives this answer by hand.
+    // The result of a request for a channel that the server answers like this.
     LogChannelResult resultOf(const PropertyValue& answer)
     {
         const auto text = writeXmlPropertyList(answer);
@@ -298,7 +298,7 @@ TEST_F(FrameTelephonyServerTest, ANotificationMayTearThePortDown)
     ASSERT_EQ(client
                   .createConnection([&](const std::string&, const PropertyValue&) {
                       port.reset();
-                      ++calls; // what it captured is still there
+                      ++calls; // what it captured still exists
                   })
                   ->createNetworkMonitorLogChannel("client")
                   .error,

@@ -49,7 +49,7 @@ Bytes header(std::uint32_t length, std::uint32_t flags)
 
 TEST(AppendFrameTest, WritesLengthIdSerialFlagsAndDataInLittleEndian)
 {
-    Bytes bytes = {0xEE}; // what is there already stays
+    Bytes bytes = {0xEE}; // earlier bytes stay
     appendFrame(bytes, -2, 0x01020304, true, true, Bytes{0xAA, 0xBB});
     EXPECT_EQ(bytes, (Bytes{0xEE, 2, 0, 0, 0, 0xFE, 0xFF, 0xFF, 0xFF, 4, 3, 2, 1, 3, 0, 0, 0, 0xAA,
                             0xBB}));
@@ -198,7 +198,7 @@ TEST(FrameReaderTest, TellsWhichFrameHasArrivedInPart)
     }
 }
 
-// Were the rest of the buffer moved once a frame, this would move most of a terabyte.
+// If the rest of the buffer were moved for each frame, this would move most of a terabyte.
 TEST(FrameReaderTest, TakesManySmallFramesOfOneReadInLinearTime)
 {
     constexpr std::size_t kFrames = 100'000;
@@ -209,7 +209,7 @@ TEST(FrameReaderTest, TakesManySmallFramesOfOneReadInLinearTime)
     reader.append(stream);
     const auto start = std::chrono::steady_clock::now();
     std::size_t count = 0;
-    // Appending between the frames must not make it move the rest each time either.
+    // Nor may appending between the frames move the rest each time.
     for (; reader.next(); ++count)
         reader.append({});
     EXPECT_EQ(count, kFrames);

@@ -11,7 +11,7 @@ namespace orvane
 namespace
 {
 
-// The process's time zone, put back in the end.
+// Sets the process's time zone, and restores it at its end.
 class ZoneSetting
 {
 public:

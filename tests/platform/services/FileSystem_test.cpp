@@ -58,8 +58,8 @@ TEST(FileSystemTest, WhatIsWrittenIsRead)
 {
     const TemporaryDirectory directory;
     const std::string path = directory.path() + "/file";
-    // Shorter ones after longer ones: nothing of the earlier file is left. 65536 bytes are read at
-    // a time.
+    // Shorter files after longer ones: nothing of the earlier file may be left. 65536 bytes are
+    // read at a time.
     for (const std::size_t size : {200000U, 131072U, 65537U, 65536U, 65535U, 1U, 0U}) {
         ASSERT_TRUE(writeFile(path, numbered(size))) << size;
         EXPECT_EQ(readFile(path), numbered(size)) << size;
@@ -98,7 +98,7 @@ TEST(FileSystemTest, WritingWhereThereIsNoFolderFails)
     EXPECT_TRUE(fs::is_directory(directory.path()));
 }
 
-// Files longer than so many bytes cannot be written while it lives, as on a full disk.
+// While it exists, files longer than that many bytes cannot be written, as on a full disk.
 class FileSizeLimit
 {
 public:
@@ -126,7 +126,7 @@ TEST(FileSystemTest, FailedWriteLeavesNoHalfFile)
 {
     const TemporaryDirectory directory;
     const std::string path = directory.path() + "/file";
-    // The longer ones fail while they are written, the short one when the file is closed.
+    // Long contents fail while they are written, the short one when the file is closed.
     for (const std::size_t size : {1000000U, 100000U, 2000U}) {
         bool isWritten = true;
         {

@@ -87,7 +87,7 @@ TEST_F(OutputDescriptorTest, ASignalThatIsHandledEndsTheWait)
     const pthread_t writer = ::pthread_self();
     std::atomic<bool> done = false;
     std::thread sender([&] {
-        // Sent until it arrives during the wait: before it, the first would be lost.
+        // Sent until one arrives during the wait. A signal before the wait would be lost.
         while (!done) {
             ::pthread_kill(writer, SIGUSR1);
             std::this_thread::yield();

@@ -85,7 +85,7 @@ TEST(SystemLogTest, LongLinesArePassedOnWhole)
     }
 }
 
-// Passes warnings on and counts what it is given.
+// Passes warnings on, and counts the lines that it is given.
 class CountingLog final : public SystemLog
 {
 public:

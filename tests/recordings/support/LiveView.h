@@ -15,8 +15,7 @@
 namespace orvane
 {
 
-// What a live view would have shown of a log after each of its items, found without any of the
-// classes that play logs.
+// What a live view shows of a log after each of its items, made without the classes that play logs.
 struct LiveView {
     struct Moment {
         LogTime time; // of the latest item

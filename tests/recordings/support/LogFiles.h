@@ -13,7 +13,7 @@
 namespace orvane
 {
 
-// A recording among the tests' data and the technology that it is of.
+// A recording of the tests' data and its technology.
 struct RecordedDrive {
     const char* file;
     const char* technology;

@@ -201,7 +201,7 @@ TEST_F(DiagnosticModemTest, AModemThatWasUnpluggedIsLookedForEveryTwoSecondsAndL
     EXPECT_THAT(phone.codes, ElementsAre(0x4005, 0xB0C2));
     phone.logItem(0xB0C2);
     EXPECT_THAT(ear->messages, SizeIs(1));
-    // The absence is told once, not at every look.
+    // The absence is logged once, not at every attempt.
     EXPECT_THAT(services.log.warnings(),
                 ElementsAre("No modem at /dev/modem: it was unplugged; looking for it every 2 "
                             "seconds",

@@ -45,7 +45,7 @@ TEST(DiagnosticRequestTest, AMaskHasABitForEachCodeOfTheGroup)
     EXPECT_EQ(payloadOf(DiagnosticRequest::setMask(1, 9, {7})).size(), 18U);
     EXPECT_EQ(payloadOf(DiagnosticRequest::setMask(1, 4096, {})).size(), 16U + 512);
     EXPECT_EQ(payloadOf(DiagnosticRequest::setMask(1, 8, {7})).back(), 0x80);
-    // A place outside of the group is none of its bits.
+    // A code outside the group has no bit.
     EXPECT_EQ(payloadOf(DiagnosticRequest::setMask(1, 8, {8})).back(), 0);
 }
 

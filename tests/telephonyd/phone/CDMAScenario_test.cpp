@@ -54,7 +54,7 @@ int signedByteAt(const PhoneMessage& message, std::size_t offset)
     return static_cast<std::int8_t>(byteAt(message, offset));
 }
 
-// Where a status report's subpackets stand, by their identifiers.
+// Offsets of a status report's subpackets, by their identifiers.
 std::map<unsigned, std::size_t> subpacketsOf(const PhoneMessage& message)
 {
     std::map<unsigned, std::size_t> found;
@@ -72,7 +72,7 @@ unsigned oneXStateOf(const PhoneMessage& status)
     return byteAt(status, subpacketsOf(status).at(1) + 4);
 }
 
-// Pilots of a status report with their strength in dB, as receivers work it out.
+// Pilots of a status report with their strength in dB, calculated as receivers do.
 std::map<unsigned, double> pilotsOf(const PhoneMessage& status)
 {
     const std::size_t at = subpacketsOf(status).at(3);

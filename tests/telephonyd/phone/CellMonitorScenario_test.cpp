@@ -76,7 +76,7 @@ TEST(CellMonitorScenarioTest, NothingThatViewersLeaveOutIsMissed)
         EXPECT_GT(list["Network"].asDictionary()->size(), 1U);
         EXPECT_GT(list["Serving Cell"].asDictionary()->size(), 1U);
         const PropertyArray& cells = *list["Neighbor Cells"].asArray();
-        // The first element tells of the others and is left out.
+        // The first element describes the others and is left out.
         ASSERT_GE(cells.size(), 1U);
         EXPECT_EQ(numberOf(cells[0]["Count"]), static_cast<int>(cells.size()) - 1);
         for (std::size_t i = 1; i < cells.size(); ++i)

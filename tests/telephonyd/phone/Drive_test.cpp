@@ -16,7 +16,7 @@ constexpr DriveCell kCells[] = {
     {0,    50,  1, -80},
     {800,  50,  1, -80},
     {1600, 50,  2, -80},
-    {9999, 999, 1, -80}, // out of hearing
+    {9999, 999, 1, -80}, // out of range
 };
 constexpr RoadPoint kRoad[] = {
     {0,    0},
@@ -123,7 +123,7 @@ TEST(DriveTest, NeighboursAreTheOthersThatAreHeardStrongestFirst)
         least = std::min(least, neighbours.size());
         most = std::max(most, neighbours.size());
     }
-    EXPECT_LT(least, most); // they come and go
+    EXPECT_LT(least, most); // cells appear and disappear
 }
 
 } // namespace

@@ -33,7 +33,7 @@ unsigned wordAt(const PhoneMessage& message, std::size_t offset)
 {
     return byteAt(message, offset) | byteAt(message, offset + 1) << 8;
 }
-// `width` bits that begin at that bit of the byte at the offset.
+// `width` bits from bit `bit` of the byte at `offset` on.
 unsigned bitsAt(const PhoneMessage& message, std::size_t offset, unsigned bit, unsigned width)
 {
     unsigned value = 0;
@@ -251,7 +251,7 @@ TEST(LTEScenarioTest, AnIdlePhoneReportsItsCellEvery640MillisecondsAndItsNeighbo
 
 TEST(LTEScenarioTest, IdleAndConnectedPhasesTakeTurns)
 {
-    // Which of the two each second was, by what was sent in it.
+    // The phase of each second, by the messages sent in it.
     std::map<std::int64_t, char> seconds;
     for (const Timed& each : tour())
         if (each.at > 0ms && each.message.kind == Kind::Modem) {
@@ -266,7 +266,7 @@ TEST(LTEScenarioTest, IdleAndConnectedPhasesTakeTurns)
         ++counts[kind];
     EXPECT_GT(counts['i'], 200);
     EXPECT_GT(counts['c'], 200);
-    EXPECT_LT(counts['x'], 60); // only where one phase follows the other
+    EXPECT_LT(counts['x'], 60); // only where the phase changes
 }
 
 TEST(LTEScenarioTest, NeighboursComeAndGo)

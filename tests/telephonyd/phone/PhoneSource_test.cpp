@@ -18,7 +18,7 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using Kind = PhoneMessage::Kind;
 
-// Says at each step what a test has put down for it.
+// Returns at each step the messages that a test has given it.
 class WrittenScenario final : public Scenario
 {
 public:

@@ -60,7 +60,7 @@ bool isOfTown(bool isUmts, unsigned channel, unsigned code)
     });
 }
 
-// The values of a byte over the tour, each once where it stays the same.
+// The values of a byte over the tour. Equal ones in a row count once.
 std::vector<unsigned> courseOf(std::uint16_t code, std::size_t offset)
 {
     std::vector<unsigned> course;
@@ -98,7 +98,7 @@ std::size_t expectedSize(const PhoneMessage& message)
     switch (message.code) {
     case 0x417A:
         return 16 + 59 * byteAt(message, 15);
-    case 0x4005: // the only GSM record beside UMTS ones shares the first one's bytes
+    case 0x4005: // with UMTS records, the only GSM record shares bytes with the first of them
         return 15 + (byteAt(message, 13) ? 10 * byteAt(message, 13) : 7 * byteAt(message, 14));
     case 0x4031:
         return 16 + 14 * byteAt(message, 14);
@@ -347,7 +347,7 @@ TEST(UMTSScenarioTest, GSMNeighboursHaveTheColoursOfTheirChannels)
     }
     EXPECT_GE(counts.size(), 2U);
     EXPECT_GE(powers.size(), 10U);
-    EXPECT_LT(unknown, 100U); // those just come into hearing
+    EXPECT_LT(unknown, 100U); // cells that have just come into range
 }
 
 TEST(UMTSScenarioTest, CountersOfBlocksGrow)

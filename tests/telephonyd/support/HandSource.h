@@ -9,7 +9,7 @@
 namespace orvane
 {
 
-// What a test knows of the source of one channel, and how it makes it send.
+// A test's handle on the source of one channel: what it was asked, and how to make it send.
 struct HandSourceState {
     std::optional<LogSelection> selection;
     LogSource::Send send;

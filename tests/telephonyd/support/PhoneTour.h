@@ -12,7 +12,8 @@
 namespace orvane
 {
 
-// What tests of simulated phones share: all that a phone sends on a long tour, and readers of it.
+// Shared by tests of simulated phones: everything that a phone sends on a long tour, and functions
+// that read it.
 
 struct TimedMessage {
     std::chrono::milliseconds at;
@@ -40,7 +41,7 @@ inline Tour ofCode(const Tour& tour, std::uint16_t code,
     return found;
 }
 
-// Kinds and codes of what lies between the two times.
+// Kinds and codes of the messages between the two times.
 inline std::set<std::pair<PhoneMessage::Kind, unsigned>>
 codesBetween(const Tour& tour, std::chrono::milliseconds from, std::chrono::milliseconds to)
 {

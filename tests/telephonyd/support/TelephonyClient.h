@@ -37,7 +37,7 @@ inline PropertyValue startCommand(const std::set<std::uint32_t>& modemCodes,
     });
 }
 
-// A client of a telephony server that listens on a loopback's own side, speaking frames by hand.
+// A client of a telephony server on a loopback transport, which sends and reads plain frames.
 // Nothing arrives before the queues run.
 class TelephonyClient
 {

@@ -9,7 +9,7 @@
 namespace orvane
 {
 
-// A shell that notes what it is asked for.
+// A shell that records what it is asked for.
 class FakeShell final : public Shell
 {
 public:
