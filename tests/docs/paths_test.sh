@@ -24,8 +24,9 @@ for page in README.md CONTRIBUTING.md docs/*.md; do
 
     case_named "the paths on $page"
     while IFS= read -r path; do
-        # A path may be a pattern such as *.cpp; with a slash at its end, any text is one that matches.
-        compgen -G "${path%/}" >/dev/null || fail "no file $path"
+        # A path may be a pattern such as *.cpp, or a class, whose header it names without its ending.
+        # compgen takes any text with a slash at its end for a match.
+        compgen -G "${path%/}" >/dev/null || [ -e "$path.h" ] || fail "no file $path"
     done < <(named_paths "$page" | grep -vxFf <(new_files "$page"))
 done
 finish
