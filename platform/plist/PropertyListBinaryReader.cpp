@@ -3,6 +3,7 @@
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/plist/PropertyListBinaryObjects.h"
+#include "platform/plist/PropertyListMemory.h"
 #include "platform/plist/PropertyListText.h"
 
 #include <algorithm>
@@ -20,25 +21,7 @@ using Type = PropertyListBinaryObjects::Type;
 // 2001-01-01 00:00:00 UTC, from which binary lists count.
 constexpr double kDateOrigin = 978307200;
 
-// What an allocation takes of the heap: a header before it, rounded up.
-constexpr std::size_t heapBytes(std::size_t size)
-{
-    return size == 0 ? 0 : std::max<std::size_t>(32, (size + 8 + 15) / 16 * 16);
-}
-
-// What a text takes beside the value that holds it: nothing where it is short, and room for 30
-// characters at least where it grows beyond that.
-constexpr std::size_t textBytes(std::size_t length)
-{
-    constexpr std::size_t kLengthInPlace = 15;
-    return length <= kLengthInPlace ? 0 : heapBytes(std::max(length, 2 * kLengthInPlace) + 1);
-}
-
-constexpr std::size_t kSharedBytes = 16; // beside an object that is made with its counts
-// A dictionary's entry, and what a large dictionary takes for finding it.
-constexpr std::size_t kEntryBytes = sizeof(std::string) + sizeof(PropertyValue);
-constexpr std::size_t kIndexedEntries = 32;
-constexpr std::size_t kIndexBytes = 96;
+using Memory = PropertyListMemory;
 
 // The integer, big-endian with its sign, in decimal.
 std::string decimalDigits(Bytes integer)
@@ -71,10 +54,7 @@ std::string decimalDigits(Bytes integer)
 class TreeBuilder
 {
 public:
-    explicit TreeBuilder(ByteView bytes)
-        : _objects(bytes), _budget(kBinaryMemoryLimit + kBinaryMemoryLimitPerByte * bytes.size())
-    {
-    }
+    explicit TreeBuilder(ByteView bytes) : _objects(bytes), _memory(bytes.size()) {}
     PropertyListResult read();
 
 private:
@@ -94,7 +74,7 @@ private:
     PropertyValue fail(std::string what, std::size_t at);
 
     PropertyListBinaryObjects _objects;
-    std::size_t _budget;
+    Memory _memory;
     std::vector<bool> _isOpen; // whether the object's value is being built
     std::size_t _depth = 0;
     std::string _error;
@@ -117,11 +97,10 @@ PropertyValue TreeBuilder::fail(std::string what, std::size_t at)
 
 bool TreeBuilder::spend(std::size_t bytes, const Object& on)
 {
-    if (bytes > _budget) {
+    if (!_memory.spend(bytes)) {
         fail("too many values for the length of the list, with the object", on.begin);
         return false;
     }
-    _budget -= bytes;
     return true;
 }
 
@@ -160,7 +139,7 @@ PropertyValue TreeBuilder::contentOf(const Object& object)
         return PropertyValue::date({seconds + kDateOrigin});
     }
     case Type::Data: {
-        if (!spend(heapBytes(kSharedBytes + sizeof(Bytes)) + heapBytes(object.count), object))
+        if (!spend(Memory::data(object.count), object))
             return {};
         const ByteView content = _objects.content(object);
         return PropertyValue::data(Bytes(content.begin(), content.end()));
@@ -194,7 +173,7 @@ PropertyValue TreeBuilder::largeInteger(const Object& object)
 {
     const ByteView content = _objects.content(object);
     PropertyLargeNumber number{decimalDigits(Bytes(content.begin(), content.end())), false};
-    if (!spend(heapBytes(kSharedBytes + sizeof number) + textBytes(number.digits.size()), object))
+    if (!spend(Memory::largeNumber(number.digits.size()), object))
         return {};
     return PropertyValue::largeNumber(std::move(number));
 }
@@ -214,7 +193,7 @@ PropertyValue TreeBuilder::string(const Object& object)
     // Two bytes of UTF-16 are at most three of UTF-8.
     const std::size_t length =
         object.type == Type::AsciiString ? content.size() : content.size() / 2 * 3;
-    if (!spend(textBytes(length), object))
+    if (!spend(Memory::text(length), object))
         return {};
     if (object.type == Type::AsciiString) {
         const auto isAscii = [](std::uint8_t byte) { return byte < 0x80; };
@@ -229,9 +208,7 @@ PropertyValue TreeBuilder::string(const Object& object)
 
 PropertyValue TreeBuilder::array(const Object& object)
 {
-    if (!spend(heapBytes(kSharedBytes + sizeof(PropertyArray)) +
-                   heapBytes(object.count * sizeof(PropertyValue)),
-               object))
+    if (!spend(Memory::array() + Memory::allocation(object.count * Memory::kElementBytes), object))
         return {};
     PropertyValue array = PropertyValue::newArray();
     array.asArray()->reserve(object.count);
@@ -246,10 +223,9 @@ PropertyValue TreeBuilder::array(const Object& object)
 
 PropertyValue TreeBuilder::dictionary(const Object& object)
 {
-    const bool isIndexed = object.count >= kIndexedEntries;
-    if (!spend(heapBytes(kSharedBytes + sizeof(PropertyDictionary)) +
-                   heapBytes(object.count * kEntryBytes) +
-                   (isIndexed ? object.count * kIndexBytes : 0),
+    const bool isIndexed = object.count >= Memory::kIndexedEntries;
+    if (!spend(Memory::dictionary() + Memory::allocation(object.count * Memory::kEntryBytes) +
+                   (isIndexed ? object.count * Memory::kIndexBytes : 0),
                object))
         return {};
     PropertyValue dictionary = PropertyValue::newDictionary();
@@ -258,7 +234,7 @@ PropertyValue TreeBuilder::dictionary(const Object& object)
         const PropertyValue key = referenced(object, n, Use::Key);
         PropertyValue element = key ? referenced(object, object.count + n) : PropertyValue();
         // A large dictionary keeps its keys twice.
-        if (!element || (isIndexed && !spend(textBytes(key.asString()->size()), object)))
+        if (!element || (isIndexed && !spend(Memory::text(key.asString()->size()), object)))
             return {};
         dictionary.asDictionary()->set(*key.asString(), std::move(element));
     }

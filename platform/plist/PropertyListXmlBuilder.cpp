@@ -35,7 +35,10 @@ bool isAllSpace(std::string_view text) { return std::all_of(text.begin(), text.e
 
 } // namespace
 
-PropertyListXmlBuilder::PropertyListXmlBuilder() { _open.reserve(8); }
+PropertyListXmlBuilder::PropertyListXmlBuilder(std::size_t listBytes) : _memory(listBytes)
+{
+    _open.reserve(8);
+}
 
 PropertyListXmlBuilder::Element PropertyListXmlBuilder::elementNamed(std::string_view name)
 {
@@ -58,7 +61,8 @@ bool PropertyListXmlBuilder::startElement(std::string_view name)
     case Element::Array: {
         PropertyValue container = element == Element::Dictionary ? PropertyValue::newDictionary()
                                                                  : PropertyValue::newArray();
-        add(container);
+        if (!add(container))
+            return false;
         _open.push_back({std::move(container), std::nullopt});
         break;
     }
@@ -119,9 +123,8 @@ bool PropertyListXmlBuilder::endElement()
         _open.back().key = std::move(_text);
     } else {
         PropertyValue value = leafValue();
-        if (!value)
+        if (!value || !add(std::move(value)))
             return false;
-        add(std::move(value));
     }
     _leaf.reset();
     return true;
@@ -156,11 +159,13 @@ PropertyValue PropertyListXmlBuilder::leafValue()
     }
 }
 
-void PropertyListXmlBuilder::add(PropertyValue value)
+bool PropertyListXmlBuilder::add(PropertyValue value)
 {
+    if (!spendFor(value))
+        return fail("too many values for the length of the list");
     if (_open.empty()) {
         _root = std::move(value);
-        return;
+        return true;
     }
     OpenContainer& container = _open.back();
     if (PropertyDictionary* const dictionary = container.value.asDictionary()) {
@@ -169,6 +174,39 @@ void PropertyListXmlBuilder::add(PropertyValue value)
     } else {
         container.value.asArray()->append(std::move(value));
     }
+    return true;
+}
+
+bool PropertyListXmlBuilder::spendFor(const PropertyValue& value)
+{
+    using Memory = PropertyListMemory;
+    // Containers grow as elements come: up to twice as large as needed, with the earlier one
+    // beside.
+    constexpr std::size_t kGrowth = 3;
+    std::size_t bytes = 0;
+    if (!_open.empty()) {
+        OpenContainer& container = _open.back();
+        ++container.entries;
+        if (container.key) {
+            const std::size_t key = Memory::text(container.key->size());
+            bytes += kGrowth * Memory::kEntryBytes + key;
+            if (container.entries >= Memory::kIndexedEntries)
+                bytes += Memory::kIndexBytes + key;
+        } else {
+            bytes += kGrowth * Memory::kElementBytes;
+        }
+    }
+    if (value.asDictionary())
+        bytes += Memory::dictionary();
+    else if (value.asArray())
+        bytes += Memory::array();
+    else if (const std::string* text = value.asString())
+        bytes += Memory::text(text->capacity());
+    else if (const Bytes* data = value.asData())
+        bytes += Memory::data(data->capacity());
+    else if (const PropertyLargeNumber* number = value.asLargeNumber())
+        bytes += Memory::largeNumber(number->digits.size());
+    return _memory.spend(bytes);
 }
 
 bool PropertyListXmlBuilder::fail(std::string text)

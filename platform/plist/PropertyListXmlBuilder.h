@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/base/PropertyValue.h"
+#include "platform/plist/PropertyListMemory.h"
 
 #include <optional>
 #include <string>
@@ -16,7 +17,8 @@ namespace orvane
 class PropertyListXmlBuilder
 {
 public:
-    PropertyListXmlBuilder();
+    // `listBytes`: the size of the list, for the memory that its values may take.
+    explicit PropertyListXmlBuilder(std::size_t listBytes);
 
     bool startElement(std::string_view name);
     bool addText(std::string_view text);
@@ -46,6 +48,7 @@ private:
     struct OpenContainer {
         PropertyValue value;
         std::optional<std::string> key; // waits for its value; dictionaries only
+        std::size_t entries = 0;
     };
 
     static const Name kNames[];
@@ -55,8 +58,11 @@ private:
     bool canStartHere(Element element, std::string_view name);
     bool endContainer();
     PropertyValue leafValue();
-    void add(PropertyValue value);
+    // Whether the value, a container still empty, is within the memory of the list.
+    bool add(PropertyValue value);
+    bool spendFor(const PropertyValue& value);
 
+    PropertyListMemory _memory;
     bool _isInside = false;       // <plist>
     std::optional<Element> _leaf; // the open element that holds a text or nothing
     std::string _text;            // of that element so far

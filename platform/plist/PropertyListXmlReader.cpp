@@ -54,7 +54,7 @@ private:
 };
 
 XmlRun::XmlRun(std::string_view text, const char* encoding)
-    : _text(text), _parser(XML_ParserCreate(encoding))
+    : _text(text), _parser(XML_ParserCreate(encoding)), _builder(text.size())
 {
     if (!_parser)
         throw std::bad_alloc();

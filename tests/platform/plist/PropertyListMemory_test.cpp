@@ -1,4 +1,4 @@
-#include "platform/plist/PropertyListBinaryReader.h"
+#include "platform/plist/PropertyListMemory.h"
 
 #include "support/AllocationMeter.h"
 #include "support/PropertyListBytes.h"
@@ -145,6 +145,33 @@ TEST_F(PropertyListMemoryTest, AnExpandingListIsRefusedBeforeItTakesTheMemory)
     const Cost cost = costOf(list.bytes());
     expectBounded(cost, "expanding");
     EXPECT_FALSE(cost.error.empty());
+}
+
+TEST_F(PropertyListMemoryTest, AListOfShortElementsStaysWithinItsBound)
+{
+    const struct {
+        const char* name;
+        const char* element;
+        const char* container;
+    } cases[] = {
+        {"empty arrays",       "<array/>",           "array"},
+        {"empty dictionaries", "<dict/>",            "array"},
+        {"large numbers",      "<real>1e999</real>", "array"},
+        {"one key",            "<key/><true/>",      "dict" },
+    };
+    for (const auto& each : cases) {
+        std::string text;
+        while (text.size() < std::size_t{8} << 20)
+            text += each.element;
+        const std::string container = each.container;
+        const Bytes list = bytesOf(xmlList("<" + container + ">" + text + "</" + container + ">"));
+        const Cost cost = costOf(list);
+        expectBounded(cost, each.name);
+        if (!cost.error.empty()) {
+            EXPECT_TRUE(cost.error.starts_with("too many values for the length of the list"))
+                << cost.error;
+        }
+    }
 }
 
 TEST_F(PropertyListMemoryTest, ManySmallObjectsStayWithinTheBound)
