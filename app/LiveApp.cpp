@@ -12,6 +12,7 @@ namespace
 {
 
 constexpr const char* kConnecting = "Connecting...";
+constexpr const char* kNoModem = "No modem";
 // Deliberate: the first status has no dots, all later ones have.
 constexpr const char* kFirstStatus = "Connecting";
 constexpr const char* kUpdatedFormat = "'Updated' yyyy-MM-dd 'at' HH:mm:ss";
@@ -67,9 +68,9 @@ std::optional<SnapshotResult> LiveApp::saveSnapshot(const std::string& descripti
 
 LiveApp::Status LiveApp::status() const
 {
-    if (_model && _model->isConnected())
-        return {updateMessage, false};
-    return {kConnecting, true};
+    if (!_model || !_model->isConnected())
+        return {kConnecting, true};
+    return {_model->isModemMissing() ? kNoModem : updateMessage, false};
 }
 
 void LiveApp::updateViewControllerFromModel()
@@ -82,6 +83,13 @@ void LiveApp::updateViewControllerFromModel()
         updateMessage = _dateFormatter->stringFromDate(clock.secondsSince1970(), clock);
     }
     showStatus();
+}
+
+// Shown at once, because no refresh comes while there is no data.
+void LiveApp::modemPresenceChanged()
+{
+    if (_model)
+        showStatus();
 }
 
 void LiveApp::monitorStartEnded()

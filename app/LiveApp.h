@@ -38,6 +38,7 @@ public:
 
     void updateViewControllerFromModel() final;
     void monitorStartEnded() final;
+    void modemPresenceChanged() final;
 
 protected:
     struct Status {

@@ -28,6 +28,8 @@ public:
     virtual void updateViewControllerFromModel() = 0;
     // A start or restart has ended; whether the model is connected may have changed.
     virtual void monitorStartEnded() = 0;
+    // What isModemMissing() says has changed.
+    virtual void modemPresenceChanged() = 0;
 };
 
 // What a model is made of. Referred to, not owned; all must outlive the model.
@@ -75,6 +77,8 @@ public:
     bool createPorts();
     void destroyPorts();
     [[nodiscard]] bool isConnected() const { return _recvPort && _sendPort; }
+    // Whether the server has said that its modem is missing.
+    [[nodiscard]] bool isModemMissing() const { return _isModemMissing; }
     void configureGenerator();
     // Does nothing while running.
     void startMonitor();
@@ -85,9 +89,10 @@ private:
     static std::optional<Bytes> messageReceived(std::int32_t messageId, ByteView data,
                                                 OrvaneModel* context);
     static void portInvalidated(const MessagePort& port, OrvaneModel* context);
-    static void serverNotification(OrvaneModel* context);
+    static void serverNotification(OrvaneModel* context, const std::string& name);
 
     bool openSession();
+    void setModemMissing(bool isMissing);
     void keepTreeForQueuedUpdate();
     void adoptGenerator(std::unique_ptr<LogGenerator> generator);
     void checkHealth();
@@ -100,6 +105,7 @@ private:
     // The class of the generator that the state's history is of.
     std::optional<std::type_index> _historyClass;
     bool _updated = false;
+    bool _isModemMissing = false;
     bool _isViewUpdateQueued = false;
     NodePointer _nodes;
     std::optional<PathDictionary> _nodesByPath;

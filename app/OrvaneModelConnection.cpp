@@ -56,8 +56,8 @@ bool OrvaneModel::createPorts()
     LogChannelResult channel;
     {
         const auto connection = _environment.server.createConnection(
-            [weak = weak_from_this()](const std::string&, const PropertyValue&) {
-                serverNotification(weak.lock().get());
+            [weak = weak_from_this()](const std::string& notification, const PropertyValue&) {
+                serverNotification(weak.lock().get(), notification);
             });
         if (!connection) {
             logError("Could not create TSServerConnection");
@@ -143,6 +143,8 @@ void OrvaneModel::startMonitor()
 {
     if (_displayUpdateTimer)
         return;
+    // The server says it again for the next channel.
+    setModemMissing(false);
     bool isRunning = false;
     try {
         isRunning = openSession();
@@ -226,10 +228,21 @@ void OrvaneModel::portInvalidated(const MessagePort& port, OrvaneModel* context)
         context->restartMonitor();
 }
 
-void OrvaneModel::serverNotification(OrvaneModel* context)
+void OrvaneModel::serverNotification(OrvaneModel* context, const std::string& name)
 {
-    if (context)
-        context->refresh();
+    if (!context)
+        return;
+    if (name == kModemMissingNotification)
+        context->setModemMissing(true);
+    else if (name == kModemPresentNotification)
+        context->setModemMissing(false);
+    context->refresh();
+}
+
+void OrvaneModel::setModemMissing(bool isMissing)
+{
+    if (std::exchange(_isModemMissing, isMissing) != isMissing && _observer)
+        _observer->modemPresenceChanged();
 }
 
 } // namespace orvane

@@ -82,9 +82,10 @@ std::unique_ptr<FrontEnd> makeTerminalFrontEnd(const AppOptions& options, QtEven
     settings.isSimulated = options.demo.has_value();
     settings.waitingHint =
         options.command == AppCommand::Open ? "There is nothing in the recording at this time."
-        : settings.isSimulated              ? "The simulated phone is starting."
-                               : "Start telephonyd on this machine, or leave with q and try a "
-                                 "simulated phone: orvane --demo";
+        : settings.isSimulated
+            ? "The simulated phone is starting."
+            : "Start telephonyd --port DEVICE for a modem, or leave with q and try a "
+              "simulated phone: orvane --demo";
     settings.onQuit = [&loop] { loop.quit(); };
     return std::make_unique<TerminalFrontEnd>(std::move(settings));
 }

@@ -29,9 +29,10 @@ std::unique_ptr<FrontEnd> makeWindowFrontEnd(const AppOptions& options, QtEventL
     settings.isFullScreen = options.isFullScreen;
     settings.waitingHint =
         options.command == AppCommand::Open ? "There is nothing in the recording at this time."
-        : settings.isSimulated              ? "The simulated phone is starting."
-                               : "Start telephonyd on this machine, or try a simulated phone: "
-                                 "orvane --demo";
+        : settings.isSimulated
+            ? "The simulated phone is starting."
+            : "Start telephonyd --port DEVICE for a modem, or try a simulated phone: "
+              "orvane --demo";
     settings.onClose = [&loop] { loop.quit(); };
     return std::make_unique<WindowFrontEnd>(std::move(settings));
 }

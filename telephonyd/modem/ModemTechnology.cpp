@@ -17,7 +17,8 @@ ModemTechnology::ModemTechnology(MainQueue& queue, std::optional<std::string> na
 
 std::string ModemTechnology::ask()
 {
-    if (_isNamed || _isConfirmed)
+    // Without a modem the last known one lets the viewer stay, and say that the modem is missing.
+    if (_isNamed || _isConfirmed || (!_isPresent && !_known.empty()))
         return _known;
     probeWhileClientsWait();
     return "";

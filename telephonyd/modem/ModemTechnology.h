@@ -16,8 +16,9 @@ namespace orvane
 // Which technology a modem serves: what was named on the command line, or else what probing finds.
 //
 // Probing begins when a client asks and the answer is not known. What was found stays known until
-// the modem goes away. A modem that has come back is probed again when a client asks, and when it
-// has given those who listen no item for kSilence; a silent modem that never went away is not.
+// the modem goes away, and is the answer until it is back. A modem that has come back is probed
+// again when a client asks, and when it has given those who listen no item for kSilence; a silent
+// modem that never went away is not.
 class ModemTechnology
 {
 public:

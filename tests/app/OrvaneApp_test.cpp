@@ -247,6 +247,20 @@ TEST_F(OrvaneAppTest, WhileNotConnectedAReloadLeavesTheTimeOfTheLastUpdate)
     EXPECT_EQ(top().statusText(), "Updated 2026-11-21 at 10:00:00");
 }
 
+TEST_F(OrvaneAppTest, AModemThatIsMissingIsTheStatusUntilItIsBack)
+{
+    launch();
+    refresh();
+    takeNotes();
+    server.notify("ModemMissing");
+    queue.advance(10ms);
+    EXPECT_EQ(top().statusText(), "No modem");
+    EXPECT_FALSE(top().isBusy());
+    server.notify("ModemPresent");
+    queue.advance(10ms);
+    EXPECT_EQ(top().statusText(), "Updated 2026-11-21 at 10:00:00");
+}
+
 TEST_F(OrvaneAppTest, WhatTheSaveScreenSavesIsOfTheTimeWhenItOpened)
 {
     makeMarker();

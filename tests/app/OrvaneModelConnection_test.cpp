@@ -39,9 +39,11 @@ public:
             onUpdate();
     }
     void monitorStartEnded() override { ++startsEnded; }
+    void modemPresenceChanged() override { ++presenceChanges; }
 
     int updates = 0;
     int startsEnded = 0;
+    int presenceChanges = 0;
     std::function<void()> onUpdate;
 };
 
@@ -479,6 +481,27 @@ TEST_F(ConnectionTest, AnyNotificationRefreshesAtOnce)
         EXPECT_EQ(shownCellId(), std::to_string(cellId)) << name;
     }
     EXPECT_EQ(observer.updates, 4);
+}
+
+TEST_F(ConnectionTest, AModemThatIsMissingIsKnownUntilItIsBackOrTheChannelEnds)
+{
+    startConnected();
+    EXPECT_FALSE(model->isModemMissing());
+    server.notify("ModemMissing");
+    server.notify("ModemMissing");
+    queue.advance(10ms);
+    EXPECT_TRUE(model->isModemMissing());
+    EXPECT_EQ(observer.presenceChanges, 1);
+    server.notify("ModemPresent");
+    queue.advance(10ms);
+    EXPECT_FALSE(model->isModemMissing());
+    EXPECT_EQ(observer.presenceChanges, 2);
+    server.notify("ModemMissing");
+    queue.advance(10ms);
+    server.closeChannels();
+    queue.advance(10s);
+    EXPECT_TRUE(model->isConnected());
+    EXPECT_FALSE(model->isModemMissing());
 }
 
 TEST_F(ConnectionTest, ANotificationFindsADeadChannelAtOnce)

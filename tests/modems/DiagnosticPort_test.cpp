@@ -187,6 +187,9 @@ TEST_F(DiagnosticPortTest, AModemThatIsReplacedAtTheSameLinkIsFoundAndTheViewerG
     ASSERT_TRUE(program->waitForText(kRow));
     phone.reset();
     EXPECT_TRUE(server->waitForError("warning: No modem at " + file("modem")));
+    EXPECT_TRUE(program->waitForText(R"({"status":"No modem","loading":false,"tree":{)"));
+    const auto late = viewer();
+    EXPECT_TRUE(late->waitForText(R"("status":"No modem")"));
     phone = std::make_unique<PretendModem>(directory.path(), testDataPath("lte-drive.dlf"),
                                            std::vector<std::string>{"--speed", "20", "--loop"});
     EXPECT_TRUE(PretendModem::waitUntil([&] { return phone->codes() == kLteCodes; }));

@@ -26,8 +26,9 @@ protected:
     PicturesTest()
         : WindowedApplication([] {
               auto settings = stillSettings();
-              settings.waitingHint = "Start telephonyd on this machine, or try a simulated phone: "
-                                     "orvane --demo";
+              settings.waitingHint =
+                  "Start telephonyd --port DEVICE for a modem, or try a simulated phone: "
+                  "orvane --demo";
               return settings;
           }())
     {

@@ -370,9 +370,11 @@ TEST_F(DiagnosticModemTest, AfterAnAbsenceTheLastKnownTechnologyIsTriedFirst)
     startUnknown();
     EXPECT_EQ(technologyWhileLogging(0xD00A), kTSLogChannelTechnology_Varnel_UTRAN2);
     phone.unplug();
-    EXPECT_EQ(modem->technology(), "");
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_UTRAN2);
     phone.plugIn();
     queue.advance(2s);
+    EXPECT_EQ(modem->technology(), "");
+    queue.runPending();
     EXPECT_THAT(phone.codes, ElementsAre(0xD00A, 0xD00C));
     phone.logItem(0xD00C);
     EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_UTRAN2);
