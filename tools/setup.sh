@@ -8,7 +8,7 @@ build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev 
     libqt6opengl6-dev)
 # shellcheck disable=SC2034
 check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev
-    libvterm-dev)
+    libvterm-dev python3)
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -43,6 +43,7 @@ purpose_of() {
     libgmock-dev) echo "GoogleMock with its CMake package" ;;
     libbenchmark-dev) echo "Google Benchmark with its CMake package" ;;
     libvterm-dev) echo "libvterm with its headers, a terminal for tests" ;;
+    python3) echo "Python 3, which plays modems in tests" ;;
     gcovr) echo "gcovr" ;;
     esac
 }

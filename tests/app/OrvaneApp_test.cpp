@@ -251,7 +251,6 @@ TEST_F(OrvaneAppTest, AModemThatIsMissingIsTheStatusUntilItIsBack)
 {
     launch();
     refresh();
-    takeNotes();
     server.notify("ModemMissing");
     queue.advance(10ms);
     EXPECT_EQ(top().statusText(), "No modem");
