@@ -75,6 +75,11 @@ constexpr AppOption kOptions[] = {
         }),
     AppOption({"every", "SECONDS", "the refresh period (default 2.0)", kExport, 0.001, 86400},
               &AppOptions::refreshInterval),
+    AppOption(
+        {"spreadsheet", "",
+         "with csv: begin cells with an apostrophe that a spreadsheet would take for formulas",
+         kExport},
+        &AppOptions::isForSpreadsheet),
     AppOption({"list", "", "print the paths that occur", kExport}, &AppOptions::listsPaths),
     AppOption({"technology", "NAME",
                "what FILE is a recording of: {} (default: by the log codes in it)", kRecordings},
@@ -157,6 +162,8 @@ void parse(AppOptions& options, std::span<const std::string> arguments,
         throw UsageError("--list has no --format: its lines are paths");
     if (options.listsPaths)
         options.format = ExportFormat::PathList;
+    if (options.isForSpreadsheet && options.format != ExportFormat::Csv)
+        throw UsageError("--spreadsheet needs --format csv");
 }
 
 } // namespace

@@ -40,6 +40,7 @@ struct AppOptions {
     std::string file;
     std::optional<std::string> technology; // its technology constant
     ExportFormat format = ExportFormat::JsonLines;
+    bool isForSpreadsheet = false; // of CSV: no cell is taken for a formula
     bool listsPaths = false;
     std::vector<std::string> paths; // none: every row
 

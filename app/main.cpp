@@ -21,6 +21,7 @@
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/ports/FramePorts.h"
 #include "platform/ports/FrameTelephonyServer.h"
+#include "platform/services/Complaint.h"
 #include "platform/services/Uuid.h"
 #include "recordings/LogRecorder.h"
 #include "screens/terminal/TerminalKind.h"
@@ -134,10 +135,7 @@ int run(const AppOptions& options, FrontEndKind kind)
 
 } // namespace
 
-void orvane::complain(const std::string& text)
-{
-    std::fprintf(stderr, "orvane: %s\n", text.c_str());
-}
+void orvane::complain(const std::string& text) { printComplaint("orvane", text); }
 
 int main(int argc, char** argv)
 {

@@ -28,7 +28,7 @@ bool CsvRowWriter::takePeriod(const std::string& time, const RowTable& table)
             continue;
         _spool.putNumber(static_cast<std::uint32_t>(i));
         if (table.isPresent(row)) {
-            const std::string text = shownText(row.text);
+            const std::string text = printableText(row.text);
             _units[i].take(text);
             _spool.putNumber(kThere);
             _spool.putText(text);
@@ -61,11 +61,11 @@ std::string CsvRowWriter::header(const RowTable& table, const std::vector<std::s
 {
     std::string line = "time";
     for (const std::size_t row : order) {
-        std::string name = shownText(table.rows()[row].path);
+        std::string name = printableText(table.rows()[row].path);
         if (const auto unit = _units[row].unit(); unit && !unit->empty())
             ((name += " [") += *unit) += ']';
         line += ',';
-        appendCsvField(line, name);
+        appendCell(line, name);
     }
     return line += '\n';
 }
@@ -84,7 +84,7 @@ void CsvRowWriter::writeLines(const std::vector<std::size_t>& order)
         }
         for (const std::size_t row : order) {
             line += ',';
-            appendCsvField(line, field(row, texts[row]));
+            appendCell(line, field(row, texts[row]));
         }
         line += '\n';
         if (_spool.error() != 0 || !_output(line))
@@ -96,6 +96,25 @@ std::string_view CsvRowWriter::field(std::size_t row, const std::string& text) c
 {
     const auto parts = _units[row].unit() ? numberWithUnit(text) : std::nullopt;
     return parts ? parts->number : std::string_view(text);
+}
+
+void CsvRowWriter::appendCell(std::string& to, std::string_view text) const
+{
+    if (_cells == Cells::ForSpreadsheet && isFormulaOfSpreadsheets(text))
+        appendCsvField(to, "'" + std::string(text));
+    else
+        appendCsvField(to, text);
+}
+
+bool isFormulaOfSpreadsheets(std::string_view text)
+{
+    // What follows blanks counts: they may be taken away on the way into the spreadsheet.
+    const std::size_t first = text.find_first_not_of(" \t");
+    if (first == std::string_view::npos ||
+        std::string_view("=+-@").find(text[first]) == std::string_view::npos)
+        return text.starts_with('\t');
+    const auto number = numberWithUnit(text);
+    return !number || !number->unit.empty();
 }
 
 void appendCsvField(std::string& to, std::string_view text)

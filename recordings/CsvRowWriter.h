@@ -18,7 +18,15 @@ namespace orvane
 class CsvRowWriter final : public RowWriter
 {
 public:
-    explicit CsvRowWriter(Output output) : _output(std::move(output)) {}
+    enum class Cells {
+        Exact,
+        ForSpreadsheet // those that would be taken for formulas begin with an apostrophe
+    };
+
+    explicit CsvRowWriter(Output output, Cells cells = Cells::Exact)
+        : _output(std::move(output)), _cells(cells)
+    {
+    }
 
     bool takePeriod(const std::string& time, const RowTable& table) override;
     void finish(const RowTable& table) override;
@@ -28,12 +36,18 @@ private:
     [[nodiscard]] std::string header(const RowTable& table,
                                      const std::vector<std::size_t>& order) const;
     [[nodiscard]] std::string_view field(std::size_t row, const std::string& text) const;
+    void appendCell(std::string& to, std::string_view text) const;
     void writeLines(const std::vector<std::size_t>& order);
 
     Output _output;
+    Cells _cells;
     RowSpool _spool;
     std::vector<CommonUnit> _units; // by row
 };
+
+// Whether a spreadsheet may take the cell for a formula: it begins with =, +, -, @ or a tab and is
+// not just a number.
+bool isFormulaOfSpreadsheets(std::string_view text);
 
 // Appends the text as a field: in quotation marks where it holds one, a comma or a line's end.
 void appendCsvField(std::string& to, std::string_view text);

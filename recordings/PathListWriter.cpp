@@ -9,7 +9,7 @@ void PathListWriter::finish(const RowTable& table)
 {
     for (const std::size_t i : table.order()) {
         const RowTable::Row& row = table.rows()[i];
-        if (row.lastPeriod != 0 && !_output(shownText(row.path) + "\n"))
+        if (row.lastPeriod != 0 && !_output(printableText(row.path) + "\n"))
             return;
     }
 }

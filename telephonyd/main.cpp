@@ -11,6 +11,7 @@
 #include "platform/linux/SocketTransport.h"
 #include "platform/linux/StalePorts.h"
 #include "platform/linux/StandardDescriptors.h"
+#include "platform/services/Complaint.h"
 #include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
 #include "telephonyd/DaemonOptions.h"
@@ -38,7 +39,7 @@ constexpr int kFailure = 1;
 constexpr int kUnusableArguments = 2;
 constexpr auto kCleaningInterval = std::chrono::minutes(1);
 
-void complain(const std::string& text) { std::fprintf(stderr, "telephonyd: %s\n", text.c_str()); }
+void complain(const std::string& text) { printComplaint("telephonyd", text); }
 
 // Null, with a complaint, when the recording cannot be served.
 LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)

@@ -64,11 +64,13 @@ private:
     std::string _pending;
 };
 
-std::unique_ptr<RowWriter> makeWriter(ExportFormat format, RowWriter::Output output)
+std::unique_ptr<RowWriter> makeWriter(const AppOptions& options, RowWriter::Output output)
 {
-    switch (format) {
+    using Cells = CsvRowWriter::Cells;
+    switch (options.format) {
     case ExportFormat::Csv:
-        return std::make_unique<CsvRowWriter>(std::move(output));
+        return std::make_unique<CsvRowWriter>(
+            std::move(output), options.isForSpreadsheet ? Cells::ForSpreadsheet : Cells::Exact);
     case ExportFormat::PathList:
         return std::make_unique<PathListWriter>(std::move(output));
     case ExportFormat::JsonLines:
@@ -81,8 +83,8 @@ std::unique_ptr<RowWriter> makeWriter(ExportFormat format, RowWriter::Output out
 int exportRecording(const AppOptions& options)
 {
     Output output;
-    const auto writer = makeWriter(
-        options.format, [&output](std::string_view lines) { return output.write(lines); });
+    const auto writer =
+        makeWriter(options, [&output](std::string_view lines) { return output.write(lines); });
     auto progress = progressOnTerminal("Reading " + options.file);
     ExportRequest request{options.file, options.technology, options.refreshInterval, options.paths};
     RecordingExport recordingExport(std::move(request), *writer, [&progress](double done) {

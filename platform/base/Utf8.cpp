@@ -16,7 +16,18 @@ bool isNoCharacter(std::string_view sequence)
     return sequence == "\xEF\xBF\xBE" || sequence == "\xEF\xBF\xBF";
 }
 
-bool isControl(unsigned char byte) { return (byte < 0x20 && byte != '\t') || byte == 0x7F; }
+bool isLineEnd(char32_t character)
+{
+    return (character >= '\n' && character <= '\r') || character == 0x85 || character == 0x2028 ||
+           character == 0x2029;
+}
+
+bool isDirectionControl(char32_t character)
+{
+    return character == 0x061C || character == 0x200E || character == 0x200F ||
+           (character >= 0x202A && character <= 0x202E) ||
+           (character >= 0x2066 && character <= 0x2069);
+}
 
 // Calls `append` for each whole character and puts U+FFFD in place of each other byte.
 template <typename Append>
@@ -118,10 +129,41 @@ std::string validText(std::string_view text)
 std::string shownText(std::string_view text)
 {
     return transformed(text, [](std::string& to, std::string_view sequence) {
-        if (isControl(static_cast<unsigned char>(sequence.front())))
+        const auto first = static_cast<unsigned char>(sequence.front());
+        if (first < 0x80 && first != '\t' && isControlCharacter(first))
             to += ' ';
         else
             to += isNoCharacter(sequence) ? kReplacement : sequence;
+    });
+}
+
+char32_t utf8Character(std::string_view text, std::size_t length)
+{
+    const auto byteAt = [text](std::size_t at) { return static_cast<unsigned char>(text[at]); };
+    if (length <= 1)
+        return byteAt(0);
+    // The first byte has 5, 4 or 3 bits of the character, each other one 6.
+    char32_t character = byteAt(0) & (0x7FU >> length);
+    for (std::size_t i = 1; i < length; ++i)
+        character = character << 6 | (byteAt(i) & 0x3FU);
+    return character;
+}
+
+bool isControlCharacter(char32_t character)
+{
+    return character < 0x20 || (character >= 0x7F && character <= 0x9F);
+}
+
+std::string printableText(std::string_view text)
+{
+    return transformed(text, [](std::string& to, std::string_view sequence) {
+        const char32_t character = utf8Character(sequence, sequence.size());
+        if (character == '\t' || isLineEnd(character))
+            to += ' ';
+        else if (isControlCharacter(character) || isNoCharacter(sequence))
+            to += kReplacement;
+        else if (!isDirectionControl(character))
+            to += sequence;
     });
 }
 

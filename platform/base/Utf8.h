@@ -27,9 +27,23 @@ void appendUtf8(std::string& to, std::uint32_t character);
 // The text with every byte that is not part of well-formed UTF-8 replaced by U+FFFD.
 std::string validText(std::string_view text);
 
-// The text made fit for one line of a screen and for XML: every byte that is not part of
-// well-formed UTF-8, U+FFFE and U+FFFF become U+FFFD; every control character but the tab becomes a
-// blank.
+// The text made fit for one line of a file and for XML: every byte that is not part of well-formed
+// UTF-8, U+FFFE and U+FFFF become U+FFFD; every control character of ASCII but the tab becomes a
+// blank. For a terminal use printableText().
 std::string shownText(std::string_view text);
+
+// The text as it may be sent to a terminal, on one line, whoever wrote it. Tabs and the ends of
+// lines and paragraphs become blanks. The other control characters (C0, DEL, and C1 from U+0080 to
+// U+009F), bytes that are not well-formed UTF-8, U+FFFE and U+FFFF become U+FFFD. Controls of the
+// writing direction are left out: they could show a text in another order than it is in.
+std::string printableText(std::string_view text);
+
+// Whether the character is a control character: C0 (U+0000 to U+001F), DEL, or C1 (U+0080 to
+// U+009F).
+bool isControlCharacter(char32_t character);
+
+// The character that the text starts with; the text starts with `length` bytes of well-formed UTF-8
+// for one character (utf8CharacterLength), 1 to 4.
+char32_t utf8Character(std::string_view text, std::size_t length);
 
 } // namespace orvane

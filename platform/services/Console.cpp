@@ -1,6 +1,7 @@
 #include "platform/services/Console.h"
 
 #include "platform/base/FormatText.h"
+#include "platform/base/Utf8.h"
 #include "platform/services/Services.h"
 
 #include <cstdarg>
@@ -12,7 +13,7 @@ namespace orvane
 
 void StreamConsole::writeLine(std::string_view line)
 {
-    std::string text(line);
+    std::string text = printableText(line);
     text += '\n';
     std::fwrite(text.data(), 1, text.size(), _stream);
 }

@@ -6,16 +6,17 @@
 namespace orvane
 {
 
-// The one sink for lines that are meant for a person at the console, apart from the data that a
-// front end writes to standard output.
+// Where lines for a person at the console go, apart from the data that a front end writes to
+// standard output.
 class Console
 {
 public:
     virtual ~Console() = default;
-    // One line, without its newline. May be called from any thread.
+    // One line, without its newline, from any thread.
     virtual void writeLine(std::string_view line) = 0;
 };
 
+// Writes lines as printableText() makes them.
 class StreamConsole final : public Console
 {
 public:

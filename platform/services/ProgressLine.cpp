@@ -1,13 +1,15 @@
 #include "platform/services/ProgressLine.h"
 
+#include "platform/base/Utf8.h"
+
 #include <algorithm>
 #include <utility>
 
 namespace orvane
 {
 
-ProgressLine::ProgressLine(std::string task, Write write)
-    : _task(std::move(task)), _write(std::move(write))
+ProgressLine::ProgressLine(std::string_view task, Write write)
+    : _task(printableText(task)), _write(std::move(write))
 {
 }
 

@@ -7,14 +7,15 @@
 namespace orvane
 {
 
-// A line on a terminal that tells how far a long task has come: "Reading drive.dlf: 42 %". Written
-// anew for each whole percent, and wiped once all is done.
+// A line on a terminal that tells how far a long task has come: "Reading drive.dlf: 42 %". It is
+// written again at each whole percent and wiped at the end.
 class ProgressLine
 {
 public:
     using Write = std::function<void(std::string_view text)>;
 
-    ProgressLine(std::string task, Write write);
+    // `task` may hold any text, such as a file's name.
+    ProgressLine(std::string_view task, Write write);
     ~ProgressLine();
     ProgressLine(const ProgressLine&) = delete;
     ProgressLine& operator=(const ProgressLine&) = delete;

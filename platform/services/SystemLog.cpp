@@ -1,9 +1,9 @@
 #include "platform/services/SystemLog.h"
 
 #include "platform/base/FormatText.h"
+#include "platform/base/Utf8.h"
 #include "platform/services/Services.h"
 
-#include <algorithm>
 #include <cstdarg>
 #include <cstdio>
 #include <string>
@@ -61,9 +61,8 @@ void StandardErrorLog::write(LogPriority priority, std::string_view text)
     // One call a line, so that lines of several threads and processes do not mix.
     std::string line = logPriorityName(priority);
     line += ": ";
-    line += withoutNewline(text);
-    // One line each, also where a text from elsewhere is part of it.
-    std::replace(line.begin(), line.end(), '\n', ' ');
+    // Texts of files and of the network may be part of it.
+    line += printableText(withoutNewline(text));
     line += '\n';
     std::fwrite(line.data(), 1, line.size(), stderr);
 }

@@ -40,7 +40,7 @@ public:
     void write(LogPriority, std::string_view) override {}
 };
 
-// Writes "PRIORITY: TEXT" lines to standard error.
+// Writes "PRIORITY: TEXT" lines to standard error, as printableText() makes them.
 class StandardErrorLog final : public SystemLog
 {
 public:

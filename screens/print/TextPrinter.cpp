@@ -11,9 +11,9 @@ namespace
 void appendOutline(std::string& to, const OrvaneModelNode& node, std::size_t level)
 {
     to.append(2 * level, ' ');
-    to += shownText(node.displayName());
+    to += printableText(node.displayName());
     if (const std::string* value = node.value())
-        to += ": " + shownText(*value);
+        to += ": " + printableText(*value);
     to += '\n';
     if (const auto* children = node.childNodes())
         for (const NodePointer& child : *children)
@@ -28,7 +28,7 @@ std::string block(std::string lines) { return lines + "\n"; }
 std::string TextPrinter::statusOutput(const std::string& status, bool,
                                       const OrvaneModelNode* tree) const
 {
-    std::string lines = status + (_isSimulated ? " (simulated phone)\n" : "\n");
+    std::string lines = printableText(status) + (_isSimulated ? " (simulated phone)\n" : "\n");
     if (tree)
         appendOutline(lines, *tree, 0);
     return block(std::move(lines));
@@ -36,22 +36,22 @@ std::string TextPrinter::statusOutput(const std::string& status, bool,
 
 std::string TextPrinter::savedOutput(const std::string& path) const
 {
-    return block("Saved to " + shownText(path) + "\n");
+    return block("Saved to " + printableText(path) + "\n");
 }
 
 std::string TextPrinter::alertOutput(const std::string& title, const std::string& message) const
 {
-    return block(title + ": " + message + "\n");
+    return block(printableText(title) + ": " + printableText(message) + "\n");
 }
 
 std::string TextPrinter::errorOutput(const std::string& text) const
 {
-    return block("Error: " + shownText(text) + "\n");
+    return block("Error: " + printableText(text) + "\n");
 }
 
 std::string TextPrinter::noteOutput(const std::string& text) const
 {
-    return block(shownText(text) + "\n");
+    return block(printableText(text) + "\n");
 }
 
 } // namespace orvane

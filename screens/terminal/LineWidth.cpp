@@ -37,12 +37,11 @@ private:
     locale_t _earlier;
 };
 
-// What changes the direction of text or joins characters into one: terminals differ in how many
-// columns it then takes.
+// Characters without a form of their own, such as joiners and variation selectors: terminals differ
+// in how many columns a text with them takes.
 bool isInvisible(char32_t character)
 {
-    return character == 0xAD || (character >= 0x200B && character <= 0x200F) ||
-           (character >= 0x202A && character <= 0x202E) ||
+    return character == 0xAD || (character >= 0x200B && character <= 0x200D) ||
            (character >= 0x2060 && character <= 0x206F) ||
            (character >= 0xFE00 && character <= 0xFE0F) || character == 0xFEFF ||
            (character >= 0xE0000 && character <= 0xE0FFF);
@@ -61,17 +60,11 @@ std::u32string lowered(std::string_view text)
 
 std::u32string decoded(std::string_view text)
 {
-    const std::string valid = validText(text);
     std::u32string result;
-    for (std::size_t at = 0; at < valid.size();) {
-        const auto first = static_cast<unsigned char>(valid[at++]);
-        char32_t character = first < 0x80   ? first
-                             : first < 0xE0 ? first & 0x1FU
-                             : first < 0xF0 ? first & 0x0FU
-                                            : first & 0x07U;
-        for (; at < valid.size() && (static_cast<unsigned char>(valid[at]) & 0xC0) == 0x80; ++at)
-            character = character << 6 | (static_cast<unsigned char>(valid[at]) & 0x3FU);
-        result += character;
+    while (!text.empty()) {
+        const std::size_t length = utf8CharacterLength(text);
+        result += length == 0 ? kReplacement : utf8Character(text, length);
+        text.remove_prefix(length == 0 ? 1 : length);
     }
     return result;
 }
@@ -79,25 +72,8 @@ std::u32string decoded(std::string_view text)
 std::string encoded(std::u32string_view text)
 {
     std::string result;
-    const auto put = [&](char32_t byte) { result += static_cast<char>(byte); };
-    for (const char32_t character : text) {
-        if (character < 0x80) {
-            put(character);
-            continue;
-        }
-        if (character < 0x800) {
-            put(0xC0 | character >> 6);
-        } else {
-            if (character < 0x10000) {
-                put(0xE0 | character >> 12);
-            } else {
-                put(0xF0 | character >> 18);
-                put(0x80 | (character >> 12 & 0x3F));
-            }
-            put(0x80 | (character >> 6 & 0x3F));
-        }
-        put(0x80 | (character & 0x3F));
-    }
+    for (const char32_t character : text)
+        appendUtf8(result, character);
     return result;
 }
 
@@ -115,11 +91,9 @@ std::vector<Glyph> glyphsOf(std::string_view text)
 {
     std::vector<Glyph> glyphs;
     std::size_t combining = 0;
-    for (char32_t character : decoded(text)) {
+    for (char32_t character : decoded(printableText(text))) {
         if (isInvisible(character))
             continue;
-        if (character == '\t' || character == '\n' || character == '\r')
-            character = ' ';
         int columns = columnsOf(character);
         if (columns < 0) {
             character = kReplacement;

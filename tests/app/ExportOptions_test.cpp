@@ -62,6 +62,16 @@ TEST(ExportOptionsTest, TakesEachOption)
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
 }
 
+TEST(ExportOptionsTest, CsvCanBeForASpreadsheet)
+{
+    EXPECT_FALSE(parsed({"f", "/a"}).isForSpreadsheet);
+    for (const ExportOptions& options :
+         {parsed({"f", "/a", "--spreadsheet"}), parsed({"f", "--format=csv", "--spreadsheet"})}) {
+        EXPECT_FALSE(options.error);
+        EXPECT_TRUE(options.isForSpreadsheet);
+    }
+}
+
 TEST(ExportOptionsTest, UnusableArgumentsSayWhatToDo)
 {
     EXPECT_THAT(errorOf({}), HasSubstr("orvane export FILE"));
@@ -69,6 +79,9 @@ TEST(ExportOptionsTest, UnusableArgumentsSayWhatToDo)
     EXPECT_THAT(errorOf({"f", ""}), HasSubstr("--list"));
     EXPECT_THAT(errorOf({"f", "--format", "xml"}), HasSubstr("csv or jsonl"));
     EXPECT_THAT(errorOf({"f", "--list", "--format", "csv"}), HasSubstr("--list"));
+    EXPECT_THAT(errorOf({"f", "--spreadsheet"}), HasSubstr("--format csv"));
+    EXPECT_THAT(errorOf({"f", "--spreadsheet", "--list", "/a"}), HasSubstr("--format csv"));
+    EXPECT_THAT(errorOf({"f", "--spreadsheet", "--format=jsonl", "/a"}), HasSubstr("--format csv"));
     EXPECT_THAT(errorOf({"f", "--technology", "gprs"}), HasSubstr("lte, umts, utran"));
     EXPECT_THAT(errorOf({"f", "--ui", "json"}), HasSubstr("--ui"));
     for (const char* period : {"0", "-1", "soon", "1e9", "nan"})

@@ -69,6 +69,14 @@ std::string longDrive(const TemporaryDirectory& directory, std::size_t bytes)
     return path;
 }
 
+TEST(OpenProgramTest, AFilesNameDoesNotActOnTheTerminal)
+{
+    const auto program = orvane({"/missing/\x1b[2J\u009b.dlf", "--ui", "text"});
+    EXPECT_EQ(program->waitForEnd(), 1);
+    EXPECT_THAT(program->errors(), HasSubstr("/missing/\uFFFD[2J\uFFFD.dlf"));
+    EXPECT_EQ(program->errors().find('\x1b'), std::string::npos);
+}
+
 TEST(OpenProgramTest, ALogIsALineAPeriodAndThenTheProgramEnds)
 {
     const auto program = orvane({recording("lte-drive.dlf"), "--ui", "json"});

@@ -52,6 +52,7 @@ protected:
         EXPECT_EQ(server->waitForEnd(), status) << all;
         EXPECT_THAT(server->lines(), IsEmpty()) << all;
         EXPECT_THAT(server->errors(), StartsWith("telephonyd: ")) << all;
+        EXPECT_EQ(server->errors().find('\x1b'), std::string::npos) << all;
         EXPECT_EQ(std::count(server->errors().begin(), server->errors().end(), '\n'), 1) << all;
     }
     [[nodiscard]] std::string ports() const { return directory.path() + "/ports"; }
@@ -115,6 +116,7 @@ TEST_F(TelephonydProgramTest, UnusableArgumentsEndItWithStatusTwo)
     expectRefusal({"--demo=lte", "--speed", "2"}, 2);
     expectRefusal({"--demo=lte", "--replay", drive}, 2);
     expectRefusal({"--demo=lte", "--log", "paper"}, 2);
+    expectRefusal({"--replay", "/missing/\x1b[2J\n.dlf"}, 1);
     expectRefusal({"--replay", drive, "--speed", "fast"}, 2);
     expectRefusal({"--replay", drive, "--technology", "smoke"}, 2);
 }

@@ -136,10 +136,54 @@ TEST_F(CsvTest, FieldsAreQuotedWhereTheyMustBe)
 TEST_F(CsvTest, APeriodIsALineWhateverTheNetworkSent)
 {
     take(csv, {
-                  {"a\nb", "x\ny\xFF"}
+                  {"a\nb", "x\ny\xFF\x1b[2J\u009b"}
     });
     finish(csv);
-    EXPECT_EQ(written, "time,/a b\n1,x y\xEF\xBF\xBD\n");
+    EXPECT_EQ(written, "time,/a b\n1,x y\uFFFD\uFFFD[2J\uFFFD\n");
+}
+
+TEST_F(CsvTest, FormulasStayAsTheyAreUnlessForASpreadsheet)
+{
+    take(csv, {
+                  {"Name", "=1+2"}
+    });
+    finish(csv);
+    EXPECT_EQ(written, "time,/Name\n1,=1+2\n");
+}
+
+TEST_F(CsvTest, ForASpreadsheetCellsThatWouldBeFormulasBeginWithAnApostrophe)
+{
+    CsvRowWriter writer(output(), CsvRowWriter::Cells::ForSpreadsheet);
+    take(
+        writer,
+        {
+            {"Name",  "=HYPERLINK(\"http://x\")"},
+            {"Mixed", "-97.50 dBm"              },
+            {"RSRP",  "-97.50 dBm"              }
+    });
+    take(writer, {
+                     {"Name",  "plain"     },
+                     {"Mixed", "n/a"       },
+                     {"RSRP",  "-98.00 dBm"}
+    });
+    take(writer, {
+                     {"Name",  "-5"},
+                     {"Mixed", "+5"}
+    });
+    finish(writer);
+    EXPECT_EQ(written, "time,/Name,/Mixed,/RSRP [dBm]\n"
+                       "1,\"'=HYPERLINK(\"\"http://x\"\")\",'-97.50 dBm,-97.50\n"
+                       "2,plain,n/a,-98.00\n"
+                       "3,-5,+5,\n");
+}
+
+TEST(SpreadsheetFormulaTest, IsToldFromNumbersAndOtherTexts)
+{
+    for (const char* formula : {"=1", "+1+1", "-1-1", "@SUM(A1)", "\t=1", "\tx", " =1", "=", "-",
+                                "-97.50 dBm", "+49 170", "--1", "-n/a"})
+        EXPECT_TRUE(isFormulaOfSpreadsheets(formula)) << formula;
+    for (const char* text : {"", " ", "-1", "+1", "-97.50", "1-2", "a=b", "'=1", "12:30", "(-1)"})
+        EXPECT_FALSE(isFormulaOfSpreadsheets(text)) << text;
 }
 
 TEST_F(CsvTest, WithoutPeriodsThereIsTheHeader)

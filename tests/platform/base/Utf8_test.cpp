@@ -81,5 +81,47 @@ TEST(ShownTextTest, KeepsWhatIsWellFormedAndReplacesTheRest)
         EXPECT_EQ(shownText(text.text), text.shown);
 }
 
+TEST(PrintableTextTest, HasNothingThatATerminalObeys)
+{
+    const struct {
+        std::string_view text;
+        const char* printed;
+    } kCases[] = {
+        {"plain",                           "plain"                          },
+        {"12 × 64 chips, Größe, 世界", "12 × 64 chips, Größe, 世界"},
+        {"\xF0\x9F\x93\xB6 ok",             "\xF0\x9F\x93\xB6 ok"            },
+        {"\x1b]0;title\x07",                "\uFFFD]0;title\uFFFD"           },
+        {"a\x1b[2Jb",                       "a\uFFFD[2Jb"                    },
+        {"rub\x7fout",                      "rub\uFFFDout"                   },
+        {"\u009b31m \u0080 \u009f",         "\uFFFD31m \uFFFD \uFFFD"        },
+        {"\u00a0",                          "\u00a0"                         },
+        {"a\tb\nc\rd\ve\ff",                "a b c d e f"                    },
+        {"a\u0085b\u2028c\u2029d",          "a b c d"                        },
+        {"gpj.\u202efdp",                   "gpj.fdp"                        },
+        {"\u061c\u200e\u200f\u202a\u202d",  ""                               },
+        {"\u2066\u2067\u2068\u2069",        ""                               },
+        {"a\u200bb",                        "a\u200bb"                       },
+        {"bad\xFFone",                      "bad\uFFFDone"                   },
+        {"a raw\x9b[2J",                    "a raw\uFFFD[2J"                 },
+        {"cut\xC2",                         "cut\uFFFD"                      },
+        {"a\xEF\xBF\xBE",                   "a\uFFFD"                        },
+        {"",                                ""                               },
+    };
+    for (const auto& text : kCases)
+        EXPECT_EQ(printableText(text.text), text.printed);
+    EXPECT_EQ(printableText(std::string_view("a\0b", 3)), "a\uFFFDb");
+}
+
+TEST(Utf8CharacterTest, IsReadFromItsBytes)
+{
+    for (const char32_t character : {U'a', U'\x7f', U'\u0080', U'\u07ff', U'\u0800', U'\uffff',
+                                     U'\U00010000', U'\U0010ffff'}) {
+        std::string text;
+        appendUtf8(text, character);
+        text += "rest";
+        EXPECT_EQ(utf8Character(text, utf8CharacterLength(text)), character);
+    }
+}
+
 } // namespace
 } // namespace orvane

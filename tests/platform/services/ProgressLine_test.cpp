@@ -44,6 +44,14 @@ TEST_F(ProgressLineTest, IsWipedAtTheEndOfAnUnfinishedTask)
     EXPECT_EQ(written, "\r             \r");
 }
 
+TEST_F(ProgressLineTest, TheTaskMayNameAnyFile)
+{
+    ProgressLine evil("Reading a\x1b[2J\u009b.dlf",
+                      [this](std::string_view text) { written += text; });
+    evil.show(0.5);
+    EXPECT_EQ(written, "\rReading a\uFFFD[2J\uFFFD.dlf: 50 %");
+}
+
 TEST_F(ProgressLineTest, ATaskDoneAtOnceShowsNothing)
 {
     line->show(1);

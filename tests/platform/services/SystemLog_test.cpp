@@ -60,6 +60,12 @@ TEST(SystemLogTest, NewlineAtTheEndOfTheTextIsNotPartOfTheLine)
     EXPECT_EQ(writtenToStandardError(LogPriority::Error, "\n"), "error: \n");
 }
 
+TEST(SystemLogTest, NothingOnStandardErrorActsOnATerminal)
+{
+    EXPECT_EQ(writtenToStandardError(LogPriority::Error, "a\x1b[2J\u009b\u202e\xff"),
+              "error: a\uFFFD[2J\uFFFD\uFFFD\n");
+}
+
 TEST(SystemLogTest, LinesAreFormattedAsPrintfDoes)
 {
     const TestServices services;

@@ -129,6 +129,8 @@ TEST(JsonText, EscapesWhatJsonCannotHold)
         {"12 × 64chips",    "\"12 × 64chips\""        },
         {"\xF0\x9F\x93\xB6", "\"\xF0\x9F\x93\xB6\""     },
         {"bad \xFF byte",    "\"bad \xEF\xBF\xBD byte\""},
+        {"\x7f\u0080\u009b", "\"\\u007f\\u0080\\u009b\""},
+        {"\u00a0\u202e",     "\"\u00a0\u202e\""         },
     };
     for (const auto& escape : kCases) {
         std::string json;
@@ -169,6 +171,24 @@ TEST_F(TextPrinterTest, AnswersInWords)
     EXPECT_EQ(output, "Saved to /root/a.orvane\n\n"
                       "File Error: Unable to write file to disk\n\n"
                       "Error: unknown command \"x\"\n\n");
+}
+
+TEST_F(TextPrinterTest, NothingPrintedActsOnATerminal)
+{
+    TextPrinter pane = make();
+    const std::string evil = "a\x1b[2J\u009bb\u202ec";
+    const std::string harmless = "a\uFFFD[2J\uFFFDbc";
+    pane.reloadWithNode(tree(PropertyValue::dictionaryOf({
+        {evil, evil}
+    })));
+    pane.setStatus(evil, false);
+    pane.showAlert(evil, evil);
+    pane.showSaved(evil);
+    pane.showError(evil);
+    pane.showNote(evil);
+    EXPECT_EQ(output, harmless + "\nOrvane\n  " + harmless + ": " + harmless + "\n\n" + harmless +
+                          ": " + harmless + "\n\n" + "Saved to " + harmless + "\n\n" +
+                          "Error: " + harmless + "\n\n" + harmless + "\n\n");
 }
 
 TEST_F(TextPrinterTest, ARowStaysOnItsLine)

@@ -54,6 +54,8 @@ TEST(LineWidthTest, NothingThatATerminalWouldObeyIsLeft)
     EXPECT_EQ(shownAs("\u009b31m"), "\uFFFD31m") << "also the control characters beyond ASCII";
     EXPECT_EQ(shownAs("a\tb\nc\rd"), "a b c d");
     EXPECT_EQ(shownAs("a\u202eb\u200dc\ufe0f"), "abc") << "nothing reorders or joins";
+    EXPECT_EQ(shownAs("a\u061cb\u200fc\u2069d"), "abcd") << "controls of the writing direction";
+    EXPECT_EQ(shownAs("a\u0085b\u2028c"), "a b c") << "ends of lines beyond ASCII";
     EXPECT_EQ(shownAs("a\xff\xc3"), "a\uFFFD\uFFFD") << "bytes that are no UTF-8";
     EXPECT_EQ(shownAs(std::string("a\0b", 3)), "a\uFFFDb");
 }
