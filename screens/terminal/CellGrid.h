@@ -8,17 +8,18 @@
 namespace orvane
 {
 
-// What a piece of text is; a terminal decides how it looks.
+// What a piece of text is. The terminal decides how it looks.
 enum class Ink {
     Plain,
     Quiet,   // less important than the rest
     Key,     // the name of a row, of a key to press
-    Changed, // a value that is not what it was
+    Changed, // a value that the latest refresh changed
     Bar,     // the title line
     BarQuiet,
     Status, // the lines at the foot
     StatusKey,
     Warning,
+    Mark, // a sign that is not a text, such as a bar
 };
 
 struct Style {

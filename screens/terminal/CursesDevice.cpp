@@ -211,13 +211,18 @@ void CursesDevice::suspend()
     struct sigaction plain {
     };
     plain.sa_handler = SIG_DFL;
-    struct sigaction earlier {
+    struct sigaction earlierStop {
     };
-    // All processes of the job, as Ctrl-Z does. Not SIGSTOP: where nobody could let them go on, the
-    // system ignores this one.
-    ::sigaction(SIGTSTP, &plain, &earlier);
+    struct sigaction earlierContinue {
+    };
+    // Stops all processes of the job, as Ctrl-Z does. Unlike SIGSTOP, the system ignores this
+    // signal where nobody could let the job go on. The SIGCONT that follows is not handled: the
+    // terminal is retaken here.
+    ::sigaction(SIGTSTP, &plain, &earlierStop);
+    ::sigaction(SIGCONT, &plain, &earlierContinue);
     ::kill(0, SIGTSTP);
-    ::sigaction(SIGTSTP, &earlier, nullptr);
+    ::sigaction(SIGTSTP, &earlierStop, nullptr);
+    ::sigaction(SIGCONT, &earlierContinue, nullptr);
     retake();
 }
 

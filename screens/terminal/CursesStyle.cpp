@@ -8,10 +8,7 @@ namespace orvane
 namespace
 {
 
-constexpr short kBarPair = 1;
-constexpr short kChangedPair = 2;
-constexpr short kWarningPair = 3;
-constexpr short kKeyPair = 4;
+constexpr short kMarkPair = 1;
 
 } // namespace
 
@@ -22,10 +19,7 @@ CursesStyle::CursesStyle()
     if (!_hasColours)
         return;
     use_default_colors();
-    init_pair(kBarPair, COLOR_WHITE, COLOR_BLUE);
-    init_pair(kChangedPair, COLOR_GREEN, -1);
-    init_pair(kWarningPair, COLOR_RED, -1);
-    init_pair(kKeyPair, COLOR_CYAN, -1);
+    init_pair(kMarkPair, COLOR_CYAN, -1);
 }
 
 attr_t CursesStyle::attributes(Style style) const
@@ -41,34 +35,22 @@ attr_t CursesStyle::attributes(Style style) const
         case Ink::Changed:
         case Ink::StatusKey:
         case Ink::Warning:
+        case Ink::Mark:
             return A_BOLD;
         case Ink::Bar:
-            return _hasColours ? A_BOLD : A_BOLD | A_REVERSE;
+            return A_BOLD | A_REVERSE;
         case Ink::BarQuiet:
-            return _hasColours ? A_NORMAL : A_REVERSE;
+            return A_REVERSE;
         }
         return A_NORMAL;
     };
-    return style.isSelected ? usual() | A_REVERSE : usual();
+    // On a reversed bar, the selected part is the one that is not reversed.
+    return style.isSelected ? usual() ^ A_REVERSE : usual();
 }
 
 short CursesStyle::pair(Style style) const
 {
-    if (!_hasColours)
-        return 0;
-    switch (style.ink) {
-    case Ink::Bar:
-    case Ink::BarQuiet:
-        return kBarPair;
-    case Ink::Changed:
-        return kChangedPair;
-    case Ink::Warning:
-        return kWarningPair;
-    case Ink::StatusKey:
-        return kKeyPair;
-    default:
-        return 0;
-    }
+    return _hasColours && style.ink == Ink::Mark && !style.isSelected ? kMarkPair : 0;
 }
 
 } // namespace orvane

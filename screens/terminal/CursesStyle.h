@@ -7,8 +7,9 @@
 namespace orvane
 {
 
-// How each kind of text looks: in colour where the terminal has colours and NO_COLOR is not set,
-// else by weight and reversal alone.
+// How each kind of text looks. Texts keep the terminal's own colours, which its user can read, and
+// stand out by weight and reversal. Only marks are coloured, where the terminal has colours and
+// NO_COLOR is not set.
 class CursesStyle
 {
 public:

@@ -14,37 +14,6 @@ namespace
 constexpr int kWidestAlert = 56;
 constexpr int kKeyColumns = 18;
 
-struct HelpLine {
-    const char* keys;
-    const char* what;
-};
-
-constexpr HelpLine kHelp[] = {
-    {"Up Down k j",      "a row up, down"      },
-    {"PgUp PgDn",        "a screen up, down"   },
-    {"Home End",         "first row, last row" },
-    {"Enter Right l",    "open the row"        },
-    {"Left h Backspace", "back"                },
-    {"Escape",           "all rows, then back" },
-    {"Right Left",       "scroll a long value" },
-    {"/",                "filter as you type"  },
-    {"s",                "save a snapshot"     },
-    {"?",                "these keys"          },
-    {"q",                "quit"                },
-    {"Ctrl-L",           "draw the screen anew"},
-    {"Mouse",            "click and wheel"     },
-};
-
-constexpr HelpLine kPlaybackHelp[] = {
-    {"Space", "play, pause"          },
-    {". ,",   "a step on, back"      },
-    {"+ -",   "faster, slower"       },
-    {"g",     "go to a time"         },
-    {"n",     "next serving cell"    },
-    {"0 G",   "start, end"           },
-    {"x",     "stop reading the file"},
-};
-
 } // namespace
 
 AlertPage::AlertPage(std::string title, std::string message, std::string button,
@@ -91,24 +60,20 @@ std::vector<Hint> AlertPage::hints(const Marks&) const
     };
 }
 
-HelpPage::HelpPage(bool hasPlayback, std::function<void()> close)
-    : _hasPlayback(hasPlayback), _close(std::move(close))
+HelpPage::HelpPage(std::vector<KeyHelp> keys, std::function<void()> close)
+    : _keys(std::move(keys)), _close(std::move(close))
 {
 }
 
 void HelpPage::draw(Canvas& canvas, Lines area)
 {
-    std::vector<HelpLine> lines;
-    if (_hasPlayback)
-        lines.insert(lines.end(), std::begin(kPlaybackHelp), std::end(kPlaybackHelp));
-    lines.insert(lines.begin(), std::begin(kHelp), std::end(kHelp));
-    _most = std::max(static_cast<int>(lines.size()) - area.count, 0);
+    _most = std::max(static_cast<int>(_keys.size()) - area.count, 0);
     _first = std::clamp(_first, 0, _most);
     canvas.grid.clear(area.first, area.count);
     const int keyColumns = std::min(kKeyColumns, canvas.columns() / 2);
-    const int count = std::min(area.count, static_cast<int>(lines.size()) - _first);
+    const int count = std::min(area.count, static_cast<int>(_keys.size()) - _first);
     for (int i = 0; i < count; ++i) {
-        const HelpLine& help = lines[static_cast<std::size_t>(_first + i)];
+        const KeyHelp& help = _keys[static_cast<std::size_t>(_first + i)];
         const int line = area.first + i;
         canvas.grid.put(line, 1, shortened(help.keys, keyColumns - 2, canvas.marks.cut),
                         {Ink::StatusKey, false});

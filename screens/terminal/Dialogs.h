@@ -9,7 +9,7 @@
 namespace orvane
 {
 
-// An alert in the middle of the screen, over what was there.
+// An alert in the middle of the screen, over the other pages.
 class AlertPage final : public Page
 {
 public:
@@ -27,21 +27,21 @@ private:
     std::function<void()> _dismiss;
 };
 
-// The list of all keys, scrolled where it is longer than the screen.
+// A list of keys, which scrolls if it is longer than the screen.
 class HelpPage final : public Page
 {
 public:
-    HelpPage(bool hasPlayback, std::function<void()> close);
+    HelpPage(std::vector<KeyHelp> keys, std::function<void()> close);
 
     void draw(Canvas& canvas, Lines area) override;
     bool take(const Key& key) override;
     [[nodiscard]] std::vector<Hint> hints(const Marks& marks) const override;
 
 private:
-    bool _hasPlayback;
+    std::vector<KeyHelp> _keys;
     std::function<void()> _close;
     int _first = 0;
-    int _most = 0; // that _first can be
+    int _most = 0; // the largest value of _first
 };
 
 } // namespace orvane

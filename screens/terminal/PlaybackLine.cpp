@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstdio>
+#include <iterator>
 
 namespace orvane
 {
@@ -36,7 +37,7 @@ void drawBar(Canvas& canvas, int line, CellGrid::Span span, double fraction)
     for (int i = 0; i < width; ++i)
         canvas.grid.put(line, span.first + i,
                         i < done ? canvas.marks.barDone : canvas.marks.barLeft,
-                        {i < done ? Ink::StatusKey : Ink::Quiet, false});
+                        {i < done ? Ink::Mark : Ink::Quiet, false});
 }
 
 void drawReading(Canvas& canvas, int line, const Playback& playback)
@@ -53,7 +54,7 @@ void drawPosition(Canvas& canvas, int line, Playback& playback)
 {
     const Style plain{Ink::Status, false};
     const std::string& mark = playback.isPlaying() ? canvas.marks.play : canvas.marks.pause;
-    int start = canvas.grid.put(line, 1, mark, {Ink::StatusKey, false});
+    int start = canvas.grid.put(line, 1, mark, {Ink::Mark, false});
     start = canvas.grid.put(line, start,
                             (playback.isPlaying() ? " playing " : " paused ") +
                                 std::to_string(std::lround(playback.speed())) + "x",
@@ -134,6 +135,25 @@ void PlaybackLine::draw(Canvas& canvas, Lines area, Playback* playback)
         canvas.grid.put(area.first + 1, 1,
                         shortened(playback->remark(), canvas.columns() - 2, canvas.marks.cut),
                         {Ink::Warning, false});
+}
+
+void PlaybackLine::addKeys(std::vector<KeyHelp>& keys, const Playback* playback)
+{
+    if (!playback)
+        return;
+    if (isReading(*playback)) {
+        keys.push_back({"x", "stop reading the file"});
+        return;
+    }
+    const KeyHelp all[] = {
+        {"Space", "play, pause"      },
+        {". ,",   "a step on, back"  },
+        {"+ -",   "faster, slower"   },
+        {"g",     "go to a time"     },
+        {"n",     "next serving cell"},
+        {"0 G",   "start, end"       },
+    };
+    keys.insert(keys.end(), std::begin(all), std::end(all));
 }
 
 void PlaybackLine::addHints(std::vector<Hint>& hints, const Playback* playback)

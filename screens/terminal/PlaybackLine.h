@@ -1,6 +1,7 @@
 #pragma once
 
 #include "screens/terminal/Canvas.h"
+#include "screens/terminal/Page.h"
 #include "screens/terminal/TextEditor.h"
 
 #include <optional>
@@ -12,14 +13,16 @@ namespace orvane
 
 class Playback;
 
-// The controls of a recording: a line that shows where it stands, a further one for what a person
-// should know about the file, and keys.
+// The controls of a recording: a line with its position, a second one for remarks about the file,
+// and keys.
 class PlaybackLine
 {
 public:
     // All operations do nothing where there is no recording.
     [[nodiscard]] static int linesNeeded(const Playback* playback);
     static void draw(Canvas& canvas, Lines area, Playback* playback);
+    // The keys that work now.
+    static void addKeys(std::vector<KeyHelp>& keys, const Playback* playback);
     static void addHints(std::vector<Hint>& hints, const Playback* playback);
     bool take(const Key& key, Playback* playback);
 
@@ -31,7 +34,7 @@ private:
     void takeInPrompt(const Key& key, Playback& playback);
 
     std::optional<TextEditor> _prompt;
-    bool _isRefused = false; // what was typed is no time
+    bool _isRefused = false; // the typed text is not a time
 };
 
 } // namespace orvane

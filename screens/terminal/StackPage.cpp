@@ -107,8 +107,13 @@ int StackPage::rowColumns(int columns) const
 std::vector<std::string> StackPage::emptyText() const
 {
     const TableRows* shown = rows();
-    if (shown && shown->total() > 0)
-        return {"No row has \"" + shown->filter() + "\""};
+    if (shown && shown->total() > 0) {
+        std::vector<std::string> text{"No row here has \"" + shown->filter() + "\""};
+        if (shown->hasHiddenGroup())
+            text.emplace_back("The filter does not look inside groups: press Escape, open one, "
+                              "and filter its rows.");
+        return text;
+    }
     if (_playback)
         return {_playback->progress() < 1 ? "Reading the file" : "No data yet"};
     if (_isBusy)

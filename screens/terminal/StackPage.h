@@ -35,6 +35,8 @@ public:
     [[nodiscard]] std::vector<Hint> hints(const Marks& marks) const override;
     bool drawPrompt(Canvas& canvas, int line) override;
 
+    // The keys that do something in the pane in front as it is now.
+    [[nodiscard]] std::vector<KeyHelp> keys() const;
     [[nodiscard]] std::vector<Crumb> crumbs() const;
     // The columns that rows take: not more than is easy to read, unless a value needs them.
     [[nodiscard]] int rowColumns(int columns) const;
@@ -60,6 +62,7 @@ private:
     void openFilter();
     bool openSelected();
     void clickPlace(std::size_t place);
+    [[nodiscard]] bool canGoBack() const;
     bool goBack();
     bool leave();
     bool save() const;

@@ -27,7 +27,7 @@ std::vector<Hint> StackPage::hints(const Marks& marks) const
         hints.push_back({marks.leftArrow, "scroll back", keyOfKind(Key::Kind::Left)});
     else if (shown && !shown->filter().empty())
         hints.push_back({"Esc", "all rows", keyOfKind(Key::Kind::Escape)});
-    else if (_stack && _stack->viewControllers().size() > 1)
+    else if (canGoBack())
         hints.push_back({marks.leftArrow, "back", keyOfKind(Key::Kind::Left)});
     if (top() && saveItem(*top()))
         hints.push_back({"s", "save", keyOfCharacter('s')});
@@ -35,6 +35,35 @@ std::vector<Hint> StackPage::hints(const Marks& marks) const
     if (shown && shown->total() > 0)
         hints.push_back({"/", "filter", keyOfCharacter('/')});
     return hints;
+}
+
+std::vector<KeyHelp> StackPage::keys() const
+{
+    std::vector<KeyHelp> keys;
+    const auto addIf = [&keys](bool works, const char* names, const char* what) {
+        if (works)
+            keys.push_back({names, what});
+    };
+    const TableRows* shown = rows();
+    const bool isFiltered = shown && !shown->filter().empty();
+    const bool hasMoreRows = shown && shown->count() > 1;
+    addIf(hasMoreRows, "Up Down k j", "a row up, down");
+    addIf(hasMoreRows, "PgUp PgDn", "a screen up, down");
+    addIf(hasMoreRows, "Home End", "first row, last row");
+    addIf(shown && shown->hasGroup(), "Enter Right l", "open the row");
+    addIf(canGoBack(), "Left h Backspace", "back");
+    addIf(isFiltered, "Escape", canGoBack() ? "all rows, then back" : "all rows");
+    addIf(!isFiltered && canGoBack(), "Escape", "back");
+    addIf(shown && shown->hasLongValue(), "Right Left", "scroll a long value");
+    addIf(shown && shown->total() > 0, "/", "filter as you type");
+    addIf(top() && saveItem(*top()), "s", "save a snapshot");
+    PlaybackLine::addKeys(keys, _playback);
+    addIf(true, "?", "these keys");
+    addIf(true, "q Ctrl-C", "quit");
+    addIf(true, "Ctrl-Z", "suspend, fg goes on");
+    addIf(true, "Ctrl-L", "draw the screen again");
+    addIf(true, "Mouse", "click and wheel");
+    return keys;
 }
 
 bool StackPage::take(const Key& key)
@@ -162,9 +191,11 @@ void StackPage::clickPlace(std::size_t place)
     openSelected();
 }
 
+bool StackPage::canGoBack() const { return _stack && _stack->viewControllers().size() > 1; }
+
 bool StackPage::goBack()
 {
-    if (!_stack || _stack->viewControllers().size() < 2)
+    if (!canGoBack())
         return false;
     _stack->popViewController(true);
     return true;

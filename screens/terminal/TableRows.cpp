@@ -82,6 +82,27 @@ void TableRows::applyFilter()
             _matching.push_back(row);
 }
 
+bool TableRows::hasGroup() const
+{
+    return std::any_of(_matching.begin(), _matching.end(),
+                       [this](std::size_t row) { return _rows[row].isGroup; });
+}
+
+bool TableRows::hasLongValue() const
+{
+    return std::any_of(_matching.begin(), _matching.end(),
+                       [this](std::size_t row) { return _rows[row].overhang() > 0; });
+}
+
+bool TableRows::hasHiddenGroup() const
+{
+    const auto isGroup = [](const RowContent& row) { return row.isGroup; };
+    const auto groups = std::count_if(_rows.begin(), _rows.end(), isGroup);
+    const auto shown = std::count_if(_matching.begin(), _matching.end(),
+                                     [&](std::size_t row) { return isGroup(_rows[row]); });
+    return groups > shown;
+}
+
 void TableRows::showSelection()
 {
     const auto lines = static_cast<std::size_t>(_lines);

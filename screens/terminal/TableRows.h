@@ -11,22 +11,29 @@
 namespace orvane
 {
 
-// What the terminal knows of a table: the rows that the filter lets through, the selected one among
-// them, the part that is in view, how far long values are scrolled sideways, and which values a
-// refresh has changed. All of it stays through refreshes, by the rows' names.
+// What the terminal keeps of a table: the rows that match the filter, which of them is selected and
+// which are in view, how far long values are scrolled sideways, and which values the latest refresh
+// changed. A refresh keeps all of it: rows are found again by their names.
 class TableRows
 {
 public:
-    // A value at the far edge of a very wide terminal is hard to tell whose it is.
+    // On a wider terminal it would be hard to see which row a value at the right belongs to.
     static constexpr int kReadableColumns = 100;
 
-    // Fits the table to so many columns and lines, and reads it again if it was reloaded.
+    // Fits the table to the columns and lines, and reads it again if it was reloaded.
     void update(TableView& table, int columns, int lines);
     [[nodiscard]] int columns() const { return _columns; }
-    // Whether there is, or was, a value that is too long for a width that is easy to read.
+    // Whether a value is, or was, too long for kReadableColumns.
     [[nodiscard]] bool isWide() const { return _isWide; }
     // As of the last update.
     [[nodiscard]] std::size_t total() const { return _rows.size(); }
+
+    // Whether one of the rows that the filter lets through opens another pane, or has a value that
+    // is too long for its place.
+    [[nodiscard]] bool hasGroup() const;
+    [[nodiscard]] bool hasLongValue() const;
+    // Whether the filter hides a row that opens another pane.
+    [[nodiscard]] bool hasHiddenGroup() const;
 
     // Places count the rows that the filter lets through.
     [[nodiscard]] std::size_t count() const { return _matching.size(); }
@@ -35,25 +42,25 @@ public:
     // The row of the table at a place that is less than count().
     [[nodiscard]] std::size_t rowAt(std::size_t place) const { return _matching[place]; }
     [[nodiscard]] RowLook lookAt(std::size_t place) const;
-    // Null where there are no rows.
+    // Null if no row matches.
     [[nodiscard]] const RowContent* selected() const;
 
     // A place beyond the last counts as the last.
     void select(std::size_t place);
     void moveBy(std::ptrdiff_t places);
-    // Moves the view, and the selection no further than that takes.
+    // Moves the view, and the selection only as far as needed to keep it in view.
     void scrollBy(std::ptrdiff_t places);
     [[nodiscard]] std::ptrdiff_t page() const { return _lines > 1 ? _lines - 1 : 1; }
 
-    // Scrolls the selected row's long value; false where there is no more to see.
+    // Scrolls the selected row's long value. False if that end of it is in view already.
     bool scrollSideways(bool isRight);
     [[nodiscard]] bool canScrollSideways(bool isRight) const;
 
-    // Part of a row's name or value, whatever the case; empty for all rows.
+    // The part of a name or value, in any case, that rows must have; empty for all rows.
     [[nodiscard]] const std::string& filter() const { return _filter; }
     void setFilter(const std::string& filter);
 
-    // How often a refresh has changed values.
+    // The number of refreshes that changed values.
     [[nodiscard]] std::size_t changeCount() const { return _changeCount; }
     void forgetChanges() { _changed.clear(); }
 

@@ -204,6 +204,8 @@ void TerminalScreen::take(const Key& key)
 {
     if (key.kind == Key::Kind::Character && key.character == kSuspend)
         _device.suspend();
+    else if (key.kind == Key::Kind::Character && key.character == kRedraw)
+        _device.retake();
     else if (!front().take(key) && &front() == &_stack)
         takeCommand(key);
 }
@@ -216,10 +218,7 @@ void TerminalScreen::takeCommand(const Key& key)
         _settings.onQuit();
     } else if (key.character == '?') {
         _isHelpWanted = true;
-        _help =
-            std::make_unique<HelpPage>(playback() != nullptr, [this] { _isHelpWanted = false; });
-    } else if (key.character == kRedraw) {
-        _device.retake();
+        _help = std::make_unique<HelpPage>(_stack.keys(), [this] { _isHelpWanted = false; });
     }
 }
 

@@ -3,7 +3,8 @@
 namespace orvane
 {
 
-// Tells screen readers what tables and their rows are, and lets them press rows. Once a process.
+// Gives screen readers the role of each widget of this layer, and lets them press rows. To be
+// called once a process.
 void installAccessibility();
 
 } // namespace orvane

@@ -2,6 +2,7 @@
 
 #include "screens/toolkit/AlertView.h"
 #include "screens/window/FlatButton.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/WrappedText.h"
 
 #include <QVBoxLayout>
@@ -31,11 +32,11 @@ void AlertWidget::sync(const AlertView* alert)
 {
     if (!alert)
         return hide();
-    _title->setText(QString::fromStdString(alert->title()));
-    _message->setText(QString::fromStdString(alert->message()));
-    _button->setText(QString::fromStdString(alert->buttonTitle()));
-    card().setAccessibleName(_title->text());
-    card().setAccessibleDescription(_message->text());
+    _title->setText(lineOf(alert->title()));
+    _message->setText(lineOf(alert->message()));
+    _button->setText(lineOf(alert->buttonTitle()));
+    setAccessibleName(_title->text());
+    setAccessibleDescription(_message->text());
     if (isVisible())
         return placeCard();
     show();

@@ -2,6 +2,7 @@
 
 #include "screens/toolkit/ScrollView.h"
 #include "screens/window/Fonts.h"
+#include "screens/window/PlainText.h"
 
 #include <QFontMetricsF>
 #include <QStringList>

@@ -1,11 +1,14 @@
 #include "screens/window/EmptyView.h"
 
 #include "screens/window/Drawing.h"
+#include "screens/window/Fonts.h"
 #include "screens/window/Theme.h"
-#include "screens/window/WrappedText.h"
 
+#include <QFontMetricsF>
 #include <QPainter>
-#include <QVBoxLayout>
+#include <QStringList>
+
+#include <algorithm>
 
 namespace orvane
 {
@@ -13,61 +16,79 @@ namespace orvane
 namespace
 {
 
-constexpr int kSignHeight = 64;
-constexpr int kWidest = 360;
+constexpr double kSignHeight = 54;
+constexpr double kSpacing = 8;
+constexpr double kMargin = 24;
+constexpr double kWidest = 360;
+constexpr double kShareAbove = 0.4; // of the room that the contents leave
+constexpr int kFlags = Qt::AlignHCenter | Qt::TextWordWrap;
 
 } // namespace
 
-EmptyView::EmptyView(QWidget* parent, const QString& hint)
-    : QWidget(parent), _title(new WrappedText(this, Font::boldSystem(17))),
-      _reason(new WrappedText(this, Font::system(15))),
-      _hint(new WrappedText(this, Font::system(13), WrappedText::Tone::Quiet))
+EmptyView::EmptyView(QWidget* parent, const QString& hint) : QWidget(parent), _hint(hint)
 {
-    _title->setText(tr("No data yet"));
-    _reason->setText(tr("Waiting for the telephony server"));
-    _hint->setText(hint);
-    // Touches are the table's, from whose edge one goes back.
+    // Touches are for the table below: a swipe from its edge goes back.
     setAttribute(Qt::WA_TransparentForMouseEvents);
-    auto* column = new QVBoxLayout(this);
-    column->setContentsMargins(24, 8, 24, 8);
-    column->setSpacing(8);
-    column->addStretch(2);
-    column->addSpacing(kSignHeight);
-    for (WrappedText* label : {_title, _reason, _hint}) {
-        label->setMaximumWidth(kWidest);
-        auto* row = new QHBoxLayout;
-        row->addStretch(0);
-        row->addWidget(label, 1);
-        row->addStretch(0);
-        column->addLayout(row);
-    }
-    column->addStretch(3);
-    setWaiting(false);
+    setAccessibleName(text());
 }
 
 void EmptyView::setWaiting(bool isWaiting)
 {
-    if (_reason->isHidden() != isWaiting)
+    if (_isWaiting == isWaiting)
         return;
-    _reason->setVisible(isWaiting);
-    _hint->setVisible(isWaiting && !_hint->text().isEmpty());
+    _isWaiting = isWaiting;
+    setAccessibleName(text());
     update();
+}
+
+std::vector<EmptyView::Paragraph> EmptyView::paragraphs() const
+{
+    std::vector<Paragraph> shown{
+        {tr("No data yet"), fontFor(Font::boldSystem(17))}
+    };
+    if (!_isWaiting)
+        return shown;
+    shown.push_back({tr("Waiting for the telephony server"), fontFor(Font::system(15))});
+    if (!_hint.isEmpty())
+        shown.push_back({_hint, fontFor(Font::system(13)), true});
+    return shown;
 }
 
 QString EmptyView::text() const
 {
-    QString text = _title->text();
-    for (const WrappedText* label : {_reason, _hint})
-        if (!label->isHidden())
-            text += QLatin1Char('\n') + label->text();
-    return text;
+    QStringList texts;
+    for (const Paragraph& paragraph : paragraphs())
+        texts += paragraph.text;
+    return texts.join(QLatin1Char('\n'));
 }
 
+// Sign and texts are placed and drawn together, so that no part is drawn where another one was.
 void EmptyView::paintEvent(QPaintEvent*)
 {
+    const Theme& theme = Theme::of(*this);
+    const std::vector<Paragraph> shown = paragraphs();
+    const double textWidth = std::clamp(width() - 2 * kMargin, 1.0, kWidest);
+    const auto placeBelow = [&](double y, const Paragraph& paragraph) {
+        const QRectF room((width() - textWidth) / 2, y, textWidth, 1e6);
+        return QFontMetricsF(paragraph.font).boundingRect(room, kFlags, paragraph.text);
+    };
+    double contents = kSignHeight;
+    for (const Paragraph& paragraph : shown)
+        contents += kSpacing + placeBelow(0, paragraph).height();
+
     QPainter painter(this);
-    const QRectF place(0, _title->geometry().top() - kSignHeight, width(), kSignHeight - 10);
-    drawSign(painter, Sign::Signal, place, Theme::of(*this).quietText);
+    double y = std::max(0.0, (height() - contents) * kShareAbove);
+    drawSign(painter, Sign::Signal, {0, y, static_cast<double>(width()), kSignHeight},
+             theme.quietText);
+    y += kSignHeight;
+    for (const Paragraph& paragraph : shown) {
+        const QRectF place = placeBelow(y + kSpacing, paragraph);
+        painter.setFont(paragraph.font);
+        painter.setPen(paragraph.isQuiet ? theme.quietText : theme.text);
+        painter.drawText(QRectF((width() - textWidth) / 2, place.top(), textWidth, place.height()),
+                         kFlags, paragraph.text);
+        y = place.bottom();
+    }
 }
 
 } // namespace orvane

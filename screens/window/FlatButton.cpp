@@ -1,6 +1,7 @@
 #include "screens/window/FlatButton.h"
 
 #include "screens/window/Fonts.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/Theme.h"
 
 #include <QFocusEvent>
@@ -20,7 +21,7 @@ constexpr double kTextSize = 15;
 constexpr int kMargin = 12;
 constexpr int kSignWidth = 22; // of a sign that a text follows
 
-// Nothing for any key but Return and Enter.
+// Nullopt for all keys but Return and Enter.
 std::optional<QKeyEvent> spaceFor(const QKeyEvent& event)
 {
     if (event.key() != Qt::Key_Return && event.key() != Qt::Key_Enter)
@@ -48,12 +49,22 @@ void FlatButton::setSign(Sign sign)
     update();
 }
 
+void FlatButton::setText(const QString& text)
+{
+    if (this->text() == text)
+        return;
+    QAbstractButton::setText(text);
+    setShortcut({});
+    setAccessibleName(text);
+    updateGeometry();
+}
+
 void FlatButton::setName(const QString& name)
 {
     if (accessibleName() == name)
         return;
     setAccessibleName(name);
-    setToolTip(name);
+    setPlainToolTip(*this, name);
 }
 
 QSize FlatButton::sizeHint() const
@@ -75,7 +86,7 @@ void FlatButton::paintEvent(QPaintEvent*)
         painter.setBrush(isDown() ? theme.pressed : theme.badge);
         painter.drawRoundedRect(QRectF(rect()).adjusted(3, 5, -3, -5), 8, 8);
     }
-    const QColor& colour = isEnabled() ? theme.accent : theme.line;
+    const QColor& colour = isEnabled() ? theme.accent : theme.disabled;
     QRectF place = rect();
     if (_sign && !text().isEmpty()) {
         drawSign(painter, *_sign, {4, 0, kSignWidth - 6, place.height()}, colour);

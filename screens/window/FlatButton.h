@@ -21,7 +21,9 @@ public:
 
     [[nodiscard]] std::optional<Sign> sign() const { return _sign; }
     void setSign(Sign sign);
-    // For a button of a sign alone: what it does, for screen readers and as a tooltip.
+    // Shows the text as it is: an "&" in it gives the button no shortcut.
+    void setText(const QString& text);
+    // For a button of a sign alone: what it does, for screen readers and as a tool tip.
     void setName(const QString& name);
 
     // Whether the ring is drawn while it has the focus: for those who use the keyboard.

@@ -7,15 +7,12 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
-#include <string>
 
 namespace orvane
 {
 
 namespace
 {
-
-constexpr std::size_t kLongestLine = 4096;
 
 bool hasTabularFigures(const QFont& font)
 {
@@ -55,23 +52,6 @@ QFont fontFor(const Font& font)
     result.setPixelSize(std::max(1, static_cast<int>(std::lround(font.size))));
     result.setWeight(font.isBold ? QFont::Bold : QFont::Normal);
     return result;
-}
-
-QString lineOf(std::string_view text)
-{
-    const bool isCut = text.size() > kLongestLine;
-    const std::string_view shown = text.substr(0, kLongestLine);
-    QString line = QString::fromUtf8(shown.data(), static_cast<qsizetype>(shown.size()));
-    std::replace_if(
-        line.begin(), line.end(),
-        [](QChar character) {
-            return character.category() == QChar::Other_Control ||
-                   character == QChar::LineSeparator || character == QChar::ParagraphSeparator;
-        },
-        QLatin1Char(' '));
-    if (isCut)
-        line += QChar(0x2026); // an ellipsis
-    return line;
 }
 
 QSizeF sizeOfLine(const QString& line, const QFont& font)

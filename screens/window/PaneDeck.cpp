@@ -25,6 +25,7 @@ PaneDeck::PaneDeck(QWidget* parent, QString waitingHint, bool isAnimated, std::f
     : QWidget(parent), _waitingHint(std::move(waitingHint)), _isAnimated(isAnimated),
       _pop(std::move(pop))
 {
+    setAccessibleName(tr("Panes"));
     _animation.setDuration(kSlideMs);
     _animation.setEasingCurve(QEasingCurve::OutCubic);
     connect(&_animation, &QVariantAnimation::valueChanged, this,

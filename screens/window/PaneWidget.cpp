@@ -2,6 +2,7 @@
 
 #include "screens/toolkit/ActivityIndicator.h"
 #include "screens/window/EmptyView.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/TableWidget.h"
 
 #include <algorithm>
@@ -38,7 +39,8 @@ void PaneWidget::sync()
     if (!shown)
         return;
     _table->setTable(std::dynamic_pointer_cast<TableView>(shown->view()));
-    _table->setAccessibleName(QString::fromStdString(shown->title()));
+    setAccessibleName(lineOf(shown->title()));
+    _table->setAccessibleName(accessibleName());
     _table->sync();
     _empty->setWaiting(isBusy(*shown));
     _empty->setVisible(_table->rowCount() == 0);

@@ -4,9 +4,12 @@
 #include "screens/toolkit/Screen.h"
 #include "screens/window/FlatButton.h"
 #include "screens/window/Fonts.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/TextLine.h"
 #include "screens/window/Theme.h"
+#include "screens/window/WrappedText.h"
 
+#include <QAccessible>
 #include <QEvent>
 #include <QHBoxLayout>
 #include <QLineEdit>
@@ -43,9 +46,9 @@ QString controlStyle(const Theme& theme)
                "QLineEdit { border: 1px solid %1; border-radius: 8px; padding: 0 6px;"
                " background: %3; color: %4; }"
                "QLineEdit:focus { border: 2px solid %2; padding: 0 5px; }"
-               "QLineEdit[isWrong=\"true\"] { border: 2px solid #C64600; padding: 0 5px; }")
+               "QLineEdit[isWrong=\"true\"] { border: 2px solid %6; padding: 0 5px; }")
         .arg(theme.line.name(), theme.accent.name(), theme.background.name(), theme.text.name(),
-             theme.text.name());
+             theme.text.name(), theme.warning.name());
 }
 
 } // namespace
@@ -55,6 +58,7 @@ PlaybackBar::PlaybackBar(QWidget* parent, const Screen& screen)
       _controls(makeControls())
 {
     hide();
+    setAccessibleName(tr("Playback"));
     _remark->setLineFont(fontFor(Font::system(kTextSize)));
     _remark->setQuiet(true);
     _remark->setFixedHeight(26);
@@ -105,15 +109,21 @@ QWidget* PlaybackBar::makeControls()
     _time->setAlignment(Qt::AlignCenter);
     _time->setPlaceholderText(tr("10:04:30 or +90"));
     _time->setAccessibleName(tr("Time of the recording; type another to jump there"));
-    _time->setToolTip(tr("Type a time to jump there: 10:04:30, or +90 seconds from the start"));
+    setPlainToolTip(*_time,
+                    tr("Type a time to jump there: 10:04:30, or +90 seconds from the start"));
     _time->installEventFilter(this);
     connect(_time, &QLineEdit::returnPressed, this, [this] { jumpToTyped(); });
+    connect(_time, &QLineEdit::textEdited, this, [this] { setRefused(false); });
 
     auto* upper = new QHBoxLayout;
     upper->setContentsMargins(10, 0, 6, 0);
     upper->setSpacing(10);
     upper->addWidget(_slider, 1);
     upper->addWidget(_time);
+
+    _refusal = new WrappedText(controls, Font::system(kTextSize), WrappedText::Tone::Warning);
+    _refusal->setText(tr("Not a time. Type 10:04:30, or +90 for 90 seconds from the start."));
+    _refusal->hide();
 
     auto* lower = new QHBoxLayout;
     lower->setSpacing(0);
@@ -140,6 +150,7 @@ QWidget* PlaybackBar::makeControls()
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(0);
     column->addLayout(upper);
+    column->addWidget(_refusal);
     column->addLayout(lower);
     return controls;
 }
@@ -168,9 +179,9 @@ void PlaybackBar::sync()
     setVisible(playback != nullptr);
     if (!playback)
         return;
-    const QString remark = QString::fromStdString(playback->remark());
+    const QString remark = lineOf(playback->remark());
     _remark->setText(remark);
-    _remark->setToolTip(remark);
+    setPlainToolTip(*_remark, remark);
     _remark->setVisible(!remark.isEmpty());
     const double progress = playback->progress();
     _reading->setVisible(progress < 1);
@@ -181,7 +192,7 @@ void PlaybackBar::sync()
     _play->setSign(playback->isPlaying() ? Sign::Pause : Sign::Play);
     _play->setName(playback->isPlaying() ? tr("Pause") : tr("Play"));
     _speed->setText(QString::number(playback->speed()) + QChar(0xD7));
-    _speed->setToolTip(tr("Seconds of the recording a second"));
+    setPlainToolTip(*_speed, tr("Seconds of the recording a second"));
     showTime();
     if (_slider->isSliderDown())
         return;
@@ -193,9 +204,9 @@ void PlaybackBar::sync()
 
 void PlaybackBar::showTime()
 {
-    // Not while somebody types another.
+    // Not while somebody types another time.
     const Playback* playback = _screen.playback();
-    const QString time = QString::fromStdString(playback ? playback->positionText() : "");
+    const QString time = playback ? lineOf(playback->positionText()) : QString();
     if (!_time->hasFocus() && _time->text() != time)
         _time->setText(time);
 }
@@ -204,10 +215,22 @@ void PlaybackBar::jumpToTyped()
 {
     Playback* playback = _screen.playback();
     const bool isUsable = playback && playback->jumpToText(_time->text().toStdString());
-    _time->setProperty("isWrong", !isUsable);
-    applyTheme();
+    setRefused(!isUsable);
     if (isUsable)
         _time->clearFocus();
+}
+
+void PlaybackBar::setRefused(bool isRefused)
+{
+    if (_refusal->isHidden() != isRefused)
+        return;
+    _time->setProperty("isWrong", isRefused);
+    _refusal->setVisible(isRefused);
+    applyTheme();
+    if (!isRefused)
+        return;
+    QAccessibleEvent alert(_refusal, QAccessible::Alert);
+    QAccessible::updateAccessibility(&alert);
 }
 
 void PlaybackBar::jumpToSlider(int value)
@@ -218,13 +241,12 @@ void PlaybackBar::jumpToSlider(int value)
 
 bool PlaybackBar::eventFilter(QObject*, QEvent* event)
 {
-    // The field shows the time, and is empty for another when it has the keyboard.
+    // The field shows the time. When it gets the keyboard it is emptied for another one.
     if (event->type() == QEvent::FocusIn)
         _time->clear();
     if (event->type() == QEvent::FocusOut) {
-        _time->setProperty("isWrong", false);
+        setRefused(false);
         showTime();
-        applyTheme();
     }
     return false;
 }
@@ -238,7 +260,7 @@ void PlaybackBar::changeEvent(QEvent* event)
 
 void PlaybackBar::applyTheme()
 {
-    // Set anew, it also takes in the field's state.
+    // A style sheet that is set again also looks at the field's property again.
     for (QWidget* part : {_reading, _controls})
         part->setStyleSheet(controlStyle(Theme::of(*this)));
 }

@@ -15,13 +15,15 @@ class FlatButton;
 class Playback;
 class Screen;
 class TextLine;
+class WrappedText;
 
-// The controls of a recording: while it is read, how far that is and a button that stops it; then
-// the position, the time (where one can type another), and buttons. Hidden without a recording.
+// The controls of a recording. While the file is read: how much of it has been read, and a button
+// that stops. After that: a slider for the position, a field that shows the time and takes another
+// one, and buttons. Hidden without a recording.
 class PlaybackBar final : public QWidget
 {
 public:
-    // For the recording of the screen, which must outlive it.
+    // Controls the recording of the screen, which must outlive it.
     PlaybackBar(QWidget* parent, const Screen& screen);
 
     // Shows the recording as it is now; touches only what has changed.
@@ -34,6 +36,8 @@ public:
     [[nodiscard]] FlatButton& stopButton() const { return *_stop; }
     [[nodiscard]] const TextLine& speed() const { return *_speed; }
     [[nodiscard]] const TextLine& remark() const { return *_remark; }
+    // Says that a typed text is not a time; hidden unless one was typed.
+    [[nodiscard]] const WrappedText& refusal() const { return *_refusal; }
 
 protected:
     void paintEvent(QPaintEvent* event) override;
@@ -46,19 +50,21 @@ private:
     FlatButton* makeButton(QWidget* parent, Sign sign, const QString& name,
                            void (Playback::*action)());
     void jumpToTyped();
+    void setRefused(bool isRefused);
     void jumpToSlider(int value);
     void showTime();
     void applyTheme();
 
     const Screen& _screen;
     TextLine* _remark; // children
+    WrappedText* _refusal = nullptr;
     QProgressBar* _progress = nullptr;
     FlatButton* _stop = nullptr;
     QSlider* _slider = nullptr;
     QLineEdit* _time = nullptr;
     FlatButton* _play = nullptr;
     TextLine* _speed = nullptr;
-    // Made last, of those above.
+    // Made last: they hold those above.
     QWidget* _reading;
     QWidget* _controls;
 };

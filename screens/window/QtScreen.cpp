@@ -1,6 +1,7 @@
 #include "screens/window/QtScreen.h"
 
 #include "screens/window/Fonts.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/SheetWidget.h"
 #include "screens/window/UiInterface.h"
 #include "screens/window/WindowFrame.h"

@@ -35,7 +35,7 @@ void SheetWidget::sync(UiInterface* interface)
         return;
     QWidget& shown = _interface->widget();
     card().layout()->addWidget(&shown);
-    card().setAccessibleName(shown.windowTitle());
+    setAccessibleName(shown.windowTitle());
     shown.show();
     placeCard();
     _interface->sync();

@@ -1,5 +1,6 @@
 #include "screens/window/TableWidget.h"
 
+#include "screens/window/PlainText.h"
 #include "screens/window/Theme.h"
 
 #include <QAccessible>
@@ -45,6 +46,7 @@ TableWidget::TableWidget(QWidget* parent)
     setAttribute(Qt::WA_AcceptTouchEvents);
     setAttribute(Qt::WA_OpaquePaintEvent);
     _bar->setFocusPolicy(Qt::NoFocus);
+    _bar->setAccessibleName(tr("Rows"));
     _bar->setStyleSheet(barStyle(Theme::of(*this)));
     connect(_bar, &QScrollBar::valueChanged, this, [this] { placeRows(); });
 }
@@ -176,16 +178,19 @@ bool TableWidget::event(QEvent* event)
         setFocus(Qt::MouseFocusReason);
         updateMarks();
     }
-    if (event->type() == QEvent::ToolTip)
-        setToolTip(toolTipAt(static_cast<QHelpEvent*>(event)->pos()));
+    if (event->type() == QEvent::ToolTip) {
+        showToolTip(*static_cast<QHelpEvent*>(event));
+        return true;
+    }
     return _touch.takeEvent(*event) || QWidget::event(event);
 }
 
-QString TableWidget::toolTipAt(const QPoint& position) const
+void TableWidget::showToolTip(const QHelpEvent& event)
 {
-    const auto row = rowAt(position);
+    const auto row = rowAt(event.pos());
     const RowWidget* widget = row ? rowWidget(*row) : nullptr;
-    return widget ? widget->content().cutText() : QString();
+    if (widget)
+        showPlainToolTip(event.globalPos(), widget->content().cutText(), *this, widget->geometry());
 }
 
 void TableWidget::resizeEvent(QResizeEvent*)

@@ -11,6 +11,7 @@
 #include <optional>
 #include <vector>
 
+class QHelpEvent;
 class QScrollBar;
 
 namespace orvane
@@ -69,7 +70,7 @@ private:
     void scrollTo(std::optional<std::size_t> row, const QPointF& position) override;
     void showPress() override;
 
-    [[nodiscard]] QString toolTipAt(const QPoint& position) const;
+    void showToolTip(const QHelpEvent& event);
     void placeRows();
     std::unique_ptr<RowWidget> takeSpare();
     void showRow(std::size_t row, const std::shared_ptr<TableViewCell>& cell);

@@ -20,8 +20,9 @@ Theme makeLight()
         .line = QColor(0xDF, 0xE2, 0xE7),
         .pressed = QColor(0xE4, 0xEC, 0xF6),
         .accent = QColor(0x1A, 0x5F, 0xB4),
-        .onAccent = QColor(0xFF, 0xFF, 0xFF),
         .badge = QColor(0xE6, 0xE9, 0xEE),
+        .warning = QColor(0xA0, 0x38, 0x00),
+        .disabled = QColor(0x8A, 0x93, 0x9E),
     };
 }
 
@@ -36,19 +37,30 @@ Theme makeDark()
         .line = QColor(0x31, 0x35, 0x3C),
         .pressed = QColor(0x27, 0x31, 0x3F),
         .accent = QColor(0x7F, 0xB5, 0xF5),
-        .onAccent = QColor(0x10, 0x1A, 0x26),
         .badge = QColor(0x2E, 0x33, 0x3B),
+        .warning = QColor(0xFF, 0xA3, 0x66),
+        .disabled = QColor(0x6B, 0x74, 0x80),
     };
 }
 
 } // namespace
 
+const Theme& Theme::light()
+{
+    static const Theme theme = makeLight();
+    return theme;
+}
+
+const Theme& Theme::dark()
+{
+    static const Theme theme = makeDark();
+    return theme;
+}
+
 const Theme& Theme::of(const QWidget& widget)
 {
-    static const Theme light = makeLight();
-    static const Theme dark = makeDark();
     constexpr int kHalfLight = 128;
-    return widget.palette().color(QPalette::Window).lightness() < kHalfLight ? dark : light;
+    return widget.palette().color(QPalette::Window).lightness() < kHalfLight ? dark() : light();
 }
 
 } // namespace orvane

@@ -5,6 +5,7 @@
 #include "screens/window/BusyIndicator.h"
 #include "screens/window/FlatButton.h"
 #include "screens/window/Fonts.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/TextLine.h"
 #include "screens/window/Theme.h"
 
@@ -21,6 +22,7 @@ ToolbarWidget::ToolbarWidget(QWidget* parent, std::function<void(std::size_t)> p
     : QWidget(parent), _press(std::move(press)), _layout(new QHBoxLayout(this))
 {
     setFixedHeight(FlatButton::kSize);
+    setAccessibleName(tr("Status"));
     _layout->setContentsMargins(12, 0, 4, 0);
     _layout->setSpacing(8);
 }

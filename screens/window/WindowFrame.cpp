@@ -4,6 +4,7 @@
 #include "screens/toolkit/Window.h"
 #include "screens/window/AlertWidget.h"
 #include "screens/window/PaneDeck.h"
+#include "screens/window/PlainText.h"
 #include "screens/window/PlaybackBar.h"
 #include "screens/window/SheetWidget.h"
 #include "screens/window/TableWidget.h"
@@ -110,17 +111,16 @@ void WindowFrame::syncTitle(NavigationController* stack)
     if (!stack || !stack->topViewController())
         return _titleBar->show({}, false, {});
     const auto& controllers = stack->viewControllers();
-    const QString title = QString::fromStdString(controllers.back()->title());
-    const QString root = QString::fromStdString(controllers.front()->title());
+    const QString title = lineOf(controllers.back()->title());
+    const QString root = lineOf(controllers.front()->title());
     const bool canGoBack = controllers.size() > 1;
-    const QString back = canGoBack
-                             ? QString::fromStdString(controllers[controllers.size() - 2]->title())
-                             : QString();
+    const QString back =
+        canGoBack ? lineOf(controllers[controllers.size() - 2]->title()) : QString();
     _titleBar->show(title, canGoBack, back);
     const QString whole = canGoBack ? QStringLiteral("%1 \u2014 %2").arg(title, root) : root;
-    setWindowTitle(_settings.mark.isEmpty()
-                       ? whole
-                       : QStringLiteral("%1 (%2)").arg(whole, _settings.mark.toLower()));
+    setPlainWindowTitle(*this, _settings.mark.isEmpty() ? whole
+                                                        : QStringLiteral("%1 (%2)").arg(
+                                                              whole, _settings.mark.toLower()));
 }
 
 void WindowFrame::giveKeyboard()

@@ -27,7 +27,9 @@ void WrappedText::changeEvent(QEvent* event)
 void WrappedText::applyTheme()
 {
     const Theme& theme = Theme::of(*this);
-    const QColor& colour = _tone == Tone::Quiet ? theme.quietText : theme.text;
+    const QColor& colour = _tone == Tone::Quiet     ? theme.quietText
+                           : _tone == Tone::Warning ? theme.warning
+                                                    : theme.text;
     QPalette changed = palette();
     if (changed.color(QPalette::WindowText) == colour)
         return;

@@ -7,11 +7,11 @@
 namespace orvane
 {
 
-// Text in the middle of as many lines as it takes, in the theme's colour.
+// Plain text, centred, on as many lines as it needs, in the theme's colour for its tone.
 class WrappedText final : public QLabel
 {
 public:
-    enum class Tone { Plain, Quiet };
+    enum class Tone { Plain, Quiet, Warning };
 
     WrappedText(QWidget* parent, const Font& font, Tone tone = Tone::Plain);
 

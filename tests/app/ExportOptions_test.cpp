@@ -65,7 +65,7 @@ TEST(ExportOptionsTest, TakesEachOption)
 TEST(ExportOptionsTest, CsvCanBeForASpreadsheet)
 {
     EXPECT_FALSE(parsed({"f", "/a"}).isForSpreadsheet);
-    for (const ExportOptions& options :
+    for (const AppOptions& options :
          {parsed({"f", "/a", "--spreadsheet"}), parsed({"f", "--format=csv", "--spreadsheet"})}) {
         EXPECT_FALSE(options.error);
         EXPECT_TRUE(options.isForSpreadsheet);

@@ -53,6 +53,12 @@ expect_complaint tests/app/Other_test.cpp '#  include <QtCore/QTimer>' tests/app
 expect_complaint ui/Other.cpp '#include <ncurses.h>' ui/Other.cpp:1 "ncurses is for screens/terminal/ alone"
 expect_complaint ui/Other.cpp '#include <ncursesw/curses.h>' ui/Other.cpp:1 "ncurses is for screens/terminal/ alone"
 expect_complaint platform/Other.cpp '#include <expat.h>' platform/Other.cpp:1 "Expat is for"
+for class in QToolTip QLabel QMessageBox QtWidgets/QMenu QSystemTrayIcon; do
+    expect_complaint screens/window/Other.cpp "#include <$class>" screens/window/Other.cpp:1 "this class takes some texts for rich text or shortcuts"
+done
+for call in '_bar->setToolTip(name)' 'setWindowTitle (title);' 'widget.setWhatsThis(text)'; do
+    expect_complaint screens/window/Other.cpp "    $call" screens/window/Other.cpp:1 "Qt takes some texts for rich text"
+done
 expect_complaint app/Other.h '#include <vector>' app/Other.h:1 "a header begins with #pragma once"
 expect_complaint app/Other.h "$once using namespace std;" app/Other.h:2 "a header opens no namespace"
 expect_complaint app/Other.cpp '// TO''DO: later' app/Other.cpp:1 "what is left to do"
@@ -64,6 +70,16 @@ put ui/One.cpp <<<$'#include <QTimer>\n#include "Shell.h"'
 put ui/Two.h <<<'#include <ncurses.h>'
 check
 expect_equal "$(cut -d: -f1,2 <<<"$complaints")" $'ui/One.cpp:1\nui/One.cpp:2\nui/Two.h:1\nui/Two.h:1'
+
+case_named "texts reach Qt through the files that show them as they are"
+make_tree
+put screens/window/PlainText.cpp <<<$'#include <QToolTip>\nwidget.setToolTip(plainToolTip(text));'
+put screens/window/WrappedText.h <<<$'#pragma once\n#include <QLabel>'
+put screens/window/Other.cpp <<<$'setPlainToolTip(*this, text);\nsetPlainWindowTitle(*this, text);\n#include <QLineEdit>'
+put tests/screens/window/Tip_test.cpp <<<$'#include <QToolTip>'
+check
+expect_equal "$complaints" ""
+expect_equal "$status" 0
 
 case_named "what the build makes and what is ignored are nobody's"
 make_tree

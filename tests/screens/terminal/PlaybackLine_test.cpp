@@ -124,6 +124,14 @@ TEST_F(PlaybackLineTest, TheListOfKeysHasItsKeys)
 {
     type("?");
     EXPECT_GE(device.lineOf("play, pause"), 0);
+    EXPECT_EQ(device.lineOf("stop reading"), -1) << "it has been read";
+    press(Key::Kind::Escape);
+    playback.read = 0.5;
+    screen->setNeedsUpdate();
+    queue.runPending();
+    type("?");
+    EXPECT_GE(device.lineOf("stop reading the file"), 0);
+    EXPECT_EQ(device.lineOf("play, pause"), -1) << "it cannot be played yet";
 }
 
 } // namespace orvane

@@ -90,12 +90,49 @@ TEST_F(TerminalFormsTest, EachPaneHasItsOwnFilter)
 TEST_F(TerminalFormsTest, AFilterWithoutRowsSaysSo)
 {
     type("/zzz");
-    EXPECT_GE(device.lineOf("No row has \"zzz\""), 0);
+    EXPECT_GE(device.lineOf("No row here has \"zzz\""), 0);
     press(Kind::Enter);
     press(Kind::Enter);
     press(Kind::Right);
     press(Kind::Down);
     EXPECT_THAT(device.text(22), EndsWith("\"zzz\" 0/0 of 4"));
+}
+
+TEST_F(TerminalFormsTest, AFilterWithoutRowsSaysThatItDoesNotLookInsideGroups)
+{
+    type("/A1");
+    EXPECT_GE(device.lineOf("The filter does not look inside groups"), 0);
+    press(Kind::Escape);
+    EXPECT_EQ(device.lineOf("does not look inside"), -1);
+    press(Kind::Enter);
+    EXPECT_THAT(device.text(0), HasSubstr("Serving Cell"));
+    type("/zzz");
+    EXPECT_GE(device.lineOf("No row here has \"zzz\""), 0);
+    EXPECT_EQ(device.lineOf("does not look inside"), -1) << "there are no groups";
+}
+
+TEST_F(TerminalFormsTest, ControlLDrawsTheScreenAgainWhereverOneIs)
+{
+    const Key redraw = keyOfCharacter('L' & 0x1F);
+    type("/b");
+    press(redraw);
+    EXPECT_EQ(device.retakes, 1) << "in the filter";
+    EXPECT_EQ(device.text(23).substr(0, 10), " Filter: b");
+    press(Kind::Escape);
+    type("?");
+    press(redraw);
+    EXPECT_EQ(device.retakes, 2) << "in the list of keys";
+    EXPECT_THAT(device.text(0), HasSubstr("Keys"));
+    press(Kind::Escape);
+    type("s");
+    press(redraw);
+    EXPECT_EQ(device.retakes, 3) << "on the save screen";
+    EXPECT_TRUE(saveView);
+    screen->showAlert(std::make_unique<AlertView>("File Error", "No", "Close"));
+    queue.runPending();
+    press(redraw);
+    EXPECT_EQ(device.retakes, 4) << "before an alert";
+    EXPECT_TRUE(screen->alert());
 }
 
 TEST_F(TerminalFormsTest, LettersInTheFilterAreNoCommands)

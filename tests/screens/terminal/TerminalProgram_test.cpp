@@ -3,6 +3,7 @@
 #include "processes/support/ChildProcess.h"
 #include "screens/terminal/LineWidth.h"
 #include "screens/terminal/VirtualTerminal.h"
+#include "support/Paths.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
@@ -372,22 +373,31 @@ TEST_F(TerminalProgramTest, ChangedValuesAreMarked)
     EXPECT_TRUE(terminal->waitUntil([&] {
         const std::string row = terminal->line(5);
         return row.find("Measured RSRP") != std::string::npos && row.find('-') < row.size() &&
-               terminal->isBold(row.substr(row.find('-'))) &&
-               terminal->isColoured(row.substr(row.find('-')));
+               terminal->isBold(row.substr(row.find('-')));
     })) << terminal->screen();
 }
 
-TEST_F(TerminalProgramTest, WithNoColorNothingIsColoured)
+TEST_F(TerminalProgramTest, TextsKeepTheTerminalsColoursAndOnlyMarksAreColoured)
 {
-    const auto terminal = startDemo({"NO_COLOR=1"});
-    ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
-    EXPECT_TRUE(terminal->waitUntil([&] { return terminal->isReversed("Orvane"); }));
-    EXPECT_FALSE(terminal->isColoured("Orvane"));
-    expectShown(*terminal, "quit");
-    EXPECT_FALSE(terminal->isColoured("quit"));
-    const auto inColour = startDemo();
-    ASSERT_TRUE(inColour->waitFor("Serving Cell Measurements"));
-    EXPECT_TRUE(inColour->waitUntil([&] { return inColour->isColoured("Orvane"); }));
+    const auto play = [this](const std::vector<std::string>& more) {
+        return std::make_unique<VirtualTerminal>(
+            std::vector<std::string>{ORVANE_PROGRAM, "open", testDataPath("lte-drive-damaged.dlf"),
+                                     "--ui", "terminal", "--log", "none"},
+            environment(more));
+    };
+    const auto terminal = play({});
+    ASSERT_TRUE(terminal->waitUntil([&] { return terminal->isColoured("\u2016"); }))
+        << "the mark of a recording that is paused";
+    for (const char* text : {"Orvane", "paused", "q quit", "could not be placed"}) {
+        ASSERT_TRUE(terminal->waitFor(text)) << terminal->screen();
+        EXPECT_FALSE(terminal->isColoured(text)) << text;
+    }
+    EXPECT_TRUE(terminal->isReversed("Orvane"));
+    EXPECT_TRUE(terminal->isBold("q quit"));
+    const auto plain = play({"NO_COLOR=1"});
+    ASSERT_TRUE(plain->waitFor("q quit"));
+    ASSERT_TRUE(plain->waitFor("paused"));
+    EXPECT_FALSE(plain->isColoured("\u2016"));
 }
 
 TEST_F(TerminalProgramTest, WithoutUtf8OnlyAsciiIsSent)
@@ -420,12 +430,17 @@ TEST_F(TerminalProgramTest, ControlZGivesTheTerminalBackAndTheShellContinues)
     ASSERT_TRUE(shell->waitFor("Stopped")) << shell->screen();
     EXPECT_TRUE(
         shell->waitUntil([&] { return !shell->isOnOtherScreen() && !shell->tellsOfMouse(); }));
+    const std::size_t before = shell->received().size();
     shell->send(std::string("fg") + kEnter);
     ASSERT_TRUE(shell->waitUntil(
         [&] { return shell->isOnOtherScreen() && shell->shows("Serving Cell Info"); }));
     EXPECT_TRUE(shell->waitUntil([&] { return !shell->isInLineMode(); }));
     shell->send(kEnter);
     ASSERT_TRUE(shell->waitFor("Tracking Area Code"));
+    const std::string sent = shell->received().substr(before);
+    const std::string clear = "\x1b[2J";
+    ASSERT_THAT(sent, HasSubstr(clear));
+    EXPECT_EQ(sent.find(clear, sent.find(clear) + 1), std::string::npos) << "drawn twice";
     shell->send("q");
     EXPECT_TRUE(shell->waitUntil([&] { return !shell->isOnOtherScreen(); }));
 }

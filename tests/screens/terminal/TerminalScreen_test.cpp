@@ -266,6 +266,46 @@ TEST_F(TerminalBrowsingTest, TheListOfKeysOpensAndCloses)
     EXPECT_THAT(device.text(0), StartsWith(" Orvane"));
 }
 
+TEST_F(TerminalBrowsingTest, TheListOfKeysHasOnlyKeysThatDoSomethingNow)
+{
+    const auto keysNow = [this] {
+        type("?");
+        const std::string keys = device.screen();
+        press(Kind::Escape);
+        return keys;
+    };
+    isSavingOffered = true;
+    refresh({
+        {"Group", dictionary({{"A", "1"}})},
+        {"Band",  "7"                     }
+    });
+    EXPECT_THAT(keysNow(), AllOf(HasSubstr("save a snapshot"), HasSubstr("open the row"),
+                                 HasSubstr("a row up, down"), HasSubstr("filter as you type")));
+    EXPECT_THAT(keysNow(), Not(AnyOf(HasSubstr(" back\n"), HasSubstr("scroll a long value"),
+                                     HasSubstr("all rows"), HasSubstr("stop reading"))));
+    type("/band");
+    press(Kind::Enter);
+    EXPECT_THAT(keysNow(), HasSubstr("all rows"));
+    EXPECT_THAT(keysNow(), Not(AnyOf(HasSubstr("open the row"), HasSubstr("a row up, down"))));
+    press(Kind::Escape);
+    press(Kind::Home);
+    press(Kind::Enter);
+    EXPECT_THAT(keysNow(), HasSubstr(" back\n"));
+    press(Kind::Left);
+
+    isSavingOffered = false;
+    refresh({
+        {"Group",          dictionary({{"A", "1"}})},
+        { "Band", std::string(200,                     '7')}
+    });
+    EXPECT_THAT(keysNow(), HasSubstr("scroll a long value"));
+    EXPECT_THAT(keysNow(), Not(HasSubstr("save a snapshot")));
+
+    refresh({});
+    EXPECT_THAT(keysNow(), Not(HasSubstr("filter as you type")));
+    EXPECT_THAT(keysNow(), AllOf(HasSubstr("these keys"), HasSubstr("quit")));
+}
+
 TEST_F(TerminalBrowsingTest, ControlLDrawsEverythingAnew)
 {
     press(keyOfCharacter('L' & 0x1F));

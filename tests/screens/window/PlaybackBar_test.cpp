@@ -5,6 +5,7 @@
 #include "screens/window/FlatButton.h"
 #include "screens/window/TextLine.h"
 #include "screens/window/WindowTest.h"
+#include "screens/window/WrappedText.h"
 
 #include <gmock/gmock.h>
 
@@ -12,6 +13,7 @@
 #include <QProgressBar>
 #include <QSlider>
 #include <QTest>
+#include <QTextDocument>
 
 namespace orvane
 {
@@ -124,12 +126,42 @@ TEST_F(PlaybackBarTest, TypedTimeIsJumpedTo)
     EXPECT_EQ(bar().timeField().text(), "2026-11-21 10:00:00 UTC") << "the recording's again";
 }
 
-TEST_F(PlaybackBarTest, UnusableTimeStaysAndIsMarked)
+TEST_F(PlaybackBarTest, UnusableTimeStaysAndIsToldInWordsUntilAnotherIsTyped)
 {
+    EXPECT_FALSE(bar().refusal().isVisible());
     playback.takesText = false;
     typeTime("noon");
     EXPECT_EQ(bar().timeField().text(), "noon");
     EXPECT_TRUE(bar().timeField().property("isWrong").toBool());
+    EXPECT_TRUE(bar().refusal().isVisible());
+    EXPECT_TRUE(bar().refusal().text().startsWith("Not a time. Type 10:04:30"));
+    EXPECT_GE(bar().refusal().height(), bar().refusal().heightForWidth(bar().refusal().width()))
+        << "nothing of it is cut";
+    QTest::keyClick(&bar().timeField(), Qt::Key_Backspace);
+    turnEvents();
+    EXPECT_FALSE(bar().refusal().isVisible());
+    EXPECT_FALSE(bar().timeField().property("isWrong").toBool());
+}
+
+TEST_F(PlaybackBarTest, LeavingTheFieldEndsTheRefusal)
+{
+    playback.takesText = false;
+    typeTime("noon");
+    table().setFocus();
+    turnEvents();
+    EXPECT_FALSE(bar().refusal().isVisible());
+    EXPECT_EQ(bar().timeField().text(), "2026-11-21 10:00:00 UTC");
+}
+
+TEST_F(PlaybackBarTest, RemarkOfAFileIsPlainText)
+{
+    playback.note = "<img src='/dev/zero'>\x1b[2J";
+    change();
+    EXPECT_EQ(bar().remark().text(), QString("<img src='/dev/zero'>\uFFFD[2J"));
+    QTextDocument shown;
+    shown.setHtml(bar().remark().toolTip());
+    EXPECT_EQ(shown.toPlainText(), bar().remark().text());
+    EXPECT_EQ(bar().remark().accessibleDescription(), bar().remark().text());
 }
 
 TEST_F(PlaybackBarTest, PlayingDisturbsNoTyping)

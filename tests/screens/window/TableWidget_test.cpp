@@ -6,6 +6,8 @@
 #include <QHelpEvent>
 #include <QScrollBar>
 #include <QTest>
+#include <QTextDocument>
+#include <QToolTip>
 
 namespace orvane
 {
@@ -13,7 +15,15 @@ namespace orvane
 namespace
 {
 
-using TableWidgetTest = WindowTest;
+class TableWidgetTest : public WindowTest
+{
+protected:
+    void hoverOver(std::size_t index)
+    {
+        QHelpEvent event(QEvent::ToolTip, middleOf(index), table().mapToGlobal(middleOf(index)));
+        QCoreApplication::sendEvent(&table(), &event);
+    }
+};
 
 NodePointer manyRows(int count)
 {
@@ -94,14 +104,23 @@ TEST_F(TableWidgetTest, NameThatIsCutIsTheRowsToolTip)
     const QString name(100, 'x');
     show(rootNode({groupNode("Short", {}), groupNode(name.toStdString(), {})}));
     EXPECT_EQ(row(1)->content().labels.front().font.pixelSize(), 12);
-    const auto hover = [this](std::size_t index) {
-        QHelpEvent event(QEvent::ToolTip, middleOf(index), table().mapToGlobal(middleOf(index)));
-        QCoreApplication::sendEvent(&table(), &event);
-        return table().toolTip();
-    };
-    EXPECT_EQ(hover(0), "");
-    EXPECT_EQ(hover(1), name);
-    EXPECT_EQ(hover(0), "");
+    hoverOver(0);
+    EXPECT_FALSE(QToolTip::isVisible());
+    hoverOver(1);
+    EXPECT_EQ(QToolTip::text(), name);
+    hoverOver(0);
+    EXPECT_TRUE(turnEventsUntil([] { return !QToolTip::isVisible(); }));
+}
+
+TEST_F(TableWidgetTest, NameThatLooksLikeHtmlIsATextInTheToolTip)
+{
+    const std::string name = "<img src='/dev/zero'><b>" + std::string(100, 'x') + "</b>&amp;";
+    show(rootNode({groupNode(name, {})}));
+    hoverOver(0);
+    ASSERT_TRUE(QToolTip::isVisible());
+    QTextDocument shown;
+    shown.setHtml(QToolTip::text());
+    EXPECT_EQ(shown.toPlainText().toStdString(), name);
 }
 
 TEST_F(TableWidgetTest, RowsUnderOneAnotherTouch)
