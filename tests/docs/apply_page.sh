@@ -5,7 +5,8 @@
 #
 # A line "<!-- new file: PATH -->" stands before a block that is the whole file, "<!-- edit: PATH -->"
 # before one with lines of the file (a blank first) and lines to be added behind or between them ("+"
-# first). The lines of the file must follow each other there, and only once.
+# first). The lines of the file must follow each other there, and only once. A tree in which the page
+# has been followed stays as it is.
 set -euo pipefail
 page=$1 root=$2 folder=$3
 
@@ -20,28 +21,38 @@ block() {
 # Applies the edit that is standard input to the file given.
 edited() {
     awk -v edit="$(cat)" '
-        { line[NR] = $0 }
-        END {
-            count = split(edit, step, "\n")
-            for (i = 1; i <= count; ++i)
-                if (step[i] !~ /^[+]/)
-                    known[++knownCount] = substr(step[i], 2)
-            for (start = 1; start + knownCount - 1 <= NR; ++start) {
-                for (i = 1; i <= knownCount && line[start + i - 1] == known[i]; ++i)
+        # The place of `count` lines in the file; 0 where they are not there or more than once.
+        function place_of(lines, count,    start, i, place) {
+            for (start = 1; start + count - 1 <= NR; ++start) {
+                for (i = 1; i <= count && line[start + i - 1] == lines[i]; ++i)
                     ;
-                if (i > knownCount) {
+                if (i > count) {
+                    if (place)
+                        return 0
                     place = start
-                    ++places
                 }
             }
-            if (places != 1 || !knownCount)
+            return place
+        }
+        { line[NR] = $0 }
+        END {
+            count = split(edit, after, "\n")
+            for (i = 1; i <= count; ++i) {
+                if (after[i] !~ /^[+]/)
+                    before[++beforeCount] = substr(after[i], 2)
+                after[i] = substr(after[i], 2)
+            }
+            place = place_of(after, count)
+            isFollowed = place != 0
+            if (!isFollowed)
+                place = place_of(before, beforeCount)
+            if (!place || !beforeCount)
                 exit 1
             for (i = 1; i < place; ++i)
                 print line[i]
-            next_line = place
             for (i = 1; i <= count; ++i)
-                print step[i] ~ /^[+]/ ? substr(step[i], 2) : line[next_line++]
-            for (i = next_line; i <= NR; ++i)
+                print after[i]
+            for (i = place + (isFollowed ? count : beforeCount); i <= NR; ++i)
                 print line[i]
         }' "$1"
 }
@@ -51,11 +62,12 @@ while IFS= read -r mark; do
     mkdir -p "$folder/$(dirname -- "$path")"
     case $mark in
     "<!-- new file: "*)
-        if [ -e "$root/$path" ]; then
-            echo "$page: $path already exists" >&2
+        block "$mark" >"$folder/$path"
+        if [ -e "$root/$path" ] && ! cmp -s "$folder/$path" "$root/$path"; then
+            echo "$page: $path already exists, with other content" >&2
+            rm "$folder/$path"
             exit 1
         fi
-        block "$mark" >"$folder/$path"
         ;;
     *)
         block "$mark" | edited "$root/$path" >"$folder/$path" || {
