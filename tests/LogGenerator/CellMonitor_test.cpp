@@ -75,6 +75,19 @@ TEST_F(CellMonitorTest, ARootThatIsNoArrayCountsAsNoneSilently)
     EXPECT_THAT(services.log.lines, IsEmpty());
 }
 
+TEST_F(CellMonitorTest, ANumberTooLargeCostsNoCell)
+{
+    const PropertyValue cell = servingGsm();
+    cell.asDictionary()->set("Unread", PropertyValue::largeNumber({"18446744073709551616"}));
+    cell.asDictionary()->set("Level", PropertyValue::largeNumber({"1e400", true}));
+    const Bytes record = cellRecord({cell, servingUmts()});
+    const auto cells = cellArray(PacketView(record));
+    ASSERT_TRUE(cells);
+    EXPECT_EQ(cells->size(), 2U);
+    EXPECT_THAT(services.log.lines, IsEmpty());
+    EXPECT_EQ(cellNumber((*cells)[0], "Level"), std::nullopt);
+}
+
 TEST_F(CellMonitorTest, ACellIsKnownByItsTechnologyAndType)
 {
     const char* gsm = kTSCellMonitorRadioAccessTechnologyGSM;
