@@ -33,6 +33,7 @@ function(orvane_layer name)
   endforeach()
   list(REMOVE_DUPLICATES sees)
   target_link_libraries(orvane_${name} PRIVATE orvane_options)
+  orvane_precompile(orvane_${name})
   add_dependencies(layers orvane_${name})
 
   set_property(GLOBAL APPEND PROPERTY ORVANE_LAYERS ${name})

@@ -141,6 +141,8 @@ configure_preset() {
     require_cmake || return 1
     if command -v ccache >/dev/null; then
         export CMAKE_CXX_COMPILER_LAUNCHER=ccache
+        # Without this it leaves out whatever is compiled with precompiled headers.
+        export CCACHE_SLOPPINESS=${CCACHE_SLOPPINESS:-pch_defines,time_macros}
     fi
     if ! (cd "$root" && cmake --preset "$preset" "$@") </dev/null >&2; then
         say "Configuring failed: the lines above say what is missing. A library whose Debian package is"
