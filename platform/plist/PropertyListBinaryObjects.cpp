@@ -70,7 +70,7 @@ bool PropertyListBinaryObjects::readTrailer()
         return fail("binary property list cut short", _bytes.size());
     if (_bytes.size() > UINT32_MAX)
         return fail("binary property list longer than 4 GiB", _bytes.size());
-    // Six bytes that do not matter, the two widths, then three integers of 8 bytes.
+    // Six unused bytes, the two widths, then three integers of 8 bytes.
     const std::size_t trailer = _bytes.size() - kTrailerBytes;
     const auto numberAt = [this](std::size_t at) { return bigEndian(_bytes.subspan(at, 8)); };
     _offsetBytes = _bytes[trailer + 6];
@@ -88,7 +88,8 @@ bool PropertyListBinaryObjects::readTrailer()
     const std::size_t tableBytes = trailer - static_cast<std::size_t>(table);
     if (objectCount != tableBytes / _offsetBytes || tableBytes % _offsetBytes != 0)
         return fail("number of objects does not fit the offset table", trailer + 8);
-    // Each object takes a byte of its own, so more than this must overlap; told before any is kept.
+    // Each object takes at least one byte, so more objects must overlap. Refused before any is
+    // stored.
     if (objectCount > table - kMagicBytes)
         return fail("more objects than bytes for them", trailer + 8);
     if (root >= objectCount)
@@ -152,7 +153,7 @@ bool PropertyListBinaryObjects::readCount(Object& object)
         return fail("object beyond the end of the objects", object.begin);
     const unsigned marker = _bytes[at];
     if (marker < 0x10 || marker > 0x13)
-        return fail("count is no integer", at);
+        return fail("count is not an integer", at);
     const std::size_t width = std::size_t{1} << (marker & 15);
     if (width > _table - at - 1)
         return fail("object beyond the end of the objects", object.begin);

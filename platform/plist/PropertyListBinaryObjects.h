@@ -14,8 +14,8 @@ namespace orvane
 // The big-endian integer without sign in `bytes`, of which there are at most 8.
 std::uint64_t bigEndian(ByteView bytes);
 
-// The objects of a binary property list, found and bounded but not yet understood: every range
-// below lies within the list's object bytes, and no two objects overlap.
+// The objects of a binary property list: where each is, and how long. Their values are not read
+// yet. Every range below lies within the list's object bytes, and no two objects overlap.
 class PropertyListBinaryObjects
 {
 public:
@@ -49,12 +49,12 @@ public:
     [[nodiscard]] std::size_t count() const { return _objects.size(); }
     [[nodiscard]] Object operator[](std::size_t index) const;
     [[nodiscard]] std::size_t rootIndex() const { return _root; }
-    // The bytes of an object's content, where its count is in bytes.
+    // The bytes of an object's content. Only for objects whose count is in bytes.
     [[nodiscard]] ByteView content(const Object& object) const
     {
         return _bytes.subspan(object.content, object.count);
     }
-    // The object that a container's n-th reference names, or nothing when there is no such object.
+    // The object that a container's n-th reference names, or nullopt where there is no such object.
     // `n` is below the container's count, for a dictionary below twice its count.
     [[nodiscard]] std::optional<std::size_t> reference(const Object& container,
                                                        std::size_t n) const;
@@ -74,7 +74,7 @@ private:
     bool refuseOverlaps();
     [[nodiscard]] std::size_t endOf(std::size_t index) const;
 
-    // An object as it is kept: a list of a megabyte has up to 260,000 of them.
+    // An object in 12 bytes, since a list of one megabyte has up to 260,000 objects.
     struct Kept {
         std::uint32_t begin;
         std::uint32_t count;

@@ -69,7 +69,7 @@ private:
     enum class Use { Element, Key };
     // The value of the object that the container's n-th reference names.
     PropertyValue referenced(const Object& container, std::size_t n, Use use = Use::Element);
-    // Whether the memory is within the limit. Asked before it is taken.
+    // Whether so much memory is within the limit; fails otherwise. Called before it is taken.
     bool spend(std::size_t bytes, const Object& on);
     PropertyValue fail(std::string what, std::size_t at);
 
@@ -157,7 +157,7 @@ PropertyValue TreeBuilder::contentOf(const Object& object)
 
 PropertyValue TreeBuilder::integer(const Object& object)
 {
-    // Of 1, 2 and 4 bytes without sign; of 8 and 16 bytes with.
+    // Integers of 1, 2 and 4 bytes have no sign, those of 8 and 16 bytes have one.
     ByteView content = _objects.content(object);
     if (content.size() == 16) {
         const ByteView high = content.first(8);
@@ -249,7 +249,7 @@ PropertyValue TreeBuilder::referenced(const Object& container, std::size_t n, Us
         return fail("reference to no object", offset);
     const Type type = _objects[*index].type;
     if (use == Use::Key && type != Type::AsciiString && type != Type::Utf16String)
-        return fail("reference to a dictionary key that is no string", offset);
+        return fail("reference to a dictionary key that is not a string", offset);
     return value(*index);
 }
 

@@ -9,11 +9,11 @@
 namespace orvane
 {
 
-// How much memory the values of a list may still take. A short list can stand for many values: of a
-// binary list by references to the same object, of an XML list by elements of few characters. With
-// what the readers take themselves, the limit is below 64 MiB plus 20 times the list's size.
+// How much memory the values of a list may still take. A short list can stand for many values: a
+// binary list by references to the same object, an XML list by elements of few characters. Together
+// with the readers' own memory, the limit is below 64 MiB plus 20 times the list's size.
 //
-// What is spent is what the values take of the heap, or a little more.
+// The sizes below are what values take of the heap, or a little more.
 class PropertyListMemory
 {
 public:
@@ -24,7 +24,7 @@ public:
     {
     }
 
-    // Whether so many bytes are within the limit. To be asked before they are taken.
+    // Returns whether so many bytes are within the limit. Call it before they are taken.
     [[nodiscard]] bool spend(std::size_t bytes)
     {
         if (bytes > _left)
@@ -33,13 +33,13 @@ public:
         return true;
     }
 
-    // What an allocation takes of the heap: a header before it, rounded up.
+    // The size of an allocation with its header, rounded up as the heap does.
     static constexpr std::size_t allocation(std::size_t size)
     {
         return size == 0 ? 0 : std::max<std::size_t>(32, (size + 8 + 15) / 16 * 16);
     }
-    // What a text takes beside the value that holds it: nothing where it is short, and room for 30
-    // characters at least where it grows beyond that.
+    // What a text takes in addition to its value: nothing if it is short, else room for at least 30
+    // characters.
     static constexpr std::size_t text(std::size_t length)
     {
         constexpr std::size_t kLengthInPlace = 15;
@@ -58,7 +58,8 @@ public:
 
     static constexpr std::size_t kElementBytes = sizeof(PropertyValue);
     static constexpr std::size_t kEntryBytes = sizeof(std::string) + sizeof(PropertyValue);
-    // A dictionary of so many entries has an index, which takes this for each, and the key again.
+    // A dictionary of so many entries or more has an index, with this and a copy of the key an
+    // entry.
     static constexpr std::size_t kIndexedEntries = 32;
     static constexpr std::size_t kIndexBytes = 96;
 

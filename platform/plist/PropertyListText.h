@@ -14,7 +14,7 @@ namespace orvane
 // end. Takes memory for exactly the text.
 std::string utf8FromUtf16(ByteView bytes, std::endian order);
 
-// The text between quotation marks for an error line: on one line, and cut where it is long.
+// The text in quotation marks for an error message: on one line, and cut if it is long.
 std::string quotedExcerpt(std::string_view text);
 
 } // namespace orvane

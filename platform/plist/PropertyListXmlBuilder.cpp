@@ -180,8 +180,7 @@ bool PropertyListXmlBuilder::add(PropertyValue value)
 bool PropertyListXmlBuilder::spendFor(const PropertyValue& value)
 {
     using Memory = PropertyListMemory;
-    // Containers grow as elements come: up to twice as large as needed, with the earlier one
-    // beside.
+    // A container that grows has room for up to twice its elements, beside its earlier room.
     constexpr std::size_t kGrowth = 3;
     std::size_t bytes = 0;
     if (!_open.empty()) {

@@ -11,8 +11,8 @@
 namespace orvane
 {
 
-// Builds the value of an XML property list from its elements and texts in their order, and refuses
-// what is no property list. Once an operation has returned false, error() says why and no other may
+// Builds the value of an XML property list from its elements and texts in their order. An operation
+// returns false if they are not a property list; error() then says why, and no other operation may
 // follow.
 class PropertyListXmlBuilder
 {
@@ -22,11 +22,11 @@ public:
 
     bool startElement(std::string_view name);
     bool addText(std::string_view text);
-    // What it refuses is the fault of the element that was started last.
+    // If it returns false, the element that was started last is wrong.
     bool endElement();
 
     [[nodiscard]] const std::string& error() const { return _error; }
-    // The list's value, once its last element has ended.
+    // The list's value, after its last element has ended.
     [[nodiscard]] const PropertyValue& root() const { return _root; }
 
 private:
@@ -58,7 +58,7 @@ private:
     bool canStartHere(Element element, std::string_view name);
     bool endContainer();
     PropertyValue leafValue();
-    // Whether the value, a container still empty, is within the memory of the list.
+    // Stores the value, a container while it is empty. False if it exceeds the memory of the list.
     bool add(PropertyValue value);
     bool spendFor(const PropertyValue& value);
 

@@ -60,7 +60,7 @@ XmlRun::XmlRun(std::string_view text, const char* encoding)
         throw std::bad_alloc();
 }
 
-// Nothing may be thrown through Expat, and it may still call back after it has been stopped.
+// No exception may pass through Expat. It may still call back after it has been stopped.
 template <typename Action>
 void XmlRun::guard(void* self, Action action)
 {
@@ -165,7 +165,7 @@ std::string XmlRun::position(std::size_t at) const
 {
     constexpr std::string_view kUtf8Mark = "\xEF\xBB\xBF";
     const std::size_t first = _text.starts_with(kUtf8Mark) ? kUtf8Mark.size() : 0;
-    // Of the encodings that Expat knows, Latin-1 alone has characters of one byte beyond ASCII.
+    // Of the encodings that Expat knows, only Latin-1 has characters beyond ASCII of one byte.
     const bool isLatin1 = !_declaredEncoding.empty() && (_declaredEncoding[0] | 0x20) == 'i';
     std::size_t line = 1;
     std::size_t column = 1;

@@ -23,7 +23,7 @@ std::string_view trimmed(std::string_view text)
 
 PropertyValue refused(std::string_view text, const char* what, std::string& error)
 {
-    error = quotedExcerpt(text) + " is no " + what;
+    error = quotedExcerpt(text) + " is not " + what;
     return {};
 }
 
@@ -35,7 +35,7 @@ int daysOfMonth(int year, int month)
     return month == 2 && isLeapYear(year) ? 29 : kDays[month - 1];
 }
 
-// The number that stands in `width` digits at `at`.
+// The number written in the `width` digits at `at`.
 int digits(std::string_view text, std::size_t at, std::size_t width)
 {
     int number = 0;
@@ -77,7 +77,7 @@ PropertyValue integerFromXml(std::string_view text, std::string& error)
     const auto [stopped, fault] =
         std::from_chars(rest.data(), end, magnitude, isHexadecimal ? 16 : 10);
     if (stopped != end || fault == std::errc::invalid_argument)
-        return refused(text, "integer", error);
+        return refused(text, "an integer", error);
     const std::uint64_t highest = INT64_MAX;
     if (fault != std::errc() || magnitude > (isNegative ? highest + 1 : highest))
         return PropertyValue::largeNumber({std::string(trimmed(text)), false});
@@ -93,9 +93,9 @@ PropertyValue realFromXml(std::string_view text, std::string& error)
     double number = 0;
     const char* const end = rest.data() + rest.size();
     const auto [stopped, fault] = std::from_chars(rest.data(), end, number);
-    // A not-a-number with a payload in brackets would be taken otherwise.
+    // from_chars would also accept a not-a-number with a payload in brackets.
     if (stopped != end || fault == std::errc::invalid_argument || rest.ends_with(')'))
-        return refused(text, "real number", error);
+        return refused(text, "a real number", error);
     if (fault != std::errc())
         return PropertyValue::largeNumber({std::string(trimmed(text)), true});
     return PropertyValue::real(number);
@@ -109,7 +109,7 @@ PropertyValue dateFromXml(std::string_view text, std::string& error)
     for (std::size_t i = 0; isDate && i < kForm.size(); ++i)
         isDate = kForm[i] == '0' ? date[i] >= '0' && date[i] <= '9' : date[i] == kForm[i];
     if (!isDate)
-        return refused(text, "date of the form YYYY-MM-DDThh:mm:ssZ", error);
+        return refused(text, "a date of the form YYYY-MM-DDThh:mm:ssZ", error);
 
     const int year = digits(date, 0, 4);
     const int month = digits(date, 5, 2);
@@ -118,7 +118,7 @@ PropertyValue dateFromXml(std::string_view text, std::string& error)
         year, month, day, digits(date, 11, 2), digits(date, 14, 2), digits(date, 17, 2)};
     if (year < 1 || month < 1 || month > 12 || day < 1 || day > daysOfMonth(year, month) ||
         time.hour > 23 || time.minute > 59 || time.second > 59)
-        return refused(text, "date of the calendar", error);
+        return refused(text, "a date of the calendar", error);
     return PropertyValue::date({static_cast<double>(secondsSince1970(time))});
 }
 

@@ -8,9 +8,8 @@
 namespace orvane
 {
 
-// The values of XML property lists that are written as one text, from that text. Spaces, tabs and
-// line ends around it do not count. On bad text each yields an absent value and says in `error`
-// what is wrong with it.
+// Each makes a value from the text of an XML element. Spaces, tabs and line ends around the text
+// are ignored. For a bad text each returns an absent value and sets `error`.
 
 // Decimal or, after "0x", hexadecimal, with or without a sign. One outside 64 signed bits becomes a
 // large number.

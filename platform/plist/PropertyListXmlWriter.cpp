@@ -21,7 +21,7 @@ constexpr std::size_t kBytesADataLine = 48; // 64 characters
 // No line is indented further, so that a list of many deep values does not become mostly tabs.
 constexpr std::size_t kIndentLimit = 32;
 
-// How a character stands in a text: null for as it is, empty for not at all.
+// How a character is written: null for unchanged, empty if it cannot be written.
 using Escapes = std::array<const char*, 256>;
 
 constexpr Escapes escapes()
@@ -55,7 +55,7 @@ void appendBase64(std::string& to, ByteView bytes)
     }
 }
 
-// Each operation yields whether XML can carry what it was given.
+// Each operation returns whether XML can hold what it was given.
 class XmlWriter
 {
 public:
@@ -142,7 +142,7 @@ bool XmlWriter::writeArray(const PropertyArray& array)
 
 bool XmlWriter::openContainer(const char* element)
 {
-    // What is written can be read again; this also ends a container that holds itself.
+    // A deeper list could not be read again. This also ends a container that holds itself.
     if (_depth == kPropertyListDepthLimit)
         return false;
     writeLine(std::string("<") + element + ">");
@@ -182,7 +182,7 @@ bool XmlWriter::writeText(const char* element, std::string_view text)
 
 bool XmlWriter::writeReal(double number)
 {
-    // Not-a-number has a sign that to_chars would show.
+    // to_chars would show the sign of a not-a-number.
     if (std::isnan(number))
         return writeLine("<real>nan</real>");
     char digits[40];

@@ -265,8 +265,8 @@ TEST(PropertyListBinaryReaderTest, KeyThatIsNoStringIsRefused)
     for (const std::size_t wrong : {one, inner}) {
         BinaryListBuilder each = list;
         const std::size_t root = each.dictionary({key, wrong}, {one, one});
-        expectFault(each,
-                    "reference to a dictionary key that is no string" + at(each.offsets[root] + 2));
+        expectFault(each, "reference to a dictionary key that is not a string" +
+                              at(each.offsets[root] + 2));
     }
 }
 
@@ -380,8 +380,9 @@ TEST(PropertyListBinaryReaderTest, ObjectsThatReachBeyondTheObjectsAreRefused)
              "DF 13 80 00 00 00 00 00 00 00",
          })
         EXPECT_EQ(readObject(hexBytes(object)).error, error) << object;
-    EXPECT_EQ(readObject(hexBytes("5F 51 61")).error, "count is no integer" + at(kFirst + 1));
-    EXPECT_EQ(readObject(hexBytes("5F 14 00 00")).error, "count is no integer" + at(kFirst + 1));
+    EXPECT_EQ(readObject(hexBytes("5F 51 61")).error, "count is not an integer" + at(kFirst + 1));
+    EXPECT_EQ(readObject(hexBytes("5F 14 00 00")).error,
+              "count is not an integer" + at(kFirst + 1));
 }
 
 TEST(PropertyListBinaryReaderTest, ObjectOffsetsOutOfRangeAreRefused)

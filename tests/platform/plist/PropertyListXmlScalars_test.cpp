@@ -81,7 +81,7 @@ TEST(PropertyListXmlScalarsTest, TextsThatAreNoIntegerAreRefused)
 {
     for (const std::string text : {"", " ", "+", "-", "--1", "+-1", "-+1", "- 1", "1 2", "1.0",
                                    "1e3", "0x", "x1", "0x-1", "0xG", "12a", "one"})
-        EXPECT_EQ(faultOf("<integer>" + text + "</integer>"), "\"" + text + "\" is no integer");
+        EXPECT_EQ(faultOf("<integer>" + text + "</integer>"), "\"" + text + "\" is not an integer");
 }
 
 TEST(PropertyListXmlScalarsTest, RealsAreReadInEveryForm)
@@ -124,7 +124,7 @@ TEST(PropertyListXmlScalarsTest, TextsThatAreNoRealAreRefused)
 {
     for (const std::string text : {"", "+", "-", "+-1", "--1", "1,5", "1.5.5", "1e", "0x10", "1 2",
                                    "nan(7)", "infinite", "e5", "."})
-        EXPECT_EQ(faultOf("<real>" + text + "</real>"), "\"" + text + "\" is no real number");
+        EXPECT_EQ(faultOf("<real>" + text + "</real>"), "\"" + text + "\" is not a real number");
 }
 
 TEST(PropertyListXmlScalarsTest, DatesAreReadInUtc)
@@ -154,14 +154,14 @@ TEST(PropertyListXmlScalarsTest, TextsThatAreNoDateAreRefused)
           "2026-11-21T10:00:00.5Z", "26-11-21T10:00:00Z", "-026-11-21T10:00:00Z",
           "2026-11-21T10:00:0/Z", "2026-11-21T10:00:0:Z"})
         EXPECT_EQ(faultOf("<date>" + text + "</date>"),
-                  "\"" + text + "\" is no date of the form YYYY-MM-DDThh:mm:ssZ");
+                  "\"" + text + "\" is not a date of the form YYYY-MM-DDThh:mm:ssZ");
     for (const std::string text :
          {"0000-01-01T00:00:00Z", "2026-00-21T10:00:00Z", "2026-13-21T10:00:00Z",
           "2026-11-00T10:00:00Z", "2026-11-31T10:00:00Z", "2026-02-29T10:00:00Z",
           "1900-02-29T10:00:00Z", "2024-02-30T10:00:00Z", "2026-12-32T10:00:00Z",
           "2026-11-21T24:00:00Z", "2026-11-21T10:60:00Z", "2026-11-21T10:00:60Z"})
         EXPECT_EQ(faultOf("<date>" + text + "</date>"),
-                  "\"" + text + "\" is no date of the calendar");
+                  "\"" + text + "\" is not a date of the calendar");
 }
 
 TEST(PropertyListXmlScalarsTest, DataIsReadFromBase64)
@@ -189,15 +189,16 @@ TEST(PropertyListXmlScalarsTest, TextsThatAreNoBase64AreRefused)
 {
     for (const std::string text : {"TWF*", "=", "====", "T===", "TQ=x", "TQ==TWFu",
                                    "TQ===", "TWFu=", "TW-_", "\xC3\xA9\xC3\xA9"})
-        EXPECT_EQ(faultOf("<data>" + text + "</data>"), "\"" + text + "\" is no base64 text");
+        EXPECT_EQ(faultOf("<data>" + text + "</data>"), "\"" + text + "\" is not base64 text");
     for (const std::string text : {"T", "TQ", "TQ=", "TWE", "TWFuT"})
-        EXPECT_EQ(faultOf("<data>" + text + "</data>"), "\"" + text + "\" is no whole base64 text");
+        EXPECT_EQ(faultOf("<data>" + text + "</data>"),
+                  "\"" + text + "\" is not whole base64 text");
 }
 
 TEST(PropertyListXmlScalarsTest, LongTextIsCutInTheFailure)
 {
     EXPECT_EQ(faultOf("<integer>" + std::string(1000, 'x') + "</integer>"),
-              "\"" + std::string(40, 'x') + "...\" is no integer");
+              "\"" + std::string(40, 'x') + "...\" is not an integer");
 }
 
 } // namespace
