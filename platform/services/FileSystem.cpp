@@ -1,8 +1,12 @@
 #include "platform/services/FileSystem.h"
 
+#include <cerrno>
 #include <cstdio>
+#include <fcntl.h>
 #include <filesystem>
 #include <memory>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace orvane
 {
@@ -50,21 +54,57 @@ std::optional<Bytes> readFile(const std::string& path, std::size_t limit)
     return content;
 }
 
+namespace
+{
+
+// Makes way for a new file: removes an earlier regular file of the own user. Returns false, with
+// errno set, when something else has the name.
+bool removeOwnFile(const std::string& path)
+{
+    struct stat found {
+    };
+    if (::lstat(path.c_str(), &found) != 0)
+        return errno == ENOENT;
+    if (!S_ISREG(found.st_mode) || found.st_uid != ::geteuid()) {
+        errno = EEXIST;
+        return false;
+    }
+    return ::unlink(path.c_str()) == 0;
+}
+
+// Returns whether everything is written; errno says why not.
+bool writeAll(int descriptor, ByteView content)
+{
+    while (!content.empty()) {
+        const auto written = ::write(descriptor, content.data(), content.size());
+        if (written < 0 && errno == EINTR)
+            continue;
+        if (written < 0)
+            return false;
+        content = content.subspan(static_cast<std::size_t>(written));
+    }
+    return true;
+}
+
+} // namespace
+
 bool writeFile(const std::string& path, ByteView content)
 {
-    std::FILE* file = std::fopen(path.c_str(), "wb");
-    if (!file)
+    if (!removeOwnFile(path))
         return false;
-    const bool written =
-        content.empty() || std::fwrite(content.data(), 1, content.size(), file) == content.size();
-    // Closing writes what is still buffered, so a full disk may show only here.
-    const bool closed = std::fclose(file) == 0;
-    if (written && closed)
+    // O_EXCL: nothing that somebody has put there meanwhile is followed, opened or waited for.
+    const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+    if (descriptor < 0)
+        return false;
+    const bool isWritten = writeAll(descriptor, content);
+    int problem = errno;
+    // Some file systems report a full disk only here.
+    const bool isClosed = ::close(descriptor) == 0;
+    if (isWritten && isClosed)
         return true;
-    // Half a file could be taken for a whole one. What stood there before is gone already.
-    std::error_code error;
-    if (std::filesystem::is_regular_file(path, error))
-        std::filesystem::remove(path, error);
+    problem = isWritten ? errno : problem;
+    ::unlink(path.c_str()); // half a file could be taken for a whole one
+    errno = problem;
     return false;
 }
 

@@ -25,10 +25,11 @@ private:
     std::string _root;
 };
 
-// The whole file, or nothing when it cannot be read or is longer than `limit` bytes.
+// Returns the whole file; nullopt when it cannot be read or is longer than `limit` bytes.
 std::optional<Bytes> readFile(const std::string& path, std::size_t limit = SIZE_MAX);
-// Writes the file directly, replacing an earlier one. Where it could be begun but not finished, it
-// is removed: no half file is left behind.
+// Creates the file and writes it directly. An earlier regular file of the own user is removed
+// first; anything else of that name (a symbolic link, a pipe, another user's file) makes it fail
+// and stays. A file that cannot be finished is removed. Where it returns false, errno says why.
 bool writeFile(const std::string& path, ByteView content);
 
 } // namespace orvane

@@ -9,7 +9,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
 #include <filesystem>
+#include <sys/inotify.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace orvane
 {
@@ -59,11 +63,32 @@ TEST_F(SnapshotFileTest, HoldsTheThreeKeysAndTheEntriesUnchanged)
 TEST_F(SnapshotFileTest, IsWrittenDirectlyNotThroughATemporaryFile)
 {
     makeFolder();
-    const std::string target = root.path() + "/target";
-    std::filesystem::create_symlink(target,
-                                    root.path() + kFolder + "/OrvaneSnapshot-1795255200.orvane");
+    const int watch = ::inotify_init1(IN_NONBLOCK | IN_CLOEXEC);
+    ASSERT_GE(::inotify_add_watch(watch, (root.path() + kFolder).c_str(), IN_CREATE | IN_MOVED_TO),
+              0);
     EXPECT_TRUE(writeSnapshotFile(files, PropertyValue::newArray(), 0, "").isWritten);
-    EXPECT_EQ(read(target)["Description"], PropertyValue(""));
+    alignas(inotify_event) std::array<char, 4096> events{};
+    const auto length = ::read(watch, events.data(), events.size());
+    ::close(watch);
+    const auto* event = reinterpret_cast<const inotify_event*>(events.data());
+    ASSERT_EQ(length, static_cast<ssize_t>(sizeof *event + event->len)) << "one name appears";
+    EXPECT_EQ(event->mask, static_cast<std::uint32_t>(IN_CREATE));
+    EXPECT_STREQ(event->name, "OrvaneSnapshot-1795255200.orvane");
+}
+
+TEST_F(SnapshotFileTest, IsNeverWrittenThroughASymbolicLinkOrIntoAPipe)
+{
+    makeFolder();
+    const std::string path = root.path() + kFolder + "/OrvaneSnapshot-1795255200.orvane";
+    const std::string target = root.path() + "/precious";
+    ASSERT_TRUE(writeFile(target, Bytes{1, 2, 3}));
+    std::filesystem::create_symlink(target, path);
+    EXPECT_FALSE(writeSnapshotFile(files, PropertyValue::newArray(), 0, "").isWritten);
+    EXPECT_EQ(readFile(target), (Bytes{1, 2, 3}));
+
+    std::filesystem::remove(path);
+    ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+    EXPECT_FALSE(writeSnapshotFile(files, PropertyValue::newArray(), 0, "").isWritten);
 }
 
 TEST_F(SnapshotFileTest, IsNamedByTheTimeOfSavingNotByTheTimestamp)

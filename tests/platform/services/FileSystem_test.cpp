@@ -2,10 +2,14 @@
 
 #include "support/TemporaryDirectory.h"
 
+#include <gtest/gtest.h>
+
+#include <cerrno>
 #include <csignal>
 #include <filesystem>
-#include <gtest/gtest.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace orvane
 {
@@ -140,10 +144,49 @@ TEST(FileSystemTest, FailedWriteLeavesNoHalfFile)
     EXPECT_EQ(readFile(path), numbered(2000));
 }
 
-TEST(FileSystemTest, FailedWriteRemovesNothingButAFile)
+TEST(FileSystemTest, OnlyARegularFileIsReplaced)
 {
-    EXPECT_FALSE(writeFile("/dev/full", numbered(10)));
-    EXPECT_TRUE(fs::exists("/dev/full"));
+    const TemporaryDirectory directory;
+    const std::string target = directory.path() + "/target";
+    ASSERT_TRUE(writeFile(target, numbered(10)));
+    const std::string link = directory.path() + "/link";
+    const std::string dangling = directory.path() + "/dangling";
+    const std::string pipe = directory.path() + "/pipe";
+    fs::create_symlink(target, link);
+    fs::create_symlink(directory.path() + "/nowhere", dangling);
+    ASSERT_EQ(::mkfifo(pipe.c_str(), 0600), 0);
+    for (const std::string& path : {link, dangling, pipe, std::string("/dev/full")}) {
+        errno = 0;
+        EXPECT_FALSE(writeFile(path, numbered(20))) << path;
+        EXPECT_EQ(errno, EEXIST) << path;
+        EXPECT_FALSE(fs::is_regular_file(fs::symlink_status(path))) << path;
+    }
+    EXPECT_EQ(readFile(target), numbered(10));
+    EXPECT_FALSE(fs::exists(directory.path() + "/nowhere"));
+}
+
+TEST(FileSystemTest, AnEarlierFileIsReplacedByANewOne)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    const std::string other = directory.path() + "/other";
+    ASSERT_TRUE(writeFile(path, numbered(10)));
+    fs::create_hard_link(path, other);
+    ASSERT_TRUE(writeFile(path, numbered(20)));
+    EXPECT_EQ(readFile(path), numbered(20));
+    EXPECT_EQ(readFile(other), numbered(10));
+}
+
+TEST(FileSystemTest, AFileOfAnotherUserIsNotReplaced)
+{
+    if (::geteuid() != 0)
+        GTEST_SKIP() << "only root can make one";
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/file";
+    ASSERT_TRUE(writeFile(path, numbered(10)));
+    ASSERT_EQ(::chown(path.c_str(), 65534, 65534), 0);
+    EXPECT_FALSE(writeFile(path, numbered(20)));
+    EXPECT_EQ(readFile(path), numbered(10));
 }
 
 TEST(FileSystemTest, FailedWriteOverAnEarlierFileLeavesNoHalfFile)
