@@ -9,6 +9,7 @@
 #include "app/program/SimulatedPhone.h"
 #include "app/program/TerminalFrontEnd.h"
 #include "app/program/WindowFrontEnd.h"
+#include "platform/linux/BoundedCall.h"
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
@@ -85,11 +86,13 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
     const std::unique_ptr<LiveApp> app =
         frontEnd->makeApp({queue, ports, server, options.refreshInterval, makeUuid, recorder.get()},
                           files, preferences);
-    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    const SignalWatcher signals([&loop](int) { loop.quit(); }, {SIGINT, SIGTERM, SIGHUP},
+                                SignalWatcher::Second::EndsProgram);
 
     frontEnd->begin(*app);
     app->applicationDidFinishLaunching();
     loop.run();
+    frontEnd->end();
     app->applicationWillTerminate();
     return frontEnd->exitStatus();
 }
@@ -163,10 +166,11 @@ int main(int argc, char** argv)
     const auto log = makeLog(options.log, "orvane");
     // Standard output carries data, or the terminal's screen, unless there is a window.
     const ProgramServices services(log.get(), kind == FrontEndKind::Window ? stdout : stderr);
+    int status = kFailure;
     try {
-        return isExport ? runExport(options) : run(options, kind);
+        status = isExport ? runExport(options) : run(options, kind);
     } catch (const std::exception& failure) {
         complain(failure.what());
-        return kFailure;
     }
+    return exitStatusAfterTasks(status);
 }

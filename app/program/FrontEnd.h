@@ -24,6 +24,8 @@ public:
     }
     // The application is about to start. It must not be used once the event loop has ended.
     virtual void begin(LiveApp&) {}
+    // The event loop has ended: gives the screen back, before the application's last work.
+    virtual void end() {}
     // What the program ends with; what is wrong has been told then.
     [[nodiscard]] virtual int exitStatus() { return 0; }
 };

@@ -60,7 +60,8 @@ int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& lo
                                                  });
     const LineReader lines(
         STDIN_FILENO, [&](std::string_view line, bool) { takeLine(line, output.printer(), loop); });
-    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    const SignalWatcher signals([&loop](int) { loop.quit(); }, {SIGINT, SIGTERM, SIGHUP},
+                                SignalWatcher::Second::EndsProgram);
     loop.run();
     progress.reset();
     if (printer->failure()) {
@@ -86,7 +87,8 @@ int browseRecording(const AppOptions& options, std::unique_ptr<FrontEnd> frontEn
         return std::chrono::nanoseconds(std::chrono::steady_clock::now().time_since_epoch());
     };
     RecordingApp app({queue, now, files, fail}, opened(options), settingsOf(options));
-    const SignalWatcher signals([&loop](int) { loop.quit(); });
+    const SignalWatcher signals([&loop](int) { loop.quit(); }, {SIGINT, SIGTERM, SIGHUP},
+                                SignalWatcher::Second::EndsProgram);
     app.applicationDidFinishLaunching();
     loop.run();
     app.applicationWillTerminate();

@@ -33,6 +33,8 @@ public:
     {
     }
 
+    void end() override { _device.giveBack(); }
+
 private:
     void readInput()
     {

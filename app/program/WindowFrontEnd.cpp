@@ -16,6 +16,8 @@ class WindowFrontEnd final : public FrontEnd
 public:
     explicit WindowFrontEnd(QtScreen::Settings settings) : _screen(std::move(settings)) {}
 
+    void end() override { _screen.hide(); }
+
 private:
     QtScreen _screen;
 };

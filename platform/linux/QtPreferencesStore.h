@@ -3,11 +3,9 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/services/PreferencesStore.h"
 
+#include <chrono>
 #include <map>
-#include <memory>
 #include <string>
-
-class QSettings;
 
 namespace orvane
 {
@@ -16,9 +14,14 @@ namespace orvane
 // directory ($XDG_CONFIG_HOME, else ~/.config). A notice is the signal "Changed" of the interface
 // "org.orvane.Preferences", from the object "/org/orvane/Preferences", with domain and key, on the
 // session bus where there is one.
+//
+// Neither a file that another program has locked, nor one that is a pipe, nor a bus that does not
+// answer keeps a call for longer than kPatience; an error line then says what was not done.
 class QtPreferencesStore final : public PreferencesStore
 {
 public:
+    static constexpr std::chrono::milliseconds kPatience{500};
+
     QtPreferencesStore();
     ~QtPreferencesStore() override;
 
@@ -28,10 +31,8 @@ public:
     void postChangeNotice(const std::string& domain, const std::string& key) override;
 
 private:
-    QSettings& settings(const std::string& domain);
-
     // What was set and is not written yet, by domain.
-    std::map<std::string, std::unique_ptr<QSettings>> _open;
+    std::map<std::string, PropertyDictionary> _unwritten;
 };
 
 } // namespace orvane

@@ -22,6 +22,11 @@ namespace
 std::array<std::atomic<int>, 65> pipes{};
 static_assert(std::atomic<int>::is_always_lock_free, "the handler may not take a lock");
 
+// What to do with SIGINT and SIGTERM once a signal of an ending watcher has come. Written before
+// handleEndSignal() is installed.
+struct sigaction actionOfSecond[2];
+constexpr std::array<int, 2> kEndSignals = {SIGINT, SIGTERM};
+
 void handleSignal(int signal)
 {
     const int savedErrno = errno;
@@ -30,6 +35,13 @@ void handleSignal(int signal)
     [[maybe_unused]] const auto written =
         ::write(pipes[static_cast<std::size_t>(signal)].load() - 1, &number, 1);
     errno = savedErrno;
+}
+
+void handleEndSignal(int signal)
+{
+    for (std::size_t i = 0; i < kEndSignals.size(); ++i)
+        ::sigaction(kEndSignals[i], &actionOfSecond[i], nullptr);
+    handleSignal(signal);
 }
 
 } // namespace
@@ -46,7 +58,7 @@ struct SignalWatcher::State {
     State& operator=(const State&) = delete;
     ~State() { restore(); }
 
-    void take(int signal)
+    void take(int signal, void (*handler)(int))
     {
         if (signal < 1 || static_cast<std::size_t>(signal) >= pipes.size())
             throw std::invalid_argument("No such signal: " + std::to_string(signal));
@@ -54,7 +66,7 @@ struct SignalWatcher::State {
         Earlier entry{signal, {}, pipe.exchange(writeEnd.get() + 1)};
         struct sigaction action {
         };
-        action.sa_handler = handleSignal;
+        action.sa_handler = handler;
         action.sa_flags = SA_RESTART;
         ::sigfillset(&action.sa_mask);
         if (::sigaction(signal, &action, &entry.action) != 0) {
@@ -83,7 +95,7 @@ struct SignalWatcher::State {
     bool isStopped = false;
 };
 
-SignalWatcher::SignalWatcher(Callback callback, std::vector<int> signals)
+SignalWatcher::SignalWatcher(Callback callback, std::vector<int> signals, Second second)
     : _state(std::make_shared<State>())
 {
     std::array<int, 2> ends{};
@@ -92,8 +104,11 @@ SignalWatcher::SignalWatcher(Callback callback, std::vector<int> signals)
     _state->readEnd = FileDescriptor(ends[0]);
     _state->writeEnd = FileDescriptor(ends[1]);
     _state->callback = std::move(callback);
+    if (second == Second::EndsProgram)
+        for (std::size_t i = 0; i < kEndSignals.size(); ++i)
+            ::sigaction(kEndSignals[i], nullptr, &actionOfSecond[i]);
     for (const int signal : signals)
-        _state->take(signal);
+        _state->take(signal, second == Second::EndsProgram ? handleEndSignal : handleSignal);
     _state->watcher = std::make_unique<DescriptorWatcher>(
         _state->readEnd.get(), DescriptorWatcher::For::Reading, [weak = std::weak_ptr(_state)] {
             const auto state = weak.lock(); // lives until the callback has returned

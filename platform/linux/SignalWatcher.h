@@ -18,9 +18,14 @@ public:
     // it may be one call. The callback may destroy the watcher.
     using Callback = std::function<void(int signal)>;
 
+    // `EndsProgram`: once one of the signals has come, another SIGINT or SIGTERM does what it did
+    // before the watcher, whether or not the loop has heard of the first one.
+    enum class Second { IsCalledToo, EndsProgram };
+
     // Throws std::system_error when the process has run out of descriptors, and
     // std::invalid_argument for a number that is no signal or cannot be caught.
-    explicit SignalWatcher(Callback callback, std::vector<int> signals = {SIGINT, SIGTERM, SIGHUP});
+    explicit SignalWatcher(Callback callback, std::vector<int> signals = {SIGINT, SIGTERM, SIGHUP},
+                           Second second = Second::IsCalledToo);
     ~SignalWatcher();
     SignalWatcher(const SignalWatcher&) = delete;
     SignalWatcher& operator=(const SignalWatcher&) = delete;

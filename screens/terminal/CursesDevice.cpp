@@ -129,6 +129,8 @@ CursesDevice::~CursesDevice()
     delscreen(_state->screen);
 }
 
+void CursesDevice::giveBack() { _state->giveBack(); }
+
 int CursesDevice::lines() const { return LINES; }
 
 int CursesDevice::columns() const { return COLS; }

@@ -28,6 +28,8 @@ public:
     void updateSize() override;
     void suspend() override;
     void retake() override;
+    // Leaves the terminal as it was found, for good unless there is a retake().
+    void giveBack();
     // False in the background, until a retake() in the foreground.
     [[nodiscard]] bool hasTerminal() const;
 

@@ -104,6 +104,8 @@ void QtScreen::setNeedsUpdate()
         _frame.get(), [this] { update(); }, Qt::QueuedConnection);
 }
 
+void QtScreen::hide() { _frame->hide(); }
+
 void QtScreen::update()
 {
     _isUpdateQueued = false;

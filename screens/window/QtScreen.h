@@ -39,6 +39,8 @@ public:
     [[nodiscard]] std::unique_ptr<Interface> loadInterface(const std::string& name) override;
     void setNeedsUpdate() override;
 
+    // Takes the window off the screen until the next update.
+    void hide();
     // Draws what has changed now.
     void update();
     [[nodiscard]] WindowFrame& frame() const { return *_frame; }

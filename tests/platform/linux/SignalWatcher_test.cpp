@@ -2,6 +2,7 @@
 
 #include "platform/linux/QtTest.h"
 
+#include <cstdlib>
 #include <optional>
 #include <stdexcept>
 
@@ -95,6 +96,40 @@ TEST_F(SignalWatcherTest, NumbersThatAreNoSignalsAreRefusedAndLeaveNothingBehind
     std::raise(SIGUSR1);
     EXPECT_EQ(handledDirectly, 1);
     std::signal(SIGUSR1, before);
+}
+
+// In a process of its own. No event loop runs, as in a program that is stuck.
+void raiseEndSignals(int first, int second)
+{
+    const SignalWatcher watcher([](int) {}, {SIGINT, SIGTERM, SIGHUP},
+                                SignalWatcher::Second::EndsProgram);
+    std::raise(first);
+    std::raise(second);
+    std::_Exit(0);
+}
+
+TEST_F(SignalWatcherTest, ASecondSignalEndsTheProgramEvenWhereItsLoopDoesNotRun)
+{
+    EXPECT_EXIT(raiseEndSignals(SIGTERM, SIGTERM), testing::KilledBySignal(SIGTERM), "");
+    EXPECT_EXIT(raiseEndSignals(SIGTERM, SIGINT), testing::KilledBySignal(SIGINT), "");
+    EXPECT_EXIT(raiseEndSignals(SIGHUP, SIGTERM), testing::KilledBySignal(SIGTERM), "");
+    EXPECT_EXIT(raiseEndSignals(SIGTERM, SIGHUP), testing::ExitedWithCode(0), "")
+        << "a terminal that closes sends it on its own";
+}
+
+TEST_F(SignalWatcherTest, ASecondSignalDoesWhatItDidBeforeTheWatcher)
+{
+    const auto before = std::signal(SIGTERM, handleDirectly);
+    handledDirectly = 0;
+    {
+        const SignalWatcher watcher(record, {SIGINT, SIGTERM}, SignalWatcher::Second::EndsProgram);
+        std::raise(SIGTERM);
+        EXPECT_EQ(handledDirectly, 0);
+        std::raise(SIGTERM);
+        EXPECT_EQ(handledDirectly, 1);
+        EXPECT_TRUE(runUntil([&] { return received.size() == 1; }));
+    }
+    std::signal(SIGTERM, before);
 }
 
 } // namespace
