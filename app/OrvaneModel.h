@@ -4,7 +4,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
-#include "platform/ports/MessagePort.h"
+#include "platform/ports/MessagePorts.h"
 #include "platform/ports/TelephonyServer.h"
 #include "platform/services/MainQueue.h"
 #include "ui/tree/OrvaneModelNode.h"

@@ -20,8 +20,8 @@
 #include "platform/linux/SocketTransport.h"
 #include "platform/linux/StalePorts.h"
 #include "platform/linux/StandardDescriptors.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "platform/services/Complaint.h"
 #include "platform/services/Uuid.h"
 #include "recordings/LogRecorder.h"
@@ -76,8 +76,8 @@ int watch(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop,
           FrameTransport& transport, const std::string& root)
 {
     QtMainQueue queue;
-    FramePorts ports(transport, queue);
-    FrameTelephonyServer server(transport, ports, queue);
+    MessagePorts ports(transport, queue);
+    TelephonyServer server(transport, ports, queue);
     const FileSystem files(root);
     QtPreferencesStore preferences;
 

@@ -13,8 +13,8 @@ namespace orvane
 
 // The end of a connection that sends requests and waits for their replies. Owns the connection.
 //
-// Replies are told apart by their serials: one that comes after its request was given up is
-// dropped. A request from the other end is answered with no data, since nobody takes it here.
+// A reply belongs to the request of its serial; one that comes after its request was given up is
+// dropped. A request from the other end is answered without data.
 class FrameRequester
 {
 public:
@@ -22,15 +22,19 @@ public:
     FrameRequester(const FrameRequester&) = delete;
     FrameRequester& operator=(const FrameRequester&) = delete;
 
-    // Called for each frame that is no reply, also from within send(): it must not call back here.
+    // Called for each frame that is not a reply, also from within send(). Must not call this
+    // object.
     void setMessageCallback(std::function<void(const FrameReader::View&)> callback);
     // As the connection's own, never from within a call.
     void setClosedCallback(std::function<void()> callback);
 
     [[nodiscard]] bool isOpen() const { return _connection->isOpen(); }
     void close() { _connection->close(); }
-    // As RemoteMessagePort::send. Data beyond kFrameDataLimit is refused with an error line and
-    // TransportError; the connection goes on.
+    // Sends one message, waiting at most `sendTimeout` for it to be taken. With `reply` given,
+    // waits at most `receiveTimeout` for the answer and stores its data there (empty where the
+    // receiver had no reply data). A frame cut short by a send time-out closes the connection. Data
+    // beyond kFrameDataLimit is refused with an error line and TransportError; the connection stays
+    // open.
     SendStatus send(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
                     std::chrono::milliseconds receiveTimeout, Bytes* reply);
 
@@ -50,8 +54,8 @@ private:
     std::optional<Awaited> _awaited;
 };
 
-// Sends the one reply that a request gets, without data where there is none. False, with an error
-// line, when the peer leaves so many replies unread that the connection must end.
+// Sends the one reply that a request gets, without data where there is none. Returns false, with an
+// error line, when the peer leaves so many replies unread that the connection must end.
 bool answerRequest(FrameConnection& connection, std::int32_t messageId, std::uint32_t serial,
                    const std::optional<Bytes>& reply);
 

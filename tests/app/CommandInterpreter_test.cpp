@@ -4,8 +4,8 @@
 #include "doubles/FakePreferencesStore.h"
 #include "doubles/LoopbackTransport.h"
 #include "platform/plist/PropertyList.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "screens/print/JsonPrinter.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
@@ -62,8 +62,8 @@ protected:
     FileSystem files{root.path()};
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     FakePreferencesStore preferences;
     std::vector<std::string> answers;
     JsonPrinter output{[this](std::string_view line) { answers.emplace_back(line); }, false};

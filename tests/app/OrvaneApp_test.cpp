@@ -8,8 +8,8 @@
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
 #include "platform/plist/PropertyList.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "support/Recording.h"
 #include "support/SaveScreen.h"
 #include "support/TemporaryDirectory.h"
@@ -87,8 +87,8 @@ protected:
     FileSystem files{root.path()};
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
     FakePreferencesStore preferences;
     FakeScreen screen;

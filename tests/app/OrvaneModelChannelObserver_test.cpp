@@ -4,8 +4,8 @@
 #include "doubles/ScriptedTelephonyServer.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>
@@ -51,8 +51,8 @@ protected:
     TestServices services;
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
     Observer observer;
     std::shared_ptr<OrvaneModel> model = std::make_shared<OrvaneModel>(

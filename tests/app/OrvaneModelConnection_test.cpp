@@ -5,8 +5,8 @@
 #include "doubles/ScriptedTelephonyServer.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "support/Recording.h"
 
 #include <gmock/gmock.h>
@@ -128,8 +128,8 @@ protected:
     TestServices services;
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
     CountingObserver observer;
     int uuids = 0;

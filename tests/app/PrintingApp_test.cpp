@@ -4,8 +4,8 @@
 #include "doubles/FakePreferencesStore.h"
 #include "doubles/LoopbackTransport.h"
 #include "doubles/ScriptedTelephonyServer.h"
-#include "platform/ports/FramePorts.h"
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/MessagePorts.h"
+#include "platform/ports/TelephonyServer.h"
 #include "support/Recording.h"
 #include "support/TemporaryDirectory.h"
 
@@ -71,8 +71,8 @@ protected:
     FileSystem files{root.path()};
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
     FakePreferencesStore preferences;
     std::vector<std::string> lines;

@@ -1,4 +1,4 @@
-#include "platform/ports/FrameLocalPort.h"
+#include "platform/ports/LocalMessagePort.h"
 
 #include "platform/base/Bytes.h"
 #include "platform/ports/FrameRequester.h"
@@ -11,9 +11,9 @@
 namespace orvane
 {
 
-// The connections of the port and the messages that wait for the queue. While it delivers it is
-// kept alive, since a receive callback may destroy the port.
-class FrameLocalPort::Inbox : public std::enable_shared_from_this<FrameLocalPort::Inbox>
+// The connections of the port and the messages that wait for the queue. A delivery keeps it alive,
+// since a receive callback may destroy the port.
+class LocalMessagePort::Inbox : public std::enable_shared_from_this<LocalMessagePort::Inbox>
 {
 public:
     Inbox(LocalMessagePort& port, ReceiveCallback callback)
@@ -55,7 +55,7 @@ private:
         [[nodiscard]] std::size_t cost() const { return sizeof(Message) + data.size(); }
     };
 
-    // By value: the connection's callbacks go with it, and what they captured.
+    // By value: the connection's callbacks end with it, and so does what they captured.
     void remove(std::uint64_t connection) { _connections.erase(connection); }
 
     void hold(std::uint64_t connection, const FrameReader::View& frame)
@@ -85,8 +85,8 @@ private:
         });
     }
 
-    // What comes during the deliveries waits for the next task, so that a busy sender leaves the
-    // queue's other tasks their turn.
+    // What comes during the deliveries waits for the next task: a busy sender must not keep the
+    // queue's other tasks waiting.
     void deliverWaiting()
     {
         _scheduled = false;
@@ -123,39 +123,30 @@ private:
     bool _scheduled = false;
 };
 
-FrameLocalPort::FrameLocalPort(const std::string& name, std::unique_ptr<FrameListener> listener,
-                               ReceiveCallback callback, MainQueue& mainQueue)
-    : _notice(mainQueue, *this), _lifetime(std::make_shared<Lifetime>()),
-      _listener(std::move(listener)), _inbox(std::make_shared<Inbox>(*this, std::move(callback)))
+LocalMessagePort::LocalMessagePort(std::unique_ptr<FrameListener> listener,
+                                   ReceiveCallback callback, MainQueue& mainQueue)
+    : MessagePort(mainQueue), _listener(std::move(listener)),
+      _inbox(std::make_shared<Inbox>(*this, std::move(callback)))
 {
-    _lifetime->portName = name;
     _listener->setConnectionCallback(
         [inbox = _inbox.get()](auto connection) { inbox->accept(std::move(connection)); });
 }
 
-FrameLocalPort::~FrameLocalPort() { end(); }
+LocalMessagePort::~LocalMessagePort() { end(); }
 
-bool FrameLocalPort::isValid() const { return _lifetime->valid; }
-
-void FrameLocalPort::invalidate()
+void LocalMessagePort::invalidate()
 {
     end();
-    _notice.portIsInvalid();
+    hasBecomeInvalid();
 }
 
-void FrameLocalPort::end()
+void LocalMessagePort::end()
 {
     _listener.reset();
     _inbox->close();
-    _lifetime->valid = false;
-    _lifetime->kept.clear();
+    _kept.reset();
 }
 
-void FrameLocalPort::setInvalidationCallback(std::function<void(MessagePort&)> callback)
-{
-    _notice.setCallback(std::move(callback));
-}
-
-void FrameLocalPort::setDispatchQueue(MainQueue& queue) { _inbox->setQueue(queue); }
+void LocalMessagePort::setDispatchQueue(MainQueue& queue) { _inbox->setQueue(queue); }
 
 } // namespace orvane

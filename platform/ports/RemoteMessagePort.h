@@ -2,26 +2,25 @@
 
 #include "platform/base/Bytes.h"
 #include "platform/ports/FrameRequester.h"
-#include "platform/ports/InvalidationNotice.h"
 #include "platform/ports/MessagePort.h"
 
 namespace orvane
 {
 
-// A remote port on a frame connection.
-class FrameRemotePort final : public RemoteMessagePort
+// A connection to somebody's local port. Valid until the peer closes or the transport fails.
+class RemoteMessagePort final : public MessagePort
 {
 public:
-    FrameRemotePort(std::unique_ptr<FrameConnection> connection, MainQueue& mainQueue);
+    // Made by MessagePorts.
+    RemoteMessagePort(std::unique_ptr<FrameConnection> connection, MainQueue& mainQueue);
 
     [[nodiscard]] bool isValid() const override { return _requester.isOpen(); }
     void invalidate() override;
-    void setInvalidationCallback(std::function<void(MessagePort&)> callback) override;
+    // As FrameRequester::send().
     SendStatus send(std::int32_t messageId, ByteView data, std::chrono::milliseconds sendTimeout,
-                    std::chrono::milliseconds receiveTimeout, Bytes* reply) override;
+                    std::chrono::milliseconds receiveTimeout, Bytes* reply);
 
 private:
-    InvalidationNotice _notice;
     FrameRequester _requester;
 };
 

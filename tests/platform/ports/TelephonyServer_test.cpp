@@ -1,4 +1,4 @@
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/TelephonyServer.h"
 
 #include "doubles/LoopbackTransport.h"
 #include "doubles/ScriptedTelephonyServer.h"
@@ -24,7 +24,7 @@ struct Notification {
     friend bool operator==(const Notification&, const Notification&) = default;
 };
 
-class FrameTelephonyServerTest : public testing::Test
+class TelephonyServerTest : public testing::Test
 {
 protected:
     std::unique_ptr<TelephonyServerConnection> connect()
@@ -80,8 +80,8 @@ protected:
     TestServices services;
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FrameTelephonyServer client{transport, ports, queue};
+    MessagePorts ports{transport, queue};
+    TelephonyServer client{transport, ports, queue};
     ScriptedTelephonyServer server{transport};
     std::vector<Notification> notifications;
     std::vector<std::int32_t> messageIds;
@@ -89,7 +89,7 @@ protected:
 
 // Asking for a channel.
 
-TEST_F(FrameTelephonyServerTest, ThereIsNoConnectionWithoutAServer)
+TEST_F(TelephonyServerTest, ThereIsNoConnectionWithoutAServer)
 {
     server.die();
     EXPECT_EQ(connect(), nullptr);
@@ -97,7 +97,7 @@ TEST_F(FrameTelephonyServerTest, ThereIsNoConnectionWithoutAServer)
     EXPECT_NE(connect(), nullptr);
 }
 
-TEST_F(FrameTelephonyServerTest, AChannelIsAskedForByTheLocalPortsName)
+TEST_F(TelephonyServerTest, AChannelIsAskedForByTheLocalPortsName)
 {
     const LogChannelResult result = connect()->createNetworkMonitorLogChannel("client");
     EXPECT_EQ(result.error, 0);
@@ -107,7 +107,7 @@ TEST_F(FrameTelephonyServerTest, AChannelIsAskedForByTheLocalPortsName)
     EXPECT_EQ(queue.now(), 0s);
 }
 
-TEST_F(FrameTelephonyServerTest, TheRequestIsMessage1WithAnXmlPropertyListThatWantsAReply)
+TEST_F(TelephonyServerTest, TheRequestIsMessage1WithAnXmlPropertyListThatWantsAReply)
 {
     server.die();
     std::string error;
@@ -134,7 +134,7 @@ TEST_F(FrameTelephonyServerTest, TheRequestIsMessage1WithAnXmlPropertyListThatWa
     }));
 }
 
-TEST_F(FrameTelephonyServerTest, TheServersErrorIsPassedOn)
+TEST_F(TelephonyServerTest, TheServersErrorIsPassedOn)
 {
     for (const std::int32_t error : {1, -7, INT32_MAX, INT32_MIN}) {
         server.channelError = error;
@@ -144,7 +144,7 @@ TEST_F(FrameTelephonyServerTest, TheServersErrorIsPassedOn)
     }
 }
 
-TEST_F(FrameTelephonyServerTest, AnEmptyPortAndNoneAreToldApart)
+TEST_F(TelephonyServerTest, AnEmptyPortAndNoneAreToldApart)
 {
     server.channelAnswer = ScriptedTelephonyServer::ChannelAnswer::EmptyPort;
     LogChannelResult result = connect()->createNetworkMonitorLogChannel("client");
@@ -156,7 +156,7 @@ TEST_F(FrameTelephonyServerTest, AnEmptyPortAndNoneAreToldApart)
     EXPECT_FALSE(result.port);
 }
 
-TEST_F(FrameTelephonyServerTest, NoAnswerWithinASecondIsMinus2)
+TEST_F(TelephonyServerTest, NoAnswerWithinASecondIsMinus2)
 {
     server.channelAnswer = ScriptedTelephonyServer::ChannelAnswer::None;
     const LogChannelResult result = connect()->createNetworkMonitorLogChannel("client");
@@ -165,7 +165,7 @@ TEST_F(FrameTelephonyServerTest, NoAnswerWithinASecondIsMinus2)
     EXPECT_EQ(queue.now(), 1s);
 }
 
-TEST_F(FrameTelephonyServerTest, AnAnswerJustInTimeCountsAndALaterOneDoesNot)
+TEST_F(TelephonyServerTest, AnAnswerJustInTimeCountsAndALaterOneDoesNot)
 {
     server.answerDelay = 1000ms;
     EXPECT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -173,7 +173,7 @@ TEST_F(FrameTelephonyServerTest, AnAnswerJustInTimeCountsAndALaterOneDoesNot)
     EXPECT_EQ(connect()->createNetworkMonitorLogChannel("client").error, -2);
 }
 
-TEST_F(FrameTelephonyServerTest, ALateAnswerIsNotTakenForTheNextRequests)
+TEST_F(TelephonyServerTest, ALateAnswerIsNotTakenForTheNextRequests)
 {
     server.answerDelay = 1500ms;
     server.channelError = 3;
@@ -184,14 +184,14 @@ TEST_F(FrameTelephonyServerTest, ALateAnswerIsNotTakenForTheNextRequests)
     EXPECT_EQ(connection->createNetworkMonitorLogChannel("client").error, 4);
 }
 
-TEST_F(FrameTelephonyServerTest, ARequestThatIsNotTakenWithinASecondIsMinus1)
+TEST_F(TelephonyServerTest, ARequestThatIsNotTakenWithinASecondIsMinus1)
 {
     transport.stopReading(kTelephonyServerPort);
     EXPECT_EQ(connect()->createNetworkMonitorLogChannel("client").error, -1);
     EXPECT_EQ(queue.now(), 1s);
 }
 
-TEST_F(FrameTelephonyServerTest, AServerThatDiesDuringTheRequestIsMinus5)
+TEST_F(TelephonyServerTest, AServerThatDiesDuringTheRequestIsMinus5)
 {
     server.channelAnswer = ScriptedTelephonyServer::ChannelAnswer::None;
     transport.peerQueue().after(500ms, [this] { server.die(); });
@@ -201,7 +201,7 @@ TEST_F(FrameTelephonyServerTest, AServerThatDiesDuringTheRequestIsMinus5)
     EXPECT_EQ(connection->createNetworkMonitorLogChannel("client").error, -3);
 }
 
-TEST_F(FrameTelephonyServerTest, AnAnswerThatCannotBeUsedIsMinus4)
+TEST_F(TelephonyServerTest, AnAnswerThatCannotBeUsedIsMinus4)
 {
     std::vector<PropertyValue> unusable;
     unusable.push_back("text");
@@ -223,7 +223,7 @@ TEST_F(FrameTelephonyServerTest, AnAnswerThatCannotBeUsedIsMinus4)
     EXPECT_EQ(resultOf(answerOf(PropertyValue::integer(0), "port")).error, 0);
 }
 
-TEST_F(FrameTelephonyServerTest, ANameThatIsNoTextIsMinus4WithoutARequest)
+TEST_F(TelephonyServerTest, ANameThatIsNoTextIsMinus4WithoutARequest)
 {
     EXPECT_EQ(connect()->createNetworkMonitorLogChannel("\xFF").error, -4);
     queue.runPending();
@@ -232,7 +232,7 @@ TEST_F(FrameTelephonyServerTest, ANameThatIsNoTextIsMinus4WithoutARequest)
 
 // Notifications.
 
-TEST_F(FrameTelephonyServerTest, NotificationsComeAfterTheConnectionObjectIsReleased)
+TEST_F(TelephonyServerTest, NotificationsComeAfterTheConnectionObjectIsReleased)
 {
     const auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -247,7 +247,7 @@ TEST_F(FrameTelephonyServerTest, NotificationsComeAfterTheConnectionObjectIsRele
                             Notification{"Other", PropertyValue::arrayOf({"info"})}));
 }
 
-TEST_F(FrameTelephonyServerTest, ANotificationDuringTheRequestWaitsForTheMainQueue)
+TEST_F(TelephonyServerTest, ANotificationDuringTheRequestWaitsForTheMainQueue)
 {
     const auto port = localPort("client");
     server.answerDelay = 200ms;
@@ -258,7 +258,7 @@ TEST_F(FrameTelephonyServerTest, ANotificationDuringTheRequestWaitsForTheMainQue
     EXPECT_THAT(notifications, ElementsAre(Notification{"Early", {}}));
 }
 
-TEST_F(FrameTelephonyServerTest, NoNotificationComesOnceThePortIsDestroyed)
+TEST_F(TelephonyServerTest, NoNotificationComesOnceThePortIsDestroyed)
 {
     auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -269,7 +269,7 @@ TEST_F(FrameTelephonyServerTest, NoNotificationComesOnceThePortIsDestroyed)
     EXPECT_EQ(server.clientCount(), 0U);
 }
 
-TEST_F(FrameTelephonyServerTest, NoNotificationComesOnceThePortIsInvalidated)
+TEST_F(TelephonyServerTest, NoNotificationComesOnceThePortIsInvalidated)
 {
     const auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -280,7 +280,7 @@ TEST_F(FrameTelephonyServerTest, NoNotificationComesOnceThePortIsInvalidated)
     EXPECT_EQ(server.clientCount(), 0U);
 }
 
-TEST_F(FrameTelephonyServerTest, ANotificationThatIsQueuedAlreadyDoesNotOutliveThePort)
+TEST_F(TelephonyServerTest, ANotificationThatIsQueuedAlreadyDoesNotOutliveThePort)
 {
     auto port = localPort("client");
     server.answerDelay = 200ms;
@@ -291,7 +291,7 @@ TEST_F(FrameTelephonyServerTest, ANotificationThatIsQueuedAlreadyDoesNotOutliveT
     EXPECT_THAT(notifications, IsEmpty());
 }
 
-TEST_F(FrameTelephonyServerTest, ANotificationMayTearThePortDown)
+TEST_F(TelephonyServerTest, ANotificationMayTearThePortDown)
 {
     auto port = localPort("client");
     int calls = 0;
@@ -309,7 +309,7 @@ TEST_F(FrameTelephonyServerTest, ANotificationMayTearThePortDown)
     EXPECT_EQ(calls, 1);
 }
 
-TEST_F(FrameTelephonyServerTest, WithoutAChannelReleasingTheConnectionClosesIt)
+TEST_F(TelephonyServerTest, WithoutAChannelReleasingTheConnectionClosesIt)
 {
     const auto port = localPort("client");
     server.channelError = 1;
@@ -321,14 +321,14 @@ TEST_F(FrameTelephonyServerTest, WithoutAChannelReleasingTheConnectionClosesIt)
     EXPECT_EQ(server.clientCount(), 0U);
 }
 
-TEST_F(FrameTelephonyServerTest, WithoutALocalPortReleasingTheConnectionClosesIt)
+TEST_F(TelephonyServerTest, WithoutALocalPortReleasingTheConnectionClosesIt)
 {
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
     queue.runPending();
     EXPECT_EQ(server.clientCount(), 0U);
 }
 
-TEST_F(FrameTelephonyServerTest, IllFormedNotificationsAreIgnoredWithOneLineEach)
+TEST_F(TelephonyServerTest, IllFormedNotificationsAreIgnoredWithOneLineEach)
 {
     const auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -350,7 +350,7 @@ TEST_F(FrameTelephonyServerTest, IllFormedNotificationsAreIgnoredWithOneLineEach
     EXPECT_THAT(notifications, ElementsAre(Notification{"Well formed", {}}));
 }
 
-TEST_F(FrameTelephonyServerTest, MessagesThatAreNoNotificationsAreIgnoredInSilence)
+TEST_F(TelephonyServerTest, MessagesThatAreNoNotificationsAreIgnoredInSilence)
 {
     const auto port = localPort("client");
     ASSERT_EQ(connect()->createNetworkMonitorLogChannel("client").error, 0);
@@ -361,7 +361,7 @@ TEST_F(FrameTelephonyServerTest, MessagesThatAreNoNotificationsAreIgnoredInSilen
     EXPECT_THAT(services.log.lines, IsEmpty());
 }
 
-TEST_F(FrameTelephonyServerTest, AFloodOfNotificationsDuringTheRequestIsCut)
+TEST_F(TelephonyServerTest, AFloodOfNotificationsDuringTheRequestIsCut)
 {
     const auto port = localPort("client");
     server.answerDelay = 200ms;
@@ -380,7 +380,7 @@ TEST_F(FrameTelephonyServerTest, AFloodOfNotificationsDuringTheRequestIsCut)
 
 // The scripted server itself, as app tests rely on it.
 
-TEST_F(FrameTelephonyServerTest, TheScriptedServersChannelPortAnswersTheTechnologyQuery)
+TEST_F(TelephonyServerTest, TheScriptedServersChannelPortAnswersTheTechnologyQuery)
 {
     using Answer = ScriptedTelephonyServer::TechnologyAnswer;
     const auto port = localPort("client");
@@ -422,7 +422,7 @@ TEST_F(FrameTelephonyServerTest, TheScriptedServersChannelPortAnswersTheTechnolo
     EXPECT_THAT(server.startCommands(), ElementsAre(query));
 }
 
-TEST_F(FrameTelephonyServerTest, TheScriptedServerCanFailTheCommandAfterTheQuery)
+TEST_F(TelephonyServerTest, TheScriptedServerCanFailTheCommandAfterTheQuery)
 {
     const auto channel = connect()->createNetworkMonitorLogChannel("client");
     const auto remote = ports.createRemote(*channel.port);
@@ -437,7 +437,7 @@ TEST_F(FrameTelephonyServerTest, TheScriptedServerCanFailTheCommandAfterTheQuery
     EXPECT_EQ(remote->send(0, {}, 1s, 0s, nullptr), SendStatus::NotValid);
 }
 
-TEST_F(FrameTelephonyServerTest, TheScriptedServerSendsMessagesOfAnyIdToTheClientsPort)
+TEST_F(TelephonyServerTest, TheScriptedServerSendsMessagesOfAnyIdToTheClientsPort)
 {
     EXPECT_FALSE(server.sendLogMessage(Bytes{1})) << "no channel";
     auto port = localPort("client");
@@ -451,7 +451,7 @@ TEST_F(FrameTelephonyServerTest, TheScriptedServerSendsMessagesOfAnyIdToTheClien
     EXPECT_EQ(server.channelCount(), 0U) << "a channel ends with the connection to the client";
 }
 
-TEST_F(FrameTelephonyServerTest, TheScriptedServersDeathInvalidatesWhatLeadsToIt)
+TEST_F(TelephonyServerTest, TheScriptedServersDeathInvalidatesWhatLeadsToIt)
 {
     const auto port = localPort("client");
     const auto channel = connect()->createNetworkMonitorLogChannel("client");
@@ -465,7 +465,7 @@ TEST_F(FrameTelephonyServerTest, TheScriptedServersDeathInvalidatesWhatLeadsToIt
     EXPECT_EQ(ports.createRemote(*channel.port), nullptr);
 }
 
-TEST_F(FrameTelephonyServerTest, TheScriptedServerCanNameAPortThatIsNotThere)
+TEST_F(TelephonyServerTest, TheScriptedServerCanNameAPortThatIsNotThere)
 {
     server.channelPortExists = false;
     const auto channel = connect()->createNetworkMonitorLogChannel("client");

@@ -1,7 +1,7 @@
 #include "platform/linux/EventThread.h"
 #include "platform/linux/QtMainQueue.h"
 #include "platform/linux/TransportTest.h"
-#include "platform/ports/FramePorts.h"
+#include "platform/ports/MessagePorts.h"
 
 namespace orvane
 {
@@ -29,7 +29,7 @@ struct Reverser {
             port->setDispatchQueue(queue);
     }
     SocketTransport transport;
-    FramePorts ports;
+    MessagePorts ports;
     std::unique_ptr<LocalMessagePort> port;
 };
 
@@ -37,7 +37,7 @@ class MessagePortsOverSocketsTest : public TransportTest
 {
 protected:
     QtMainQueue queue;
-    FramePorts ports{transport, queue};
+    MessagePorts ports{transport, queue};
     EventThread thread{[this](MainQueue& threadQueue) {
         return std::make_shared<Reverser>(directory.directory(), threadQueue);
     }};

@@ -1,4 +1,4 @@
-#include "platform/ports/FramePorts.h"
+#include "platform/ports/MessagePorts.h"
 
 #include "doubles/LoopbackTransport.h"
 #include "support/Recording.h"
@@ -32,7 +32,7 @@ Bytes framed(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool
 }
 
 // The program's ports on one side, another process's on the other.
-class FramePortsTest : public testing::Test
+class MessagePortsTest : public testing::Test
 {
 protected:
     // A port of the other process that keeps its messages and answers with `reply`.
@@ -99,8 +99,8 @@ protected:
     TestServices services;
     ManualMainQueue queue;
     LoopbackTransport transport{queue};
-    FramePorts ports{transport, queue};
-    FramePorts peerPorts{transport.peerSide(), transport.peerQueue()};
+    MessagePorts ports{transport, queue};
+    MessagePorts peerPorts{transport.peerSide(), transport.peerQueue()};
 
     std::vector<Message> peerMessages;
     std::vector<Message> messages;
@@ -118,7 +118,7 @@ protected:
 
 // Making ports.
 
-TEST_F(FramePortsTest, UsablePortNamesHave1To64PlainBytes)
+TEST_F(MessagePortsTest, UsablePortNamesHave1To64PlainBytes)
 {
     for (const std::string name : {"a", "OrvaneApp.0123-AZ_z", "..."})
         EXPECT_TRUE(isUsablePortName(name)) << name;
@@ -129,7 +129,7 @@ TEST_F(FramePortsTest, UsablePortNamesHave1To64PlainBytes)
     EXPECT_FALSE(isUsablePortName(std::string_view("a\0b", 3)));
 }
 
-TEST_F(FramePortsTest, ALocalPortOfAnUnusableNameIsRefusedWithALine)
+TEST_F(MessagePortsTest, ALocalPortOfAnUnusableNameIsRefusedWithALine)
 {
     EXPECT_EQ(ownPort("a/b"), nullptr);
     EXPECT_THAT(services.log.errors(),
@@ -137,7 +137,7 @@ TEST_F(FramePortsTest, ALocalPortOfAnUnusableNameIsRefusedWithALine)
                             "digits, '.', '-' and '_'"));
 }
 
-TEST_F(FramePortsTest, ALocalPortOfALivePortsNameIsRefusedWithALine)
+TEST_F(MessagePortsTest, ALocalPortOfALivePortsNameIsRefusedWithALine)
 {
     auto first = ownPort("name");
     EXPECT_EQ(ownPort("name"), nullptr);
@@ -146,7 +146,7 @@ TEST_F(FramePortsTest, ALocalPortOfALivePortsNameIsRefusedWithALine)
     EXPECT_NE(ownPort("name"), nullptr);
 }
 
-TEST_F(FramePortsTest, ThereIsNoRemotePortWhereNothingListens)
+TEST_F(MessagePortsTest, ThereIsNoRemotePortWhereNothingListens)
 {
     EXPECT_EQ(ports.createRemote("nobody"), nullptr);
     EXPECT_EQ(ports.createRemote("a/b"), nullptr);
@@ -158,7 +158,7 @@ TEST_F(FramePortsTest, ThereIsNoRemotePortWhereNothingListens)
 
 // Sending.
 
-TEST_F(FramePortsTest, AMessageWithoutAReplyArrivesAndGetsNoFrameBack)
+TEST_F(MessagePortsTest, AMessageWithoutAReplyArrivesAndGetsNoFrameBack)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -171,7 +171,7 @@ TEST_F(FramePortsTest, AMessageWithoutAReplyArrivesAndGetsNoFrameBack)
     EXPECT_EQ(queue.now(), 0s);
 }
 
-TEST_F(FramePortsTest, ARequestWaitsForItsReplyWhileOwnTasksWait)
+TEST_F(MessagePortsTest, ARequestWaitsForItsReplyWhileOwnTasksWait)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -184,7 +184,7 @@ TEST_F(FramePortsTest, ARequestWaitsForItsReplyWhileOwnTasksWait)
     EXPECT_EQ(queue.now(), 0s);
 }
 
-TEST_F(FramePortsTest, AReceiverWithoutReplyDataIsAnEmptyReply)
+TEST_F(MessagePortsTest, AReceiverWithoutReplyDataIsAnEmptyReply)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -192,7 +192,7 @@ TEST_F(FramePortsTest, AReceiverWithoutReplyDataIsAnEmptyReply)
     EXPECT_THAT(answer, IsEmpty());
 }
 
-TEST_F(FramePortsTest, EveryMessageHasASerialOfItsOwn)
+TEST_F(MessagePortsTest, EveryMessageHasASerialOfItsOwn)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -202,7 +202,7 @@ TEST_F(FramePortsTest, EveryMessageHasASerialOfItsOwn)
     EXPECT_THAT(serials, ElementsAre(1U, 2U, 3U));
 }
 
-TEST_F(FramePortsTest, RepliesArePickedOutByTheirSerial)
+TEST_F(MessagePortsTest, RepliesArePickedOutByTheirSerial)
 {
     listenByHand("peer");
     onRequest = [this](const FrameReader::View& frame) {
@@ -218,7 +218,7 @@ TEST_F(FramePortsTest, RepliesArePickedOutByTheirSerial)
     EXPECT_EQ(answer, Bytes{3});
 }
 
-TEST_F(FramePortsTest, ARequestToARemotePortIsAnsweredWithNoData)
+TEST_F(MessagePortsTest, ARequestToARemotePortIsAnsweredWithNoData)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -229,7 +229,7 @@ TEST_F(FramePortsTest, ARequestToARemotePortIsAnsweredWithNoData)
     EXPECT_THAT(serials, ElementsAre(77U));
 }
 
-TEST_F(FramePortsTest, NoReplyInTimeIsMinus2AndThePortStaysValid)
+TEST_F(MessagePortsTest, NoReplyInTimeIsMinus2AndThePortStaysValid)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -240,7 +240,7 @@ TEST_F(FramePortsTest, NoReplyInTimeIsMinus2AndThePortStaysValid)
     EXPECT_EQ(static_cast<int>(SendStatus::ReceiveTimeout), -2);
 }
 
-TEST_F(FramePortsTest, ALateReplyIsNotTakenForTheNextRequests)
+TEST_F(MessagePortsTest, ALateReplyIsNotTakenForTheNextRequests)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -253,7 +253,7 @@ TEST_F(FramePortsTest, ALateReplyIsNotTakenForTheNextRequests)
     EXPECT_EQ(answer, Bytes{2});
 }
 
-TEST_F(FramePortsTest, ALateReplyAloneIsDropped)
+TEST_F(MessagePortsTest, ALateReplyAloneIsDropped)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -264,7 +264,7 @@ TEST_F(FramePortsTest, ALateReplyAloneIsDropped)
     EXPECT_EQ(answer, Bytes{0xEE});
 }
 
-TEST_F(FramePortsTest, NothingTakenInTimeIsMinus1AndThePortStaysValid)
+TEST_F(MessagePortsTest, NothingTakenInTimeIsMinus1AndThePortStaysValid)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -283,7 +283,7 @@ TEST_F(FramePortsTest, NothingTakenInTimeIsMinus1AndThePortStaysValid)
     EXPECT_THAT(peerMessages, ElementsAre(Message{3, {3}}));
 }
 
-TEST_F(FramePortsTest, AFrameCutShortIsMinus1AndLeavesThePortInvalid)
+TEST_F(MessagePortsTest, AFrameCutShortIsMinus1AndLeavesThePortInvalid)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -304,7 +304,7 @@ TEST_F(FramePortsTest, AFrameCutShortIsMinus1AndLeavesThePortInvalid)
     EXPECT_THAT(peerMessages, IsEmpty());
 }
 
-TEST_F(FramePortsTest, AMessageIsTakenLateButInTime)
+TEST_F(MessagePortsTest, AMessageIsTakenLateButInTime)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -316,7 +316,7 @@ TEST_F(FramePortsTest, AMessageIsTakenLateButInTime)
     EXPECT_THAT(peerMessages, ElementsAre(Message{1, Bytes(100)}));
 }
 
-TEST_F(FramePortsTest, SendingOnAnInvalidPortIsMinus3)
+TEST_F(MessagePortsTest, SendingOnAnInvalidPortIsMinus3)
 {
     auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -329,7 +329,7 @@ TEST_F(FramePortsTest, SendingOnAnInvalidPortIsMinus3)
     EXPECT_EQ(static_cast<int>(SendStatus::NotValid), -3);
 }
 
-TEST_F(FramePortsTest, AConnectionThatBreaksWhileSendingIsMinus4)
+TEST_F(MessagePortsTest, AConnectionThatBreaksWhileSendingIsMinus4)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -342,7 +342,7 @@ TEST_F(FramePortsTest, AConnectionThatBreaksWhileSendingIsMinus4)
     EXPECT_EQ(static_cast<int>(SendStatus::TransportError), -4);
 }
 
-TEST_F(FramePortsTest, BecomingInvalidWhileWaitingForTheReplyIsMinus5)
+TEST_F(MessagePortsTest, BecomingInvalidWhileWaitingForTheReplyIsMinus5)
 {
     listenByHand("peer");
     onRequest = [this](const FrameReader::View&) { byHand.reset(); };
@@ -358,7 +358,7 @@ TEST_F(FramePortsTest, BecomingInvalidWhileWaitingForTheReplyIsMinus5)
     EXPECT_EQ(static_cast<int>(SendStatus::BecameInvalid), -5);
 }
 
-TEST_F(FramePortsTest, AReplyThatCameBeforeTheCloseCounts)
+TEST_F(MessagePortsTest, AReplyThatCameBeforeTheCloseCounts)
 {
     listenByHand("peer");
     onRequest = [this](const FrameReader::View& frame) {
@@ -372,7 +372,7 @@ TEST_F(FramePortsTest, AReplyThatCameBeforeTheCloseCounts)
     EXPECT_FALSE(remote->isValid());
 }
 
-TEST_F(FramePortsTest, AMessageBeyondTheLimitIsRefusedAndThePortGoesOn)
+TEST_F(MessagePortsTest, AMessageBeyondTheLimitIsRefusedAndThePortGoesOn)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -384,7 +384,7 @@ TEST_F(FramePortsTest, AMessageBeyondTheLimitIsRefusedAndThePortGoesOn)
     EXPECT_THAT(peerMessages, ElementsAre(Message{0, {1}}));
 }
 
-TEST_F(FramePortsTest, RepliesArriveWholeHoweverTheStreamIsSplit)
+TEST_F(MessagePortsTest, RepliesArriveWholeHoweverTheStreamIsSplit)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -402,7 +402,7 @@ TEST_F(FramePortsTest, RepliesArriveWholeHoweverTheStreamIsSplit)
 
 // Receiving.
 
-TEST_F(FramePortsTest, MessagesWaitForADispatchQueue)
+TEST_F(MessagePortsTest, MessagesWaitForADispatchQueue)
 {
     const auto port = ownPort("own");
     const auto sender = connectByHand("own");
@@ -419,7 +419,7 @@ TEST_F(FramePortsTest, MessagesWaitForADispatchQueue)
     EXPECT_THAT(replies, ElementsAre(Message{2, {}}));
 }
 
-TEST_F(FramePortsTest, MessagesAreDeliveredOnTheDispatchQueue)
+TEST_F(MessagePortsTest, MessagesAreDeliveredOnTheDispatchQueue)
 {
     const auto port = ownPort("own");
     ManualMainQueue elsewhere; // with a clock of its own, which the others do not turn
@@ -432,7 +432,7 @@ TEST_F(FramePortsTest, MessagesAreDeliveredOnTheDispatchQueue)
     EXPECT_THAT(messages, ElementsAre(Message{1, {1}}));
 }
 
-TEST_F(FramePortsTest, MessagesOfSeveralConnectionsKeepTheirOrderAndReplies)
+TEST_F(MessagePortsTest, MessagesOfSeveralConnectionsKeepTheirOrderAndReplies)
 {
     const auto port = ownPort("own");
     port->setDispatchQueue(queue);
@@ -449,7 +449,7 @@ TEST_F(FramePortsTest, MessagesOfSeveralConnectionsKeepTheirOrderAndReplies)
     EXPECT_THAT(serials, testing::UnorderedElementsAre(11U, 22U, 44U)) << "one reply a request";
 }
 
-TEST_F(FramePortsTest, AFrameMarkedAsAReplyIsNoMessage)
+TEST_F(MessagePortsTest, AFrameMarkedAsAReplyIsNoMessage)
 {
     const auto port = ownPort("own");
     port->setDispatchQueue(queue);
@@ -462,7 +462,7 @@ TEST_F(FramePortsTest, AFrameMarkedAsAReplyIsNoMessage)
     EXPECT_THAT(replies, IsEmpty());
 }
 
-TEST_F(FramePortsTest, AMessageOfASenderThatHasClosedStillArrives)
+TEST_F(MessagePortsTest, AMessageOfASenderThatHasClosedStillArrives)
 {
     const auto port = ownPort("own");
     auto sender = connectByHand("own");
@@ -474,7 +474,7 @@ TEST_F(FramePortsTest, AMessageOfASenderThatHasClosedStillArrives)
     EXPECT_THAT(messages, ElementsAre(Message{1, {1}}));
 }
 
-TEST_F(FramePortsTest, AnOversizedFrameEndsItsConnectionAlone)
+TEST_F(MessagePortsTest, AnOversizedFrameEndsItsConnectionAlone)
 {
     const auto port = ownPort("own");
     port->setDispatchQueue(queue);
@@ -496,7 +496,7 @@ TEST_F(FramePortsTest, AnOversizedFrameEndsItsConnectionAlone)
     EXPECT_EQ(closes, 1);
 }
 
-TEST_F(FramePortsTest, MoreThanItHoldsWithoutAQueueEndsTheConnectionThatBringsIt)
+TEST_F(MessagePortsTest, MoreThanItHoldsWithoutAQueueEndsTheConnectionThatBringsIt)
 {
     const auto port = ownPort("own");
     const auto sender = connectByHand("own");
@@ -519,7 +519,7 @@ TEST_F(FramePortsTest, MoreThanItHoldsWithoutAQueueEndsTheConnectionThatBringsIt
     EXPECT_EQ(messages.size(), 4U);
 }
 
-TEST_F(FramePortsTest, APeerThatReadsNoRepliesLosesItsConnection)
+TEST_F(MessagePortsTest, APeerThatReadsNoRepliesLosesItsConnection)
 {
     const auto port = ownPort("own");
     port->setDispatchQueue(queue);
@@ -542,7 +542,7 @@ TEST_F(FramePortsTest, APeerThatReadsNoRepliesLosesItsConnection)
     EXPECT_THAT(replies, IsEmpty());
 }
 
-TEST_F(FramePortsTest, AReplyBeyondTheLimitIsAnEmptyOneWithALine)
+TEST_F(MessagePortsTest, AReplyBeyondTheLimitIsAnEmptyOneWithALine)
 {
     const auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -552,7 +552,7 @@ TEST_F(FramePortsTest, AReplyBeyondTheLimitIsAnEmptyOneWithALine)
     EXPECT_THAT(services.log.errors(), ElementsAre(HasSubstr("Reply of 16777217 bytes")));
 }
 
-TEST_F(FramePortsTest, AMessageCallbackMayDestroyItsPort)
+TEST_F(MessagePortsTest, AMessageCallbackMayDestroyItsPort)
 {
     std::unique_ptr<LocalMessagePort> port;
     std::vector<std::int32_t> seen;
@@ -571,7 +571,7 @@ TEST_F(FramePortsTest, AMessageCallbackMayDestroyItsPort)
     EXPECT_THAT(replies, IsEmpty());
 }
 
-TEST_F(FramePortsTest, AMessageCallbackMayInvalidateItsPort)
+TEST_F(MessagePortsTest, AMessageCallbackMayInvalidateItsPort)
 {
     std::vector<std::int32_t> seen;
     const auto port =
@@ -591,7 +591,7 @@ TEST_F(FramePortsTest, AMessageCallbackMayInvalidateItsPort)
     EXPECT_EQ(invalidations, 1);
 }
 
-TEST_F(FramePortsTest, AMessageCallbackThatThrowsLosesNoOtherMessage)
+TEST_F(MessagePortsTest, AMessageCallbackThatThrowsLosesNoOtherMessage)
 {
     std::vector<std::int32_t> seen;
     const auto port = ports.createLocal("own", [&](LocalMessagePort&, std::int32_t id, ByteView) {
@@ -609,7 +609,7 @@ TEST_F(FramePortsTest, AMessageCallbackThatThrowsLosesNoOtherMessage)
     EXPECT_THAT(seen, ElementsAre(1, 2));
 }
 
-TEST_F(FramePortsTest, AMessageCallbackMayAskAPortOfItsOwn)
+TEST_F(MessagePortsTest, AMessageCallbackMayAskAPortOfItsOwn)
 {
     const auto peer = peerPort("peer");
     reply = Bytes{4};
@@ -627,7 +627,7 @@ TEST_F(FramePortsTest, AMessageCallbackMayAskAPortOfItsOwn)
 
 // Invalidation.
 
-TEST_F(FramePortsTest, InvalidatingQueuesTheCallbackOnce)
+TEST_F(MessagePortsTest, InvalidatingQueuesTheCallbackOnce)
 {
     const auto port = ownPort("own");
     int calls = 0;
@@ -647,7 +647,7 @@ TEST_F(FramePortsTest, InvalidatingQueuesTheCallbackOnce)
     EXPECT_EQ(calls, 1);
 }
 
-TEST_F(FramePortsTest, InvalidatingALocalPortRemovesItsNameAndClosesItsConnections)
+TEST_F(MessagePortsTest, InvalidatingALocalPortRemovesItsNameAndClosesItsConnections)
 {
     const auto port = ownPort("own");
     const auto sender = connectByHand("own");
@@ -659,7 +659,7 @@ TEST_F(FramePortsTest, InvalidatingALocalPortRemovesItsNameAndClosesItsConnectio
     EXPECT_NE(ownPort("own"), nullptr);
 }
 
-TEST_F(FramePortsTest, AQueuedCallOfAClearedCallbackDoesNotCome)
+TEST_F(MessagePortsTest, AQueuedCallOfAClearedCallbackDoesNotCome)
 {
     const auto peer = peerPort("peer");
     const auto local = ownPort("own");
@@ -675,7 +675,7 @@ TEST_F(FramePortsTest, AQueuedCallOfAClearedCallbackDoesNotCome)
     EXPECT_EQ(calls, 0);
 }
 
-TEST_F(FramePortsTest, AQueuedCallOfADestroyedPortDoesNotCome)
+TEST_F(MessagePortsTest, AQueuedCallOfADestroyedPortDoesNotCome)
 {
     const auto peer = peerPort("peer");
     auto local = ownPort("own");
@@ -692,7 +692,7 @@ TEST_F(FramePortsTest, AQueuedCallOfADestroyedPortDoesNotCome)
     EXPECT_EQ(calls, 0);
 }
 
-TEST_F(FramePortsTest, DestroyingAPortIsNoInvalidation)
+TEST_F(MessagePortsTest, DestroyingAPortIsNoInvalidation)
 {
     auto local = ownPort("own");
     int calls = 0;
@@ -702,7 +702,7 @@ TEST_F(FramePortsTest, DestroyingAPortIsNoInvalidation)
     EXPECT_EQ(calls, 0);
 }
 
-TEST_F(FramePortsTest, AnInvalidationCallbackMayDestroyItsPort)
+TEST_F(MessagePortsTest, AnInvalidationCallbackMayDestroyItsPort)
 {
     const auto peer = peerPort("peer");
     auto remote = ports.createRemote("peer");
@@ -717,7 +717,7 @@ TEST_F(FramePortsTest, AnInvalidationCallbackMayDestroyItsPort)
     EXPECT_EQ(calls, 1);
 }
 
-TEST_F(FramePortsTest, ACallbackSetOnAnInvalidPortIsCalled)
+TEST_F(MessagePortsTest, ACallbackSetOnAnInvalidPortIsCalled)
 {
     const auto port = ownPort("own");
     port->invalidate();
@@ -729,7 +729,7 @@ TEST_F(FramePortsTest, ACallbackSetOnAnInvalidPortIsCalled)
     EXPECT_EQ(calls, 1);
 }
 
-TEST_F(FramePortsTest, ARemotePortIsValidUntilItsPeerCloses)
+TEST_F(MessagePortsTest, ARemotePortIsValidUntilItsPeerCloses)
 {
     auto peer = peerPort("peer");
     const auto remote = ports.createRemote("peer");
@@ -743,7 +743,7 @@ TEST_F(FramePortsTest, ARemotePortIsValidUntilItsPeerCloses)
     EXPECT_EQ(calls, 1);
 }
 
-TEST_F(FramePortsTest, ARemotePortsOwnInvalidationClosesTheConnection)
+TEST_F(MessagePortsTest, ARemotePortsOwnInvalidationClosesTheConnection)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -755,7 +755,7 @@ TEST_F(FramePortsTest, ARemotePortsOwnInvalidationClosesTheConnection)
     EXPECT_EQ(send(*remote, 0, {}), SendStatus::NotValid);
 }
 
-TEST_F(FramePortsTest, GarbageFromThePeerInvalidatesARemotePort)
+TEST_F(MessagePortsTest, GarbageFromThePeerInvalidatesARemotePort)
 {
     listenByHand("peer");
     const auto remote = ports.createRemote("peer");
@@ -768,7 +768,7 @@ TEST_F(FramePortsTest, GarbageFromThePeerInvalidatesARemotePort)
 
 // Keeping objects for a port.
 
-TEST_F(FramePortsTest, AnObjectIsKeptUntilThePortIsInvalidatedOrDestroyed)
+TEST_F(MessagePortsTest, AnObjectIsKeptUntilThePortIsInvalidatedOrDestroyed)
 {
     const auto object = std::make_shared<int>(0);
     const auto invalidated = ownPort("one");
@@ -782,7 +782,7 @@ TEST_F(FramePortsTest, AnObjectIsKeptUntilThePortIsInvalidatedOrDestroyed)
     EXPECT_EQ(object.use_count(), 1);
 }
 
-TEST_F(FramePortsTest, NothingIsKeptWithoutAValidPortOfTheName)
+TEST_F(MessagePortsTest, NothingIsKeptWithoutAValidPortOfTheName)
 {
     const auto object = std::make_shared<int>(0);
     EXPECT_FALSE(ports.keepWhileValid("none", object));

@@ -1,4 +1,4 @@
-#include "platform/ports/FrameTelephonyServer.h"
+#include "platform/ports/TelephonyServer.h"
 
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
@@ -37,13 +37,15 @@ LogChannelResult parseAnswer(ByteView data)
     return result;
 }
 
+} // namespace
+
 // The connection with its notification callback, shared by the client's object and by the local
 // port that it was opened for.
-class Link : public std::enable_shared_from_this<Link>
+class TelephonyServerConnection::Link : public std::enable_shared_from_this<Link>
 {
 public:
     Link(std::unique_ptr<FrameConnection> connection, MainQueue& queue,
-         TelephonyServer::NotificationCallback callback)
+         NotificationCallback callback)
         : _requester(std::move(connection)), _queue(queue), _callback(std::move(callback))
     {
         _requester.setMessageCallback([this](const FrameReader::View& frame) { take(frame); });
@@ -65,8 +67,8 @@ public:
     }
 
 private:
-    // Notifications that may wait for the main queue, so that a server gone wild takes no endless
-    // memory while the program is busy.
+    // How many notifications may wait for the main queue: bounds the memory that a server can take
+    // while the program is busy.
     static constexpr std::size_t kWaitingLimit = 1000;
 
     void take(const FrameReader::View& frame)
@@ -99,48 +101,36 @@ private:
 
     FrameRequester _requester;
     MainQueue& _queue;
-    const TelephonyServer::NotificationCallback _callback;
+    const NotificationCallback _callback;
     std::size_t _waiting = 0;
 };
 
-class FrameTelephonyServerConnection final : public TelephonyServerConnection
-{
-public:
-    FrameTelephonyServerConnection(std::shared_ptr<Link> link, FramePorts& ports)
-        : _link(std::move(link)), _ports(ports)
-    {
-    }
-
-    LogChannelResult createNetworkMonitorLogChannel(const std::string& localPortName) override
-    {
-        LogChannelResult result = _link->requestChannel(localPortName);
-        if (result.error == 0)
-            _ports.keepWhileValid(localPortName, _link);
-        return result;
-    }
-
-private:
-    std::shared_ptr<Link> _link;
-    FramePorts& _ports;
-};
-
-} // namespace
-
-FrameTelephonyServer::FrameTelephonyServer(FrameTransport& transport, FramePorts& ports,
-                                           MainQueue& mainQueue)
-    : _transport(transport), _ports(ports), _mainQueue(mainQueue)
+TelephonyServerConnection::TelephonyServerConnection(std::unique_ptr<FrameConnection> connection,
+                                                     MessagePorts& ports, MainQueue& mainQueue,
+                                                     NotificationCallback callback)
+    : _link(std::make_shared<Link>(std::move(connection), mainQueue, std::move(callback))),
+      _ports(ports)
 {
 }
 
+LogChannelResult
+TelephonyServerConnection::createNetworkMonitorLogChannel(const std::string& localPortName)
+{
+    LogChannelResult result = _link->requestChannel(localPortName);
+    if (result.error == 0)
+        _ports.keepWhileValid(localPortName, _link);
+    return result;
+}
+
 std::unique_ptr<TelephonyServerConnection>
-FrameTelephonyServer::createConnection(NotificationCallback callback)
+TelephonyServer::createConnection(TelephonyServerConnection::NotificationCallback callback)
 {
     std::string error;
     auto connection = _transport.connect(kTelephonyServerPort, error);
     if (!connection)
         return nullptr;
-    return std::make_unique<FrameTelephonyServerConnection>(
-        std::make_shared<Link>(std::move(connection), _mainQueue, std::move(callback)), _ports);
+    return std::make_unique<TelephonyServerConnection>(std::move(connection), _ports, _mainQueue,
+                                                       std::move(callback));
 }
 
 } // namespace orvane
