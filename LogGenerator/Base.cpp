@@ -48,7 +48,7 @@ constexpr EnergyBand kEnergyBands[] = {
     {1120,   -28},
     {949,    -29},
     {813,    -30},
- // Both of the last bands give -31, and there is no -32. This is meant.
+ // Deliberate: both of the last bands give -31, and there is no -32.
     {756,    -31},
     {705,    -31},
 };
@@ -118,6 +118,14 @@ void Base::replaceArray(PropertyArray* array, std::vector<PropertyValue> with)
     array->replaceElements(std::move(with));
 }
 
+std::vector<PropertyValue> Base::takeElements(PropertyArray* array)
+{
+    if (!array)
+        return {};
+    const ArrayLock::Guard guard;
+    return array->replaceElements({});
+}
+
 std::int16_t Base::lookUpECNO(std::uint32_t ratio)
 {
     if (ratio >= kZeroDecibels)
@@ -125,7 +133,7 @@ std::int16_t Base::lookUpECNO(std::uint32_t ratio)
     for (const EnergyBand& band : kEnergyBands)
         if (ratio > band.threshold)
             return band.decibels;
-    // The very weakest give 0, as the strongest do. This is meant.
+    // Deliberate: the very weakest give 0, as the strongest do.
     return 0;
 }
 

@@ -52,9 +52,11 @@ public:
     [[nodiscard]] PropertyValue checkpoint() const;
     void restore(const PropertyValue& checkpoint);
 
-    // Both change the array under ArrayLock, so that no reader sees it half filled.
+    // These change the array under ArrayLock, so that no reader sees it half filled. The last one
+    // leaves it empty and returns what it held.
     static void clearElementsInArray(PropertyArray* array);
     static void replaceArray(PropertyArray* array, std::vector<PropertyValue> with);
+    static std::vector<PropertyValue> takeElements(PropertyArray* array);
 
     // A linear energy ratio, 2^19 being 0 dB, in whole decibels.
     static std::int16_t lookUpECNO(std::uint32_t ratio);

@@ -65,8 +65,7 @@ void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
 {
     for (const CellRow& cellRow : cellRows) {
         if (const auto number = cellNumber(cell, cellRow.key)) {
-            if (auto text = cellRow.format(*number))
-                setRow(rows, cellRow.row, std::move(*text));
+            setReading(rows, cellRow, *number);
         } else if (cellRow.failure) {
             logError("%s", cellRow.failure);
         }
@@ -83,19 +82,18 @@ void writeFirstCell(PropertyDictionary* rows, PacketView record, const CellLayou
         writeCellRows(rows, *cell, layout.rows);
 }
 
-std::vector<PropertyValue> cellDictionaries(PacketView record, const CellLayout& layout)
+void addCells(ListElements& elements, PacketView record, const CellLayout& layout)
 {
-    std::vector<PropertyValue> dictionaries;
     const std::shared_ptr<PropertyArray> cells = cellArrayOrReport(record);
     if (!cells)
-        return dictionaries;
+        return;
     for (const PropertyValue& cell : *cells) {
         if (!layout.isWanted(cell))
             continue;
-        dictionaries.push_back(PropertyValue::newDictionary());
-        writeCellRows(dictionaries.back().asDictionary(), cell, layout.rows);
+        PropertyValue element = PropertyValue::newDictionary();
+        writeCellRows(element.asDictionary(), cell, layout.rows);
+        elements.add(std::move(element));
     }
-    return dictionaries;
 }
 
 } // namespace orvane

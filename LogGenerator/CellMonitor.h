@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Formats.h"
+#include "LogGenerator/Records.h"
 #include "platform/base/LogMessage.h"
 #include "platform/base/PropertyValue.h"
 
@@ -27,18 +28,19 @@ bool isCell(const PropertyValue& cell, const char* technology, const char* type)
 std::optional<std::int32_t> cellNumber(const PropertyValue& cell, const char* key);
 
 // One row that a cell's number fills.
-struct CellRow {
+struct CellRow : RowDescription {
     const char* key;
-    const char* row;
     const char* failure; // logged at error priority when there is no such number; may be null
-    Format format = decimal;
 };
 
-// For tables of rows, some with a format of their own.
+// The format is static data.
 constexpr CellRow cellRow(const char* key, const char* row, const char* failure,
-                          Format format = decimal)
+                          const Format& format = decimal)
 {
-    return {key, row, failure, format};
+    return {
+        {row, &format},
+        key, failure
+    };
 }
 
 // What a section takes from the cells: which of them, and their rows.
@@ -53,8 +55,8 @@ void writeCellRows(PropertyDictionary* rows, const PropertyValue& cell,
 // Writes the rows of the first wanted cell of the record. A record without an array of cells is
 // reported.
 void writeFirstCell(PropertyDictionary* rows, PacketView record, const CellLayout& layout);
-// One dictionary for each wanted cell of the record, which may be empty. A record without an array
-// of cells is reported.
-std::vector<PropertyValue> cellDictionaries(PacketView record, const CellLayout& layout);
+// Adds a dictionary, which may be empty, for each wanted cell of the record. A record without an
+// array of cells is reported.
+void addCells(ListElements& elements, PacketView record, const CellLayout& layout);
 
 } // namespace orvane

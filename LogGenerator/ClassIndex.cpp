@@ -32,9 +32,17 @@ Base* ClassIndex::getClass(std::string_view name) const
 
 const std::vector<Base*>* ClassIndex::getSubscribers(std::uint32_t logCode) const
 {
-    char key[16];
-    const auto end = std::to_chars(key, key + sizeof key, logCode).ptr;
-    return codeDictionary.find(std::string_view(key, static_cast<std::size_t>(end - key)));
+    if (_codesIndexed != codeDictionary.size()) {
+        _subscribers.clear();
+        for (const auto& [text, sections] : codeDictionary) {
+            std::uint32_t code = 0;
+            std::from_chars(text.data(), text.data() + text.size(), code);
+            _subscribers.emplace(code, &sections);
+        }
+        _codesIndexed = codeDictionary.size();
+    }
+    const auto found = _subscribers.find(logCode);
+    return found == _subscribers.end() ? nullptr : found->second;
 }
 
 std::vector<std::string> ClassIndex::getAllLogCodes() const

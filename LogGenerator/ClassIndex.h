@@ -4,6 +4,7 @@
 
 #include <memory>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 namespace orvane
@@ -72,6 +73,9 @@ protected:
 
 private:
     std::vector<Field*> _fields;
+    // The entries of codeDictionary by number, found as long as it has as many.
+    mutable std::unordered_map<std::uint32_t, const std::vector<Base*>*> _subscribers;
+    mutable std::size_t _codesIndexed = 0;
 };
 
 } // namespace orvane

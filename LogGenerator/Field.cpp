@@ -1,5 +1,6 @@
 #include "LogGenerator/Field.h"
 
+#include "LogGenerator/MessageTime.h"
 #include "platform/base/PropertyValue.h"
 
 #include <utility>
@@ -20,14 +21,11 @@ std::int64_t bigEndian(std::uint64_t value, unsigned bits)
 
 } // namespace
 
-std::optional<std::int64_t> Field::valueIn(PacketView packet) const
+std::int64_t Field::decoded(std::uint32_t raw) const
 {
-    const auto raw = packet.bitsAt(offset, bit, bits);
-    if (!raw)
-        return std::nullopt;
-    const auto value = static_cast<std::int64_t>(*raw);
     if (coding == Coding::BigEndian)
-        return bigEndian(*raw, bits);
+        return bigEndian(raw, bits);
+    const auto value = static_cast<std::int64_t>(raw);
     const bool isNegative = coding == Coding::Signed && (value >> (bits - 1) & 1) != 0;
     return isNegative ? value - (std::int64_t{1} << bits) : value;
 }
@@ -37,10 +35,21 @@ void writeRows(PropertyDictionary* rows, PacketView packet, std::span<const Fiel
     if (!rows)
         return;
     rows->reserve(fields.size());
+    const std::int64_t time = MessageTime::current();
     for (const Field& field : fields)
-        if (const auto raw = field.valueIn(packet))
-            if (RowText text = field.format(*raw))
-                rows->setText(field.row, std::move(*text));
+        if (const auto raw = field.rowIn(packet))
+            rows->setReading({&field, *raw, time});
+}
+
+Reading readingOf(const RowDescription& description, std::int64_t raw)
+{
+    return {&description, raw, MessageTime::current()};
+}
+
+void setReading(PropertyDictionary* rows, const RowDescription& description, std::int64_t raw)
+{
+    if (rows)
+        rows->setReading(readingOf(description, raw));
 }
 
 void setRow(PropertyDictionary* rows, const char* row, std::string text)

@@ -2,24 +2,11 @@
 
 #include "platform/base/FormatText.h"
 
-#include <charconv>
 #include <cstdarg>
 #include <utility>
 
 namespace orvane
 {
-
-namespace
-{
-
-RowText textOf(const char* begin, const char* end, std::string_view unit)
-{
-    RowText text(std::in_place, begin, end);
-    text->append(unit);
-    return text;
-}
-
-} // namespace
 
 std::string printed(const char* format, ...)
 {
@@ -32,28 +19,18 @@ std::string printed(const char* format, ...)
 
 RowText wholeNumber(std::int64_t value, std::string_view unit)
 {
-    char text[20];
-    return textOf(text, std::to_chars(text, text + sizeof text, value).ptr, unit);
+    RowText text(std::in_place);
+    appendWhole(*text, value);
+    *text += unit;
+    return text;
 }
 
 RowText fixedPoint(double value, int digits, std::string_view unit)
 {
-    // The longest double has 309 digits before its point.
-    char text[1 + 309 + 1 + kMostDigits];
-    const auto end =
-        std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, digits).ptr;
-    return textOf(text, end, unit);
-}
-
-RowText decimal(std::int64_t raw) { return wholeNumber(static_cast<std::int32_t>(raw)); }
-
-RowText unsignedDecimal(std::int64_t raw) { return wholeNumber(static_cast<std::uint32_t>(raw)); }
-
-RowText decibels(std::int64_t raw) { return wholeNumber(static_cast<std::int32_t>(raw), " dB"); }
-
-RowText decibelMilliwatts(std::int64_t raw)
-{
-    return wholeNumber(static_cast<std::int32_t>(raw), " dBm");
+    RowText text(std::in_place);
+    appendFixed(*text, value, digits);
+    *text += unit;
+    return text;
 }
 
 } // namespace orvane

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Field.h"
+#include "platform/base/Reading.h"
 
 #include <cstdint>
 #include <span>
@@ -13,45 +14,51 @@ namespace orvane
 // printf into a text.
 [[gnu::format(printf, 1, 2)]] std::string printed(const char* format, ...);
 
-// What printf makes of the most frequent formats, at a quarter of its cost: "%d" and "%.*f"
-// (nearest even digit where the binary value lies just between two, as C has it), followed by the
-// unit.
+// What printf makes of "%d" and "%.*f" (nearest even digit where the binary value lies just between
+// two, as C has it), followed by the unit.
 RowText wholeNumber(std::int64_t value, std::string_view unit = {});
-constexpr int kMostDigits = 16;
 RowText fixedPoint(double value, int digits, std::string_view unit = {});
 
-// Names of a field's values.
-struct ValueName {
-    std::int64_t value;
-    const char* name;
-};
-
-// The value's name, or the fallback for one that the table lacks.
-constexpr const char* nameOf(std::span<const ValueName> table, std::int64_t value,
-                             const char* fallback)
+// "%d" followed by the suffix, of raw * factor + offset (see Format::WholeScale).
+constexpr Format wholeFormat(std::string_view suffix, const Format::WholeScale& scale = {})
 {
-    for (const ValueName& entry : table)
-        if (entry.value == value)
-            return entry.name;
-    return fallback;
+    return Format::whole(suffix, scale);
 }
-
-// A format that names the values of a table; others show "Unknown".
+// "%.*f" followed by the suffix, of raw * factor / divisor + offset.
+constexpr Format fixedFormat(const Format::Scale& scale, int digits, std::string_view suffix = {})
+{
+    return Format::fixed(scale, digits, suffix);
+}
+// The same of a raw number that is the bits of a double (see bitsOfValue()).
+constexpr Format realFormat(int digits, std::string_view suffix)
+{
+    return Format::fixed({}, digits, suffix).withValue(valueOfBits);
+}
+// The names of a table, the fallback for what it lacks. Without a fallback that writes no row.
+constexpr Format namesFormat(std::span<const ValueName> names, const char* fallback)
+{
+    return Format::named(names, fallback);
+}
+// The names of a table; others show "Unknown".
 template <const auto& Table>
-RowText named(std::int64_t raw)
+inline constexpr Format named = namesFormat(Table, "Unknown");
+
+// One name for 0 and one for every other raw number.
+constexpr Format flagFormat(const char* zero, const char* others)
 {
-    return nameOf(Table, raw, "Unknown");
+    return Format::named({}, others).withText(0, zero);
 }
 
-// Formats that several sections share, each named by its printf format.
+// Formats that several sections share, each called by its printf format.
 
 // "%d": an unsigned 32-bit value beyond 2147483647 shows as C shows it, negative.
-RowText decimal(std::int64_t raw);
+inline constexpr Format decimal = wholeFormat("");
 // "%u".
-RowText unsignedDecimal(std::int64_t raw);
+inline constexpr Format unsignedDecimal =
+    wholeFormat("", {.narrowing = Format::Narrowing::Unsigned32});
 // "%d dB".
-RowText decibels(std::int64_t raw);
+inline constexpr Format decibels = wholeFormat(" dB");
 // "%d dBm".
-RowText decibelMilliwatts(std::int64_t raw);
+inline constexpr Format decibelMilliwatts = wholeFormat(" dBm");
 
 } // namespace orvane

@@ -7,6 +7,7 @@
 #include <optional>
 #include <span>
 #include <type_traits>
+#include <utility>
 #include <vector>
 
 namespace orvane
@@ -53,7 +54,55 @@ void forEachWholeRecord(const Records& records, WholeBytes wholeBytes, Visit vis
     }
 }
 
+// The elements of a list that a packet fills anew. An element takes the place of an earlier one:
+// where that is a dictionary of readings of the same rows and nobody else holds it, only its
+// numbers are changed. Earlier elements that are too many are kept for the next packet. So a list
+// whose elements keep their shape costs no memory.
+class ListElements
+{
+public:
+    ListElements() = default;
+    explicit ListElements(std::vector<PropertyValue> earlier) : _elements(std::move(earlier)) {}
+
+    // Starts a list anew, in place of these elements.
+    void begin(std::vector<PropertyValue> earlier);
+
+    // A dictionary of the readings.
+    void add(std::span<const Reading> readings);
+    // A dictionary of the fields' rows in a record, those of `fields`, then of `others`.
+    void add(PacketView record, std::span<const Field> fields, std::span<const Field> others = {});
+    // Any other value.
+    void add(PropertyValue element);
+    // One dictionary a whole record.
+    void addAll(const Records& records, std::span<const Field> fields);
+
+    // What was added.
+    [[nodiscard]] std::vector<PropertyValue> take();
+
+private:
+    // The rows of the earlier element whose turn it is; null unless they can be changed in place.
+    [[nodiscard]] PropertyDictionary* reusable();
+
+    std::vector<PropertyValue> _elements;
+    std::size_t _count = 0; // of those added; behind them stand earlier ones
+    std::vector<PropertyValue> _spare;
+};
+
 // One dictionary a whole record, rows in the fields' order.
 std::vector<PropertyValue> recordRows(const Records& records, std::span<const Field> fields);
+
+// Changes the array under the row's key, or a new one, to what fill(ListElements&) adds.
+template <typename Fill>
+void rewriteListRow(PropertyDictionary* rows, const char* row, Fill fill)
+{
+    if (!rows)
+        return;
+    std::vector<PropertyValue> earlier;
+    if (const PropertyValue& present = (*rows)[row]; present.isUnsharedArray())
+        earlier = present.asArray()->replaceElements({});
+    ListElements elements(std::move(earlier));
+    fill(elements);
+    setListRow(rows, row, elements.take());
+}
 
 } // namespace orvane

@@ -44,15 +44,17 @@ void Section::reportUnknownCode(std::uint32_t logCode)
 void ListSection::decode(PacketView packet, const PacketLayout& layout)
 {
     const std::shared_ptr<PropertyArray> shown = list();
-    clearElementsInArray(shown.get());
-    replaceArray(shown.get(), elements(packet, layout));
+    _elements.begin(takeElements(shown.get()));
+    fill(_elements, packet, layout);
+    replaceArray(shown.get(), _elements.take());
 }
 
-std::vector<PropertyValue> ListSection::elements(PacketView packet, const PacketLayout& layout)
+void ListSection::fill(ListElements& elements, PacketView packet, const PacketLayout& layout)
 {
     if (layout.cells)
-        return cellDictionaries(packet, *layout.cells);
-    return layout.records ? layout.records->rowsIn(packet) : std::vector<PropertyValue>();
+        addCells(elements, packet, *layout.cells);
+    else if (layout.records)
+        layout.records->addTo(elements, packet);
 }
 
 } // namespace orvane

@@ -36,10 +36,10 @@ struct RecordLayout {
     {
         return Records(packet, first(packet), stride, count(packet));
     }
-    // A dictionary of rows a record.
-    [[nodiscard]] std::vector<PropertyValue> rowsIn(PacketView packet) const
+    // Adds a dictionary of rows for each record.
+    void addTo(ListElements& elements, PacketView packet) const
     {
-        return recordRows(in(packet), fields);
+        elements.addAll(in(packet), fields);
     }
 };
 
@@ -121,9 +121,12 @@ public:
 protected:
     using Section::Section;
     void decode(PacketView packet, const PacketLayout& layout) override;
-    // The elements that the packet's list has; by default a dictionary of rows a record, or one for
-    // each wanted cell.
-    virtual std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout);
+    // Adds the elements that the packet's list has; by default a dictionary of rows a record, or
+    // one for each wanted cell.
+    virtual void fill(ListElements& elements, PacketView packet, const PacketLayout& layout);
+
+private:
+    ListElements _elements;
 };
 
 } // namespace orvane

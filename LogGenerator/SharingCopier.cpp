@@ -8,6 +8,8 @@ PropertyValue SharingCopier::copy(const PropertyValue& value)
     _bytes += sizeof value;
     if (const std::string* text = value.asString())
         _bytes += text->size();
+    if (const TextReading* reading = value.asTextReading())
+        _bytes += sizeof *reading + reading->text.size();
     if (const Bytes* data = value.asData())
         _bytes += data->size();
 

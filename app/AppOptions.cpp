@@ -56,6 +56,9 @@ constexpr AppOption kOptions[] = {
         }),
     AppOption({"fullscreen", "", "let the window fill the screen", kScreens},
               &AppOptions::isFullScreen),
+    AppOption(
+        {"details", "", "with json: print the numbers, units and times of rows too", kScreens},
+        &AppOptions::printsDetails),
     AppOption({"ports", "DIR",
                "where the telephony server's ports are (default $ORVANE_PORTS, "
                "$XDG_RUNTIME_DIR/telephony or /tmp/telephony-UID)",

@@ -26,6 +26,7 @@ struct AppOptions {
     // Of the live view and of a recording that is opened.
     std::optional<FrontEndKind> frontEnd;
     bool isFullScreen = false;
+    bool printsDetails = false; // numbers, units and times, with json
     // Also what --every of an export asks for.
     std::chrono::nanoseconds refreshInterval = std::chrono::seconds(2);
 

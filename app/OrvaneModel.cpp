@@ -1,10 +1,12 @@
 #include "app/OrvaneModel.h"
 
+#include "LogGenerator/MessageTime.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
-#include "platform/services/SystemLog.h"
+#include "platform/services/Services.h"
 
+#include <cmath>
 #include <exception>
 #include <typeinfo>
 #include <utility>
@@ -45,8 +47,11 @@ void OrvaneModel::updateWithData(ByteView data)
 {
     if (_environment.channelObserver)
         _environment.channelObserver->messageReceived(data);
-    if (_logGenerator)
+    if (_logGenerator) {
+        const double now = Services::current().clock().secondsSince1970();
+        const MessageTime arrival(static_cast<std::int64_t>(std::floor(now * 1000)));
         _logGenerator->updateState(*_state, data);
+    }
     _updated = true;
 }
 

@@ -44,8 +44,14 @@ constexpr TechnologyGroups kTechnologies[] = {
     {kTSLogChannelTechnology_Varnel_CDMA,   kCdma      },
 };
 
-// What the generators show where there is no cell.
-bool isKnown(const std::string* text) { return text && !text->empty() && *text != "Invalid Value"; }
+// Whether a row tells a cell: not where the generators show that there is none.
+bool isKnown(const PropertyValue& row)
+{
+    if (const Reading* reading = row.asReading())
+        return reading->description->format->showsNumber(reading->raw);
+    const std::string* text = row.asString();
+    return text && !text->empty() && *text != "Invalid Value";
+}
 
 } // namespace
 
@@ -70,13 +76,13 @@ bool ServingCell::note(const PropertyValue& display)
         bool wasKnown = false;
         bool isNew = false;
         for (const char* row : group.rows) {
-            const std::string* text = shown[row].asString();
-            if (isKnown(text) && *text != *known) {
-                isAnother = isAnother || !known->empty();
+            const PropertyValue& value = shown[row];
+            if (isKnown(value) && value != *known) {
+                isAnother = isAnother || *known;
                 isNew = true;
-                *known = *text;
+                *known = value;
             } else {
-                wasKnown = wasKnown || !known->empty();
+                wasKnown = wasKnown || *known;
             }
             ++known;
         }

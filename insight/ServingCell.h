@@ -31,7 +31,7 @@ public:
 
 private:
     std::span<const ServingCellGroup> _groups;
-    std::vector<std::string> _known; // the last text of each row
+    std::vector<PropertyValue> _known; // what each row showed last
 };
 
 } // namespace orvane

@@ -1,6 +1,8 @@
 #include "recordings/CsvRowWriter.h"
 
+#include "LogGenerator/TextReadings.h"
 #include "platform/base/Utf8.h"
+#include "ui/tree/DisplayWalk.h"
 
 #include <cstring>
 
@@ -10,8 +12,8 @@ namespace orvane
 namespace
 {
 
-// A period in the spool: its time, the changes (index of the row, kThere and its text, or kGone),
-// kEnd.
+// A period in the spool: its time, the changes (index of the row; kThere, its text and its number,
+// which is empty where there is none, or kGone), kEnd.
 constexpr std::uint32_t kEnd = UINT32_MAX;
 constexpr std::uint32_t kGone = 0;
 constexpr std::uint32_t kThere = 1;
@@ -28,10 +30,13 @@ bool CsvRowWriter::takePeriod(const std::string& time, const RowTable& table)
             continue;
         _spool.putNumber(static_cast<std::uint32_t>(i));
         if (table.isPresent(row)) {
-            const std::string text = printableText(row.text);
-            _units[i].take(text);
+            const std::string text = printableText(displayText(row.value));
+            const auto measure = measureOf(row.value);
+            if (!text.empty())
+                _units[i].take(measure);
             _spool.putNumber(kThere);
             _spool.putText(text);
+            _spool.putText(measure ? measure->number : "");
         } else {
             _spool.putNumber(kGone);
         }
@@ -72,30 +77,24 @@ std::string CsvRowWriter::header(const RowTable& table, const std::vector<std::s
 
 void CsvRowWriter::writeLines(const std::vector<std::size_t>& order)
 {
-    std::vector<std::string> texts(_units.size()); // empty where absent
+    std::vector<Cell> cells(_units.size()); // empty where absent
     std::string line;
     while (_spool.text(line)) {
-        for (auto row = _spool.number(); row && *row < texts.size(); row = _spool.number()) {
-            std::string& text = texts[*row];
-            if (_spool.number() == kThere)
-                _spool.text(text);
+        for (auto row = _spool.number(); row && *row < cells.size(); row = _spool.number()) {
+            Cell& cell = cells[*row];
+            if (_spool.number() == kThere && _spool.text(cell.text))
+                _spool.text(cell.number);
             else
-                text.clear();
+                cell = {};
         }
         for (const std::size_t row : order) {
             line += ',';
-            appendCell(line, field(row, texts[row]));
+            appendCell(line, _units[row].unit() ? cells[row].number : cells[row].text);
         }
         line += '\n';
         if (_spool.error() != 0 || !_output(line))
             return;
     }
-}
-
-std::string_view CsvRowWriter::field(std::size_t row, const std::string& text) const
-{
-    const auto parts = _units[row].unit() ? numberWithUnit(text) : std::nullopt;
-    return parts ? parts->number : std::string_view(text);
 }
 
 void CsvRowWriter::appendCell(std::string& to, std::string_view text) const
@@ -113,8 +112,9 @@ bool isFormulaOfSpreadsheets(std::string_view text)
     if (first == std::string_view::npos ||
         std::string_view("=+-@").find(text[first]) == std::string_view::npos)
         return text.starts_with('\t');
-    const auto number = numberWithUnit(text);
-    return !number || !number->unit.empty();
+    const std::size_t last = text.find_last_not_of(' ');
+    const auto number = textReading(text.substr(first, last + 1 - first));
+    return !number || !number->unit.empty() || text.substr(0, first).find('\t') != text.npos;
 }
 
 void appendCsvField(std::string& to, std::string_view text)

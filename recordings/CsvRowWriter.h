@@ -1,6 +1,6 @@
 #pragma once
 
-#include "recordings/NumberWithUnit.h"
+#include "recordings/Measure.h"
 #include "recordings/RowSpool.h"
 #include "recordings/RowWriter.h"
 
@@ -10,7 +10,7 @@ namespace orvane
 {
 
 // One line a period behind a header: the time, then a column a row, empty where it is absent. Where
-// all texts of a column are numbers of one unit it holds the numbers, and its header "PATH [UNIT]"
+// all values of a column are numbers of one unit it holds the numbers, and its header "PATH [UNIT]"
 // (or PATH where they have none); otherwise the texts as shown on one line. Fields are quoted as
 // RFC 4180 says; lines end with a line feed.
 //
@@ -35,9 +35,13 @@ public:
 private:
     [[nodiscard]] std::string header(const RowTable& table,
                                      const std::vector<std::size_t>& order) const;
-    [[nodiscard]] std::string_view field(std::size_t row, const std::string& text) const;
     void appendCell(std::string& to, std::string_view text) const;
     void writeLines(const std::vector<std::size_t>& order);
+
+    struct Cell {
+        std::string text;
+        std::string number;
+    };
 
     Output _output;
     Cells _cells;

@@ -1,6 +1,7 @@
 #include "recordings/JsonRowWriter.h"
 
 #include "platform/base/JsonText.h"
+#include "ui/tree/DisplayWalk.h"
 
 namespace orvane
 {
@@ -20,7 +21,7 @@ bool JsonRowWriter::takePeriod(const std::string& time, const RowTable& table)
             _line += ',';
         appendJsonString(_line, row.path);
         _line += ':';
-        appendJsonString(_line, row.text);
+        appendJsonString(_line, displayText(row.value));
     }
     _line += "}\n";
     return _output(_line);

@@ -1,5 +1,6 @@
 #include "recordings/LogDecoder.h"
 
+#include "LogGenerator/MessageTime.h"
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/PropertyValue.h"
@@ -89,6 +90,8 @@ void LogDecoder::takeNext()
 void LogDecoder::decodeNext()
 {
     const Silence silence(_tellsErrors ? Silence::Of::AllButErrors : Silence::Of::Everything);
+    const MessageTime time(_place.hasClock ? _place.clock.millisecondsSince1970(_place.nextTime)
+                                           : kNoReadingTime);
     try {
         _generator->updateState(_state, _place.nextMessage);
     } catch (const std::exception& failure) {

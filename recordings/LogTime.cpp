@@ -33,13 +33,7 @@ LogTime LogClock::timeOf(std::uint64_t timestamp) const
 
 std::string LogClock::isoText(LogTime time) const
 {
-    const std::int64_t milliseconds = millisecondsSince1970(time);
-    const CalendarTime date = calendarTime(milliseconds / 1000);
-    char text[64];
-    std::snprintf(text, sizeof text, "%04lld-%02d-%02dT%02d:%02d:%02d.%03dZ",
-                  static_cast<long long>(date.year), date.month, date.day, date.hour, date.minute,
-                  date.second, static_cast<int>(milliseconds % 1000));
-    return text;
+    return isoTimeText(millisecondsSince1970(time));
 }
 
 std::string LogClock::text(LogTime time) const

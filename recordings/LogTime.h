@@ -27,10 +27,9 @@ public:
     [[nodiscard]] std::string text(LogTime time) const;
     // The beginning of the day that `time` is in, by this clock; may lie before 0.
     [[nodiscard]] LogTime dayOf(LogTime time) const;
-
-private:
     [[nodiscard]] std::int64_t millisecondsSince1970(LogTime time) const;
 
+private:
     std::uint64_t _firstStep = 0;
 };
 

@@ -51,7 +51,7 @@ public:
     {
         if (!isDisplayGroup(value)) {
             if (rest.empty())
-                _visit(_path, displayText(value));
+                _visit(_path, value);
             return;
         }
         forEachDisplayChild(value, [&](std::string_view childName, const PropertyValue& child) {

@@ -9,8 +9,8 @@
 namespace orvane
 {
 
-// Takes a row: its path in the display tree, and its text. Of rows with one path the later counts.
-using RowVisitor = std::function<void(std::string_view path, const std::string& text)>;
+// Takes a row: its path in the display tree, and its value. Of rows with one path the later counts.
+using RowVisitor = std::function<void(std::string_view path, const PropertyValue& row)>;
 
 // What a person names rows by: the path of a row, or of a group, which stands for all the rows in
 // it, "/" for every row. "*" stands for any name at its place, for the elements of a list as a

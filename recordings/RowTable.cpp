@@ -28,8 +28,8 @@ void RowTable::take(const PropertyValue& display)
         if (asked.row != kNoRow)
             _previous = asked.row;
         if (display)
-            asked.path.forEachRow(display, [&](std::string_view path, const std::string& text) {
-                note(asked, path, text);
+            asked.path.forEachRow(display, [&](std::string_view path, const PropertyValue& row) {
+                note(asked, path, row);
             });
     }
     for (Row& row : _rows)
@@ -37,14 +37,14 @@ void RowTable::take(const PropertyValue& display)
             row.hasChanged = true;
 }
 
-void RowTable::note(Asked& asked, std::string_view path, const std::string& text)
+void RowTable::note(Asked& asked, std::string_view path, const PropertyValue& value)
 {
     asked.hasOccurred = true;
     _previous = rowAt(asked, path);
     Row& row = _rows[_previous];
-    if (row.lastPeriod == 0 || row.lastPeriod + 1 < _period || row.text != text) {
+    if (row.lastPeriod == 0 || row.lastPeriod + 1 < _period || row.value != value) {
         row.hasChanged = true;
-        row.text = text;
+        row.value = value;
     }
     row.lastPeriod = _period;
 }

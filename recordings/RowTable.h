@@ -19,9 +19,9 @@ class RowTable
 public:
     struct Row {
         std::string path;
-        std::string text;
+        PropertyValue value;
         std::uint64_t lastPeriod = 0; // the last one that it was there in; 0 for none so far
-        bool hasChanged = false;      // came, went or shows another text than in the period before
+        bool hasChanged = false;      // came, went or shows another value than in the period before
     };
 
     // Without paths, every row.
@@ -50,7 +50,7 @@ private:
         bool hasOccurred = false;
     };
 
-    void note(Asked& asked, std::string_view path, const std::string& text);
+    void note(Asked& asked, std::string_view path, const PropertyValue& value);
     [[nodiscard]] std::size_t rowAt(const Asked& asked, std::string_view path);
     std::size_t add(std::string_view path);
 

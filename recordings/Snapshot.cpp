@@ -1,6 +1,7 @@
 #include "recordings/Snapshot.h"
 
 #include "LogGenerator/StateKeys.h"
+#include "LogGenerator/TextReadings.h"
 #include "platform/base/Calendar.h"
 
 #include <cstdio>
@@ -55,7 +56,7 @@ Snapshot::Entry entryOf(const PropertyValue& value)
     entry.description = textOf(value[kDescriptionKey]);
     entry.date = textOf(value[kDateKey]);
     entry.secondsOfDate = secondsOf(entry.date);
-    entry.display = value[kDisplayKey];
+    entry.display = withTextReadings(value[kDisplayKey]);
     entry.log = logIn(value[kLogKey]);
     return entry;
 }

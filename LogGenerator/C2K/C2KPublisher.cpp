@@ -11,7 +11,7 @@ void C2KPublisher::publish(std::string_view stateKey, const PropertyValue& value
     for (const PropertyValue& entry : *entries) {
         PropertyDictionary* dictionary = entry[kLookupDictKey].asDictionary();
         const std::string* row = entry[kLookupRowKey].asString();
-        // The entries after a bad one are not written. This is meant.
+        // Deliberate: the entries after a bad one are not written.
         if (!dictionary || !row)
             return;
         dictionary->set(*row, value);
@@ -21,9 +21,13 @@ void C2KPublisher::publish(std::string_view stateKey, const PropertyValue& value
 void C2KPublisher::publish(PacketView packet, std::span<const Field> fields) const
 {
     for (const Field& field : fields)
-        if (const auto raw = field.valueIn(packet))
-            if (const RowText text = field.format(*raw))
-                publish(field.row, *text);
+        if (const auto raw = field.rowIn(packet))
+            publishReading(field, *raw);
+}
+
+void C2KPublisher::publishReading(const RowDescription& description, std::int64_t raw) const
+{
+    publish(description.row, PropertyValue::reading(readingOf(description, raw)));
 }
 
 void C2KPublisher::publishText(const char* text, std::span<const Field> fields) const

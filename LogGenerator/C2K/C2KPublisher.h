@@ -21,9 +21,11 @@ public:
     // An absent lookup publishes nothing.
     explicit C2KPublisher(PropertyValue lookup) : _lookup(std::move(lookup)) {}
 
-    // Stores the value, a string or a dictionary, in every row of the state key, and stops at the
-    // first entry that is not as it should be.
+    // Stores the value in every row of the state key, and stops at the first entry that is not as
+    // it should be.
     void publish(std::string_view stateKey, const PropertyValue& value) const;
+    // The same for a reading of the message; the description's row is the state key.
+    void publishReading(const RowDescription& description, std::int64_t raw) const;
     // Publishes each field of the packet that is there; the fields' rows are state keys.
     void publish(PacketView packet, std::span<const Field> fields) const;
     // Publishes one text under the state keys of all fields.

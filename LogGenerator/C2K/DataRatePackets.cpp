@@ -15,10 +15,14 @@ namespace orvane
 namespace
 {
 
+constexpr Format kRateFormat = realFormat(2, " kbps");
+constexpr RowDescription kForwardRate = {"kFLDataRate", &kRateFormat};
+constexpr RowDescription kReverseRate = {"kRLDataRate", &kRateFormat};
+
 // Where one direction keeps the totals of its last packet, in the state and for the record in
 // "ExtraInfo" (1 is the last packet, 2 the one before it).
 struct Direction {
-    const char* rateKey;
+    const RowDescription* rate;
     const char* sequenceKey;
     const char* sentKey;
     const char* sequenceBeforeKey;
@@ -27,9 +31,9 @@ struct Direction {
     const char* sentLastKey;
 };
 
-constexpr Direction kForward = {"kFLDataRate", "FLDataSeqNum",  "FLDataSent", "FLDataSeqNum2",
+constexpr Direction kForward = {&kForwardRate, "FLDataSeqNum",  "FLDataSent", "FLDataSeqNum2",
                                 "FLDataSent2", "FLDataSeqNum1", "FLDataSent1"};
-constexpr Direction kReverse = {"kRLDataRate", "RLDataSeqNum",  "RLDataSent", "RLDataSeqNum2",
+constexpr Direction kReverse = {&kReverseRate, "RLDataSeqNum",  "RLDataSent", "RLDataSeqNum2",
                                 "RLDataSent2", "RLDataSeqNum1", "RLDataSent1"};
 
 struct Totals {
@@ -46,10 +50,10 @@ std::optional<Totals> storedTotals(const PropertyDictionary& state, const Direct
     return Totals{*sequence, *sent};
 }
 
-std::string rateText(const Totals& now, const Totals& before, std::int32_t sequences)
+double rateBetween(const Totals& before, const Totals& now, std::int32_t sequences)
 {
     const auto bits = static_cast<double>(now.sent - before.sent);
-    return printed("%.2f kbps", bits / (static_cast<double>(sequences) * 1024));
+    return bits / (static_cast<double>(sequences) * 1024);
 }
 
 void store(PropertyDictionary* to, const char* sequenceKey, const char* sentKey,
@@ -70,10 +74,11 @@ void publishRate(const Totals& now, const Direction& direction, PropertyDictiona
             static_cast<std::int32_t>(static_cast<std::uint32_t>(now.sequence) -
                                       static_cast<std::uint32_t>(before->sequence));
         if (sequences >= 1)
-            publisher.publish(direction.rateKey, rateText(now, *before, sequences));
+            publisher.publishReading(*direction.rate,
+                                     bitsOfValue(rateBetween(*before, now, sequences)));
         store(extra, direction.sequenceBeforeKey, direction.sentBeforeKey, *before);
     } else {
-        publisher.publish(direction.rateKey, "");
+        publisher.publish(direction.rate->row, "");
     }
     store(&state, direction.sequenceKey, direction.sentKey, now);
     store(extra, direction.sequenceLastKey, direction.sentLastKey, now);

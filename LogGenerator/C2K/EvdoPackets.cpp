@@ -15,17 +15,20 @@ namespace
 constexpr const char* kNone = "(none)";
 constexpr std::uint64_t kNoPilot = 0xFFFF;
 
-RowText servingPilot(std::int64_t raw)
-{
-    if (raw == kNoPilot)
-        return "Invalid Value";
-    // The sign is the multiplication sign, not an x. This is meant.
-    return printed("%d × 64chips", static_cast<int>(raw));
-}
+// Deliberate: the sign is the multiplication sign, not an x.
+constexpr Format kServingPilot = wholeFormat(" × 64chips").withText(kNoPilot, "Invalid Value");
 
-RowText terminalIdentifier(std::int64_t raw)
+std::string terminalIdentifier(std::int64_t raw)
 {
     return printed("0x%06x", static_cast<unsigned>(raw));
+}
+constexpr Format kTerminalIdentifier(terminalIdentifier);
+
+constexpr RowDescription kPilotLevel = {"", &energyLevel};
+
+PropertyValue levelReading(std::uint64_t energy)
+{
+    return PropertyValue::reading(readingOf(kPilotLevel, static_cast<std::int64_t>(energy)));
 }
 
 constexpr unsigned kSummaryBytes = 50;
@@ -37,9 +40,9 @@ constexpr Field kSummaryFields[] = {
     bytesField("k1xEVDODeviceState", kDeviceStateOffset, 1, evdoDeviceState),
     bitsField("kBandClass", 14, 3, 5, bandClass),
     bytesField("kRxAGC0", 15, 1, signedDecibelMilliwatts, Coding::Signed),
-    bytesField("kServingPNOffset", 18, 2, servingPilot),
+    bytesField("kServingPNOffset", 18, 2, kServingPilot),
     bytesField("kSessionState", 37, 1, evdoSessionState),
-    bytesField("kUATI24", 38, 3, terminalIdentifier),
+    bytesField("kUATI24", 38, 3, kTerminalIdentifier),
     bytesField("kColorCode", 41, 1, decimal),
 };
 
@@ -93,7 +96,7 @@ void decodeEvdoActiveSet(PacketView packet, PropertyDictionary&, const C2KPublis
         const PacketView pilot = records.at(i);
         const auto offset = static_cast<int>(pilot.unsignedAt(0, 2).value_or(0));
         pilots.asDictionary()->set(printed("%d;%d", static_cast<int>(i), offset),
-                                   decibelsOfEnergy(pilot.unsignedAt(2, 2).value_or(0)));
+                                   levelReading(pilot.unsignedAt(2, 2).value_or(0)));
     }
     publisher.publish("kActiveSetPilots", pilots);
 }
@@ -122,7 +125,7 @@ void decodeFingers(PacketView packet, PropertyDictionary&, const C2KPublisher& p
             continue;
         isAnyShown = true;
         fingers.asDictionary()->set(printed("%d;%d", static_cast<int>(i), static_cast<int>(pilot)),
-                                    decibelsOfEnergy(finger.unsignedAt(6, 2).value_or(0)));
+                                    levelReading(finger.unsignedAt(6, 2).value_or(0)));
     }
     publisher.publish("kFingerC2I", isAnyShown ? fingers : PropertyValue(kNone));
 }

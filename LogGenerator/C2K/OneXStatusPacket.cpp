@@ -20,15 +20,16 @@ enum Subpacket : std::uint8_t { kSystemState = 1, kRadio = 2, kActiveSet = 3, kF
 constexpr std::uint64_t kTrafficState = 8;
 constexpr double kWeakest = 0.00001;
 
-RowText receivedPower(std::int64_t raw)
-{
-    return fineDecibelMilliwatts(static_cast<double>(raw) * 334 / 1000 - 63.248);
-}
+// "%+.2f dBm".
+constexpr Format kReceivedPower =
+    fixedFormat({.factor = 334, .divisor = 1000, .offset = -63.248}, 2, " dBm").withPlus();
+constexpr Format kTransmittedPower = fixedFormat({.divisor = 10}, 2, " dBm").withPlus();
 
-RowText transmittedPower(std::int64_t raw)
-{
-    return fineDecibelMilliwatts(static_cast<double>(raw) / 10);
-}
+// "%+.2f dB".
+constexpr Format kPilotFormat = realFormat(2, " dB").withPlus();
+constexpr Format kReferenceFormat = kPilotFormat.withPrefix("(ref pilot) ");
+constexpr RowDescription kPilotLevel = {"", &kPilotFormat};
+constexpr RowDescription kReferenceLevel = {"", &kReferenceFormat};
 
 constexpr Field kStateFields[] = {
     bytesField("k1xDeviceState", 4, 1, oneXDeviceState),
@@ -37,16 +38,19 @@ constexpr Field kStateFields[] = {
 constexpr Field kRadioFields[] = {
     bytesField("k1xRx0BandClass", 4, 1, bandClass),
     bytesField("k1xRx0ChanNum", 6, 2, decimal),
-    bytesField("k1xRxAGC0", 10, 1, receivedPower, Coding::Signed),
+    bytesField("k1xRxAGC0", 10, 1, kReceivedPower, Coding::Signed),
 };
 
 // Shown in traffic only.
 constexpr Field kTrafficFields[] = {
     bytesField("k1xRx1BandClass", 5, 1, bandClass),
     bytesField("k1xRx1ChanNum", 8, 2, decimal),
-    bytesField("k1xRxAGC1", 11, 1, receivedPower, Coding::Signed),
-    bytesField("k1xTxAGC", 12, 2, transmittedPower, Coding::Signed),
+    bytesField("k1xRxAGC1", 11, 1, kReceivedPower, Coding::Signed),
+    bytesField("k1xTxAGC", 12, 2, kTransmittedPower, Coding::Signed),
 };
+
+constexpr Format kOldErrorsFormat = realFormat(2, "% (old)").withUnit("%");
+constexpr RowDescription kOldTrafficErrors = {"k1xTrafficFER", &kOldErrorsFormat};
 
 // Once after traffic, the last error rate shows as old.
 void publishOldErrors(PropertyDictionary& state, const C2KPublisher& publisher)
@@ -54,7 +58,7 @@ void publishOldErrors(PropertyDictionary& state, const C2KPublisher& publisher)
     const std::optional<float> rate = trafficErrors(state);
     if (!rate)
         return;
-    publisher.publish("k1xTrafficFER", printed("%.02f%% (old)", percentOf(*rate)));
+    publisher.publishReading(kOldTrafficErrors, bitsOfValue(percentOf(*rate)));
     state.remove(kTrafficErrorsKey);
 }
 
@@ -97,9 +101,10 @@ std::optional<PropertyValue> pilotsOf(PacketView activeSet)
         const auto energy = pilot.unsignedAt(24 + 4 * scale.pad, 2);
         if (!offset || !energy)
             return std::nullopt;
-        const std::string level = fineDecibels(10 * std::log10(scale.strength(*energy)));
+        const std::int64_t level = bitsOfValue(10 * std::log10(scale.strength(*energy)));
+        const RowDescription& description = offset == reference ? kReferenceLevel : kPilotLevel;
         pilots.asDictionary()->set(printed("%d;%d", static_cast<int>(i), static_cast<int>(*offset)),
-                                   offset == reference ? "(ref pilot) " + level : level);
+                                   PropertyValue::reading(readingOf(description, level)));
     }
     return pilots;
 }

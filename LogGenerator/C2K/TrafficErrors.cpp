@@ -15,6 +15,9 @@ namespace
 
 constexpr std::uint8_t kTrafficDemodulation = 11;
 
+constexpr Format kErrorsFormat = realFormat(2, "%");
+constexpr RowDescription kTrafficErrors = {"k1xTrafficFER", &kErrorsFormat};
+
 // A frame counts for 1/64 of the average. Every product and the sum are rounded to single
 // precision.
 float movingAverage(bool isError, std::optional<float> before)
@@ -60,7 +63,7 @@ void decodeTrafficErrors(PacketView packet, PropertyDictionary& state,
         return;
     const float rate = movingAverage(*flag != 0, trafficErrors(state));
     state.set(kTrafficErrorsKey, PropertyValue::real(static_cast<double>(rate)));
-    publisher.publish("k1xTrafficFER", printed("%.02f%%", percentOf(rate)));
+    publisher.publishReading(kTrafficErrors, bitsOfValue(percentOf(rate)));
 }
 
 } // namespace orvane

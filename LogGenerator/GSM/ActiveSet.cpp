@@ -17,6 +17,9 @@ constexpr std::size_t kCellStride = 15;
 constexpr std::size_t kFingerStride = 44;
 
 constexpr Field kScramblingCode = bitsField("Scrambling Code", 7, 0, 13, decimal);
+// Deliberate: a power in the unit of a ratio.
+constexpr RowDescription kPower = {"RSCP", &decibels};
+constexpr RowDescription kEnergy = {"Energy Per Chip", &decibels};
 constexpr std::size_t kCellBytes = kScramblingCode.end();
 
 // The set that a cell belongs to: the highest three bits, above the scrambling code.
@@ -42,7 +45,7 @@ constexpr SectionLayout kLayout = {"Active Set", "ActiveSet", UnknownCode::Repor
 
 ActiveSet::ActiveSet() : ListSection(kLayout) {}
 
-std::vector<PropertyValue> ActiveSet::elements(PacketView packet, const PacketLayout&)
+void ActiveSet::fill(ListElements& elements, PacketView packet, const PacketLayout&)
 {
     const std::size_t count = countAt<15>(packet);
     const Records cells(packet, kFirstCell, kCellStride, count);
@@ -50,21 +53,19 @@ std::vector<PropertyValue> ActiveSet::elements(PacketView packet, const PacketLa
     const Records fingers(packet, kFirstCell + kCellStride * count, kFingerStride, count);
     const std::int64_t gain = gainControlDecibels(kReceiverGain.valueIn(packet).value_or(0));
 
-    std::vector<PropertyValue> active;
     std::size_t index = 0;
     forEachWholeRecord(cells, kCellBytes, [&](PacketView cell) {
         const PacketView finger = fingers.at(index++);
         if (setOf(cell) != kActive || !finger.holds(0, kFingerStride))
             return;
         const std::int64_t energy = lookUpECNO(energyRatio(finger));
-        active.push_back(PropertyValue::newDictionary());
-        PropertyDictionary* rows = active.back().asDictionary();
-        writeRows(rows, cell, std::span(&kScramblingCode, 1));
-        // A power in the unit of a ratio. This is meant.
-        setRow(rows, "RSCP", *decibels(gain - 106 + energy));
-        setRow(rows, "Energy Per Chip", *decibels(energy));
+        const Reading readings[] = {
+            readingOf(kScramblingCode, kScramblingCode.valueIn(cell).value_or(0)),
+            readingOf(kPower, gain - 106 + energy),
+            readingOf(kEnergy, energy),
+        };
+        elements.add(readings);
     });
-    return active;
 }
 
 } // namespace orvane

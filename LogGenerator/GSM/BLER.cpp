@@ -34,7 +34,8 @@ BLER::BLER() : Section(kLayout) {}
 void BLER::decode(PacketView packet, const PacketLayout& layout)
 {
     Section::decode(packet, layout);
-    setListRow(rows().get(), "Transport Channels", kChannels.rowsIn(packet));
+    rewriteListRow(rows().get(), "Transport Channels",
+                   [&](ListElements& channels) { kChannels.addTo(channels, packet); });
 }
 
 } // namespace orvane

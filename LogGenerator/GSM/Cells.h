@@ -26,12 +26,7 @@ inline bool isNeighbouringUmtsCell(const PropertyValue& cell)
     return isCell(cell, kTSCellMonitorRadioAccessTechnologyUMTS, kTSCellMonitorCellTypeNeighbor);
 }
 
-// A level in the given format; one that was not measured shows an empty text.
-template <Format MeasuredLevel>
-RowText levelText(std::int64_t level)
-{
-    constexpr std::int64_t kNotMeasured = 32767;
-    return level == kNotMeasured ? std::string() : MeasuredLevel(level);
-}
+// A level that was not measured, which shows an empty text.
+constexpr std::int64_t kNotMeasured = 32767;
 
 } // namespace orvane

@@ -25,7 +25,7 @@ constexpr ValueName kNetworkControlOrders[] = {
 constexpr ValueName kFlowControlSupports[] = {
     {0,   "Not Supported"},
     {1,   "Supported"    },
-    {255, "Available"    }, // elsewhere 255 is "Not Available"; this is meant
+    {255, "Available"    }, // deliberate: elsewhere 255 is "Not Available"
 };
 
 constexpr ValueName kPriorityAccessThresholds[] = {
@@ -41,14 +41,14 @@ constexpr ValueName kPriorityAccessThresholds[] = {
 };
 
 constexpr ValueName kT3192Times[] = {
-    {0, "500 ms" },
-    {1, "1000 ms"},
-    {2, "1500 ms"},
-    {3, "0 ms"   },
-    {4, "80 ms"  },
-    {5, "120 ms" },
-    {6, "160 ms" },
-    {7, "200 ms" },
+    {0, "500" },
+    {1, "1000"},
+    {2, "1500"},
+    {3, "0"   },
+    {4, "80"  },
+    {5, "120" },
+    {6, "160" },
+    {7, "200" },
 };
 
 constexpr ValueName kNetworkModes[] = {
@@ -57,10 +57,10 @@ constexpr ValueName kNetworkModes[] = {
     {2, "Class 3"},
 };
 
-RowText t3192Time(std::int64_t value) { return nameOf(kT3192Times, value, "?? ms"); }
-RowText burstType(std::int64_t flag) { return flag != 0 ? "11-bit format" : "8-bit format"; }
-RowText supported(std::int64_t flag) { return flag != 0 ? "Supported" : "Not Supported"; }
-RowText applied(std::int64_t flag) { return flag != 0 ? "Applied" : "Not Applied"; }
+constexpr Format kT3192Time = namesFormat(kT3192Times, "?? ms").withSuffix(" ms");
+constexpr Format kBurstType = flagFormat("8-bit format", "11-bit format");
+constexpr Format kSupported = flagFormat("Not Supported", "Supported");
+constexpr Format kApplied = flagFormat("Not Applied", "Applied");
 
 constexpr Field kSystemInformationFields[] = {
     bytesField("SI13 Position", 14, 1, named<kSi13Positions>),
@@ -73,8 +73,8 @@ constexpr Field kAccessFields[] = {
 };
 
 constexpr Field kCellOptionsFields[] = {
-    bytesField("T3192", 15, 1, t3192Time),
-    bytesField("Access Burst Type", 17, 1, burstType),
+    bytesField("T3192", 15, 1, kT3192Time),
+    bytesField("Access Burst Type", 17, 1, kBurstType),
     bytesField("DRX Timer Max", 16, 1, decimal),
 };
 
@@ -85,13 +85,13 @@ constexpr Field kBroadcastChannelFields[] = {
 constexpr Field kPacketStatusFields[] = {
     bytesField("Ext Measurement Order", 16, 1, decimal),
     bytesField("Packet PSI Status", 13, 1, decimal),
-    bytesField("Packet SI Status", 33, 1, supported),
+    bytesField("Packet SI Status", 33, 1, kSupported),
     bytesField("Count LR", 14, 1, decimal),
     bytesField("Count HR", 15, 1, decimal),
 };
 
 constexpr Field kMeasurementFields[] = {
-    bytesField("Cell Reselect Hysteresis", 26, 1, applied),
+    bytesField("Cell Reselect Hysteresis", 26, 1, kApplied),
 };
 
 constexpr Field kServingPlmnFields[] = {

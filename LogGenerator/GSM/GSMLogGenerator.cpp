@@ -2,6 +2,7 @@
 
 #include "LogGenerator/InternalInconsistency.h"
 #include "LogGenerator/StateKeys.h"
+#include "LogGenerator/TextReadings.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/base/TelephonyConstants.h"
@@ -23,7 +24,7 @@ constexpr int kUnreadableLine = 90;
 PropertyValue simplified(const PropertyValue& value)
 {
     PropertyValue simple = GSMLogGenerator::processObject(value);
-    // One level only: what takes the dictionary's place is not tested again. This is meant.
+    // Deliberate: one level only. What takes the dictionary's place is not tested again.
     PropertyValue only = GSMLogGenerator::canCollapse(simple);
     return only ? std::move(only) : std::move(simple);
 }
@@ -42,7 +43,7 @@ void GSMLogGenerator::updateState(PropertyDictionary& state, ByteView data)
     const PropertyValue received = readPropertyList(data).value;
     if (!received)
         throw InternalInconsistency("Could not deserialize the object", kSource, kUnreadableLine);
-    PropertyValue display = processObject(received);
+    PropertyValue display = withTextReadings(processObject(received));
     state.set(kDisplayStateKey, received);
     state.set(kDisplayKey, std::move(display));
     state.set(kExtraInfoKey, PropertyValue::newDictionary());
@@ -78,7 +79,7 @@ PropertyValue GSMLogGenerator::processObject(const PropertyValue& object)
     }
     if (const PropertyArray* array = object.asArray()) {
         PropertyValue simple = PropertyValue::newArray();
-        // The first element of every array is dropped. This is meant.
+        // Deliberate: the first element of every array is dropped.
         for (std::size_t i = 1; i < array->size(); ++i)
             simple.asArray()->append(simplified((*array)[i]));
         return simple;

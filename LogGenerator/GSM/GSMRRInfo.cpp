@@ -9,7 +9,7 @@ namespace orvane
 namespace
 {
 
-// Three of the names have a blank inside. This is meant.
+// Deliberate: three of the names have a blank inside.
 constexpr ValueName kRrStates[] = {
     {0,  "RR_INACTIVE"                         },
     {1,  "RR_GOING_ACTIVE"                     },
@@ -35,18 +35,18 @@ constexpr ValueName kRrStates[] = {
     {21, "RR_W2G_INTERRAT_CC_ORDER_ PROGRESS"  },
 };
 
-RowText mode(std::int64_t flag) { return flag != 0 ? "Data" : "Voice"; }
-RowText onOrOff(std::int64_t flag) { return flag != 0 ? "ON" : "OFF"; }
-RowText seconds(std::int64_t raw) { return wholeNumber(raw, " sec"); }
+constexpr Format kMode = flagFormat("Voice", "Data");
+constexpr Format kOnOrOff = flagFormat("OFF", "ON");
+constexpr Format kSeconds = wholeFormat(" sec");
 
 constexpr Field kStateFields[] = {
     bytesField("RR State", 13, 1, named<kRrStates>),
     bytesField("RR Sub State", 14, 1, decimal),
     bytesField("RR Status", 15, 1, decimal),
-    bytesField("RR Mode", 16, 1, mode),
+    bytesField("RR Mode", 16, 1, kMode),
 };
 
-// The bytes that "GSM Serving Cell" shows as C1 and C2, here uncut. This is meant.
+// Deliberate: the bytes that "GSM Serving Cell" shows as C1 and C2, here uncut.
 constexpr Field kMeasurementFields[] = {
     bytesField("Serving Rx Level", 15, 1, decimal),
     bytesField("Rx Quality Full", 16, 4, decimal),
@@ -54,11 +54,11 @@ constexpr Field kMeasurementFields[] = {
 };
 
 constexpr Field kDtxFields[] = {
-    bytesField("DTX Used", 19, 1, onOrOff),
+    bytesField("DTX Used", 19, 1, kOnOrOff),
 };
 
 constexpr Field kCellOptionsFields[] = {
-    bytesField("DRX Used", 16, 1, seconds),
+    bytesField("DRX Used", 16, 1, kSeconds),
 };
 
 constexpr PacketLayout kPackets[] = {

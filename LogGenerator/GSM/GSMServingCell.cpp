@@ -16,24 +16,24 @@ constexpr Field kCellFields[] = {
     bytesField("BSIC", 15, 2, decimal),
 };
 
-// Cut to their low 16 and 8 bits. This is meant; the same bytes show uncut in "GSM RR Info".
-RowText low16Bits(std::int64_t raw) { return decimal(raw & 0xFFFF); }
-RowText low8Bits(std::int64_t raw) { return decimal(raw & 0xFF); }
+// Deliberate: cut to their low 16 and 8 bits. The same bytes show uncut in "GSM RR Info".
+constexpr Format kLow16Bits = wholeFormat("", {.mask = 0xFFFF});
+constexpr Format kLow8Bits = wholeFormat("", {.mask = 0xFF});
 
 constexpr Field kMeasurementFields[] = {
-    // Not negated. This is meant.
+    // Deliberate: not negated.
     bytesField("RSSI", 15, 1, decibelMilliwatts),
-    bytesField("C1 Value", 16, 4, low16Bits),
-    bytesField("C2 Value", 20, 4, low16Bits),
+    bytesField("C1 Value", 16, 4, kLow16Bits),
+    bytesField("C2 Value", 20, 4, kLow16Bits),
 };
 
 constexpr Field kDedicatedChannelFields[] = {
-    bytesField("MA Dedicated ARFCN", 13, 2, low8Bits),
+    bytesField("MA Dedicated ARFCN", 13, 2, kLow8Bits),
 };
 
 constexpr CellRow kCellRows[] = {
-    {kTSCellMonitorCellId, "Cell ID", "GSMServingCell: Failed to retrieve Cell ID\n"},
-    {kTSCellMonitorARFCN,  "ARFCN",   "GSMServingCell: Failed to retrieve ARFCN\n"  },
+    cellRow(kTSCellMonitorCellId, "Cell ID", "GSMServingCell: Failed to retrieve Cell ID\n"),
+    cellRow(kTSCellMonitorARFCN, "ARFCN", "GSMServingCell: Failed to retrieve ARFCN\n"),
 };
 
 constexpr CellLayout kServingCell = {isServingGsmCell, kCellRows};

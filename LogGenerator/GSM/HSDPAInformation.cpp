@@ -34,8 +34,7 @@ constexpr std::size_t kProcessBytes = 9;
 constexpr auto kPrimaryCount = countAt<16>;
 constexpr auto kSecondaryCount = countAt<17>;
 
-// The format keeps 162 bytes for each primary process, not the 9 of its record. This is
-// meant.
+// Deliberate: the format keeps 162 bytes for each primary process, not the 9 of its record.
 std::size_t firstSecondaryProcess(PacketView packet)
 {
     return kFirstProcess + 162 * kPrimaryCount(packet);
@@ -66,10 +65,11 @@ HSDPAInformation::HSDPAInformation() : Section(kLayout) {}
 void HSDPAInformation::decode(PacketView packet, const PacketLayout& layout)
 {
     Section::decode(packet, layout);
-    // A packet without processes of a carrier leaves its last list on the screen. This is meant.
+    // Deliberate: a packet without processes of a carrier leaves its last list on the screen.
     for (const ProcessList& list : kProcessLists)
         if (list.records.count(packet) != 0)
-            setListRow(rows().get(), list.row, list.records.rowsIn(packet));
+            rewriteListRow(rows().get(), list.row,
+                           [&](ListElements& processes) { list.records.addTo(processes, packet); });
 }
 
 } // namespace orvane

@@ -5,8 +5,8 @@
 namespace orvane
 {
 
-// Log codes of the modem packets that the GSM/UMTS sections understand. Several feed more than one
-// section, each of which shows its own view of the packet. This is meant.
+// Log codes of the modem packets that the GSM/UMTS sections understand. Deliberate: several feed
+// more than one section, each of which shows its own view of the packet.
 
 constexpr std::uint32_t kUmtsRankingCode = 0x4005;
 constexpr std::uint32_t kUmtsTransmitPowerCode = 0x4031;

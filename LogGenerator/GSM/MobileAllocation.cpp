@@ -15,6 +15,7 @@ constexpr Field kFields[] = {
 };
 
 constexpr std::size_t kChannelBytes = 2;
+constexpr Field kChannel = bytesField("", 0, kChannelBytes, decimal);
 
 constexpr PacketLayout kPackets[] = {
     {kGsmMobileAllocationCode, 15, kFields},
@@ -30,12 +31,13 @@ MobileAllocation::MobileAllocation() : Section(kLayout) {}
 void MobileAllocation::decode(PacketView packet, const PacketLayout& layout)
 {
     Section::decode(packet, layout);
-    std::vector<PropertyValue> channels;
     const Records records(packet, 15, kChannelBytes, countAt<14>(packet));
-    forEachWholeRecord(records, kChannelBytes, [&](PacketView record) {
-        channels.emplace_back(std::to_string(record.unsignedAt(0, kChannelBytes).value_or(0)));
+    rewriteListRow(rows().get(), "ARFCNs", [&](ListElements& channels) {
+        forEachWholeRecord(records, kChannelBytes, [&](PacketView record) {
+            const std::int64_t raw = kChannel.valueIn(record).value_or(0);
+            channels.add(PropertyValue::reading(readingOf(kChannel, raw)));
+        });
     });
-    setListRow(rows().get(), "ARFCNs", std::move(channels));
 }
 
 } // namespace orvane

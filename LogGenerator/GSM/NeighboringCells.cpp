@@ -22,12 +22,14 @@ constexpr Field kNeighbourFields[] = {
 constexpr RecordLayout kNeighbours = {countAt<28>, startAt<29>, 14, kNeighbourFields};
 
 // The server counts a GSM level in steps of 2 dB.
-RowText doubledLevel(std::int64_t level) { return decibelMilliwatts(2 * level); }
+constexpr Format kServerLevel = wholeFormat(" dBm", {.factor = 2}).withText(kNotMeasured, "");
+
+constexpr RowDescription kBsic = {"BSIC", &decimal};
 
 constexpr CellRow kCellRows[] = {
     cellRow(kTSCellMonitorARFCN, kChannelRow, "NeighboringCells: Failed to retrieve ARFCN\n"),
     cellRow(kTSCellMonitorRSSI, "RSSI", "NeighboringCells: Failed to retrieve RSSI\n",
-            levelText<doubledLevel>),
+            kServerLevel),
 };
 
 constexpr CellLayout kNeighbouringCells = {isNeighbouringGsmCell, kCellRows};
@@ -60,29 +62,34 @@ void NeighboringCells::decodeBsicList(PacketView packet)
     arfcnToBsic.clear();
     const Records entries(packet, 15, 4, countAt<14>(packet));
     forEachWholeRecord(entries, kEntryBytes, [&](PacketView entry) {
-        const std::uint64_t arfcn = entry.unsignedAt(0, 2).value_or(0);
-        const std::uint64_t bsic = entry.unsignedAt(2, 1).value_or(0);
-        arfcnToBsic[std::to_string(arfcn)] = std::to_string(bsic);
+        const auto arfcn = static_cast<std::int64_t>(entry.unsignedAt(0, 2).value_or(0));
+        arfcnToBsic[arfcn] = static_cast<std::int64_t>(entry.unsignedAt(2, 1).value_or(0));
     });
 }
 
-std::vector<PropertyValue> NeighboringCells::elements(PacketView packet, const PacketLayout& layout)
+void NeighboringCells::fill(ListElements& elements, PacketView packet, const PacketLayout& layout)
 {
-    std::vector<PropertyValue> neighbours = ListSection::elements(packet, layout);
-    if (layout.logCode != kGsmMeasurementCode)
-        return neighbours;
-    for (const PropertyValue& neighbour : neighbours)
-        if (const std::string* channel = neighbour[kChannelRow].asString())
-            if (const auto known = arfcnToBsic.find(*channel); known != arfcnToBsic.end())
-                setRow(neighbour.asDictionary(), "BSIC", known->second);
-    return neighbours;
+    if (layout.logCode != kGsmMeasurementCode) {
+        ListSection::fill(elements, packet, layout);
+        return;
+    }
+    forEachWholeRecord(kNeighbours.in(packet), bytesRead(kNeighbourFields), [&](PacketView record) {
+        Reading readings[std::size(kNeighbourFields) + 1] = {};
+        std::size_t count = 0;
+        for (const Field& field : kNeighbourFields)
+            readings[count++] = readingOf(field, field.valueIn(record).value_or(0));
+        const auto known = arfcnToBsic.find(readings[0].raw);
+        if (known != arfcnToBsic.end())
+            readings[count++] = readingOf(kBsic, known->second);
+        elements.add(std::span(readings, count));
+    });
 }
 
 PropertyValue NeighboringCells::keptValues() const
 {
     const PropertyValue values = PropertyValue::newDictionary();
     for (const auto& [arfcn, bsic] : arfcnToBsic)
-        values.asDictionary()->set(arfcn, bsic);
+        values.asDictionary()->set(std::to_string(arfcn), PropertyValue::integer(bsic));
     return values;
 }
 
@@ -91,8 +98,7 @@ void NeighboringCells::takeKeptValues(const PropertyValue& values)
     arfcnToBsic.clear();
     if (const PropertyDictionary* dictionary = values.asDictionary())
         for (const auto& [arfcn, bsic] : *dictionary)
-            if (const std::string* text = bsic.asString())
-                arfcnToBsic[arfcn] = *text;
+            arfcnToBsic[std::stoll(arfcn)] = bsic.asInteger().value_or(0);
 }
 
 } // namespace orvane

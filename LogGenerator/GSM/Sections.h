@@ -5,7 +5,6 @@
 
 #include <exception>
 #include <map>
-#include <string>
 
 namespace orvane
 {
@@ -46,7 +45,7 @@ public:
     ActiveSet();
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
 };
 
 // "Mobile Allocation": the hopping sequence and its channels.
@@ -68,13 +67,13 @@ public:
 
 private:
     void decode(PacketView packet, const PacketLayout& layout) override;
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
     [[nodiscard]] PropertyValue keptValues() const override;
     void takeKeptValues(const PropertyValue& values) override;
     void decodeBsicList(PacketView packet);
 
-    // Decimal texts, from the last BSIC list.
-    std::map<std::string, std::string> arfcnToBsic;
+    // From the last BSIC list.
+    std::map<std::int64_t, std::int64_t> arfcnToBsic;
 };
 
 // "PDP Context Info": the packet-data contexts as the telephony server lists them, with keys and
@@ -95,7 +94,7 @@ public:
     EquivalentPLMNList();
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
 };
 
 // "UMTS RR Info": RRC state, identity and frequencies of the serving cell, ciphering and the mean

@@ -25,28 +25,31 @@ char digit(std::int64_t identity, unsigned nibble)
 
 // The identity's three bytes hold its digits from the low half of the first byte on as
 // MCC 1, MCC 2, MCC 3, MNC 3, MNC 1, MNC 2.
-RowText countryCode(std::int64_t identity)
+std::string countryCode(std::int64_t identity)
 {
-    return printed("%c%c%c", digit(identity, 0), digit(identity, 1), digit(identity, 2));
+    return {digit(identity, 0), digit(identity, 1), digit(identity, 2)};
 }
 
-RowText networkCode(std::int64_t identity)
+std::string networkCode(std::int64_t identity)
 {
-    return printed("%c%c%c", digit(identity, 4), digit(identity, 5), digit(identity, 3));
+    return {digit(identity, 4), digit(identity, 5), digit(identity, 3)};
 }
+
+constexpr Format kCountryCode(countryCode);
+constexpr Format kNetworkCode(networkCode);
 
 constexpr Field kPlmnFields[] = {
-    bytesField("Mobile Country Code", 15, 3, countryCode),
-    bytesField("Mobile Network Code", 15, 3, networkCode),
+    bytesField("Mobile Country Code", 15, 3, kCountryCode),
+    bytesField("Mobile Network Code", 15, 3, kNetworkCode),
     bytesField("Location Area Code", 18, 2, decimal, Coding::BigEndian),
     bytesField("Routing Area Code", 20, 1, decimal),
     bytesField("Service Type", 14, 1, named<kServiceTypes>),
 };
 
 constexpr CellRow kCellRows[] = {
-    {kTSCellMonitorMCC, "Mobile Country Code", "ServingPLMN: Failed to retrieve MCC\n"},
-    {kTSCellMonitorMNC, "Mobile Network Code", "ServingPLMN: Failed to retrieve MNC\n"},
-    {kTSCellMonitorLAC, "Location Area Code",  "ServingPLMN: Failed to retrieve LAC\n"},
+    cellRow(kTSCellMonitorMCC, "Mobile Country Code", "ServingPLMN: Failed to retrieve MCC\n"),
+    cellRow(kTSCellMonitorMNC, "Mobile Network Code", "ServingPLMN: Failed to retrieve MNC\n"),
+    cellRow(kTSCellMonitorLAC, "Location Area Code", "ServingPLMN: Failed to retrieve LAC\n"),
 };
 
 bool isServingCell(const PropertyValue& cell)

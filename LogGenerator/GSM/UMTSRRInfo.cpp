@@ -22,7 +22,7 @@ constexpr ValueName kRrcStates[] = {
     {5, "URA_PCH"     },
 };
 
-RowText enabled(std::int64_t flag) { return flag != 0 ? "Enabled" : "Disabled"; }
+constexpr Format kEnabled = flagFormat("Disabled", "Enabled");
 
 constexpr Field kStateFields[] = {
     bytesField("RRC State", 13, 1, named<kRrcStates>),
@@ -36,13 +36,17 @@ constexpr Field kIdentityFields[] = {
 };
 
 constexpr Field kCipheringFields[] = {
-    bytesField("Ciphering", 13, 1, enabled),
+    bytesField("Ciphering", 13, 1, kEnabled),
 };
+
+// "%4.2lf dBm".
+constexpr Format kMeanPower = realFormat(2, " dBm").withWidth(4);
+constexpr RowDescription kTransmitPower = {"Transmit Power", &kMeanPower};
 
 constexpr Field kTransmitGain = bytesField("", 4, 2, decimal, Coding::Signed);
 
-// The mean in dBm over the records that have a reading. Of none it is not a number, and shown so on
-// purpose.
+// The mean in dBm over the records that have a reading. Deliberate: of none it is not a number, and
+// shown so.
 double meanTransmitPower(PacketView packet)
 {
     double sum = 0;
@@ -59,9 +63,10 @@ double meanTransmitPower(PacketView packet)
 }
 
 constexpr CellRow kCellRows[] = {
-    {kTSCellMonitorCellId, "Cell ID",         "UMTSRRInfo: Failed to retrieve Cell ID\n"        },
-    {kTSCellMonitorUARFCN, kChannelRow,       "UMTSRRInfo: Failed to retrieve UARFCN\n"         },
-    {kTSCellMonitorSCN,    "Scrambling Code", "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
+    cellRow(kTSCellMonitorCellId, "Cell ID", "UMTSRRInfo: Failed to retrieve Cell ID\n"),
+    cellRow(kTSCellMonitorUARFCN, kChannelRow, "UMTSRRInfo: Failed to retrieve UARFCN\n"),
+    cellRow(kTSCellMonitorSCN, "Scrambling Code",
+            "UMTSRRInfo: Failed to retrieve Scrambling Code\n"),
 };
 
 constexpr CellLayout kServingCell = {isServingUmtsCell, kCellRows};
@@ -85,7 +90,7 @@ void UMTSRRInfo::decode(PacketView packet, const PacketLayout& layout)
     Section::decode(packet, layout);
     const auto shown = rows();
     if (layout.logCode == kUmtsTransmitPowerCode)
-        setRow(shown.get(), "Transmit Power", printed("%4.2lf dBm", meanTransmitPower(packet)));
+        setReading(shown.get(), kTransmitPower, bitsOfValue(meanTransmitPower(packet)));
     // The modem shows both frequencies; the telephony server's next record brings its own back.
     if (layout.logCode == kUmtsCellIdentityCode && shown)
         shown->remove(kChannelRow);

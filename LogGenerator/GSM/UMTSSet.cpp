@@ -10,18 +10,16 @@ namespace orvane
 namespace
 {
 
-RowText receivedPower(std::int64_t raw) { return decibels(raw - 21); }
-
-RowText halfDecibels(std::int64_t steps)
-{
-    return fixedPoint(static_cast<double>(steps) * 0.5, 6, " dB");
-}
+constexpr Format kReceivedPower = wholeFormat(" dB", {.offset = -21});
+constexpr Format kHalfDecibels = fixedFormat({.factor = 0.5}, 6, " dB");
+constexpr Format kServerPower = decibelMilliwatts.withText(kNotMeasured, "");
+constexpr Format kServerEnergy = decibels.withText(kNotMeasured, "");
 
 constexpr Field kCellFields[] = {
     bytesField("Scrambling Code", 2, 2, decimal),
-    bytesField("RSCP", 4, 1, receivedPower, Coding::Signed),
-    bytesField("Energy Per Chip", 7, 1, halfDecibels, Coding::Signed),
-    // Shown as a signed number, so that 0xFFFF is -1. This is meant.
+    bytesField("RSCP", 4, 1, kReceivedPower, Coding::Signed),
+    bytesField("Energy Per Chip", 7, 1, kHalfDecibels, Coding::Signed),
+    // Deliberate: shown as a signed number, so that 0xFFFF is -1.
     bytesField("Downlink Frequency", 0, 2, decimal, Coding::Signed),
     bytesField("Ranking Value", 8, 2, decimal, Coding::Signed),
     bytesField("Rank Cell RSCP", 5, 2, decibels, Coding::Signed),
@@ -32,10 +30,9 @@ constexpr RecordLayout kCells = {kUmtsRankingCount, kFirstRankingRecord, 10, kCe
 constexpr CellRow kNeighbourRows[] = {
     cellRow(kTSCellMonitorUARFCN, "UARFCN", "UMTSSet: Failed to retrieve UARFCN\n"),
     cellRow(kTSCellMonitorSCN, "Scrambling Code", "UMTSSet: Failed to retrieve Scrambling Code\n"),
-    cellRow(kTSCellMonitorRSCP, "RSCP", "UMTSSet: Failed to retrieve RSCP\n",
-            levelText<decibelMilliwatts>),
+    cellRow(kTSCellMonitorRSCP, "RSCP", "UMTSSet: Failed to retrieve RSCP\n", kServerPower),
     cellRow(kTSCellMonitorECN0, "Energy Per Chip", "UMTSSet: Failed to retrieve Energy Per Chip\n",
-            levelText<decibels>),
+            kServerEnergy),
 };
 
 constexpr CellLayout kNeighbours = {isNeighbouringUmtsCell, kNeighbourRows};

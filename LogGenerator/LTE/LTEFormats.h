@@ -1,39 +1,20 @@
 #pragma once
 
-#include "LogGenerator/Field.h"
+#include "LogGenerator/Formats.h"
 
 namespace orvane
 {
 
 // How LTE packets carry levels: the raw number, in steps of a fraction of a decibel, above a lowest
-// level. Each has its value in decibels and its format, "%4.2f dBm" or "%4.2f dB".
-
-constexpr double quarterDecibelPower(std::int64_t raw)
-{
-    return static_cast<double>(raw) * 0.25 - 140.0;
-}
-constexpr double halfDecibelPower(std::int64_t raw)
-{
-    return static_cast<double>(raw) * 0.5 - 140.0;
-}
-constexpr double eighthDecibelQuality(std::int64_t raw)
-{
-    return static_cast<double>(raw) * 0.125 - 20.0;
-}
-constexpr double quarterDecibelQuality(std::int64_t raw)
-{
-    return static_cast<double>(raw) * 0.25 - 30.0;
-}
-
-RowText rsrpQuarterDb(std::int64_t raw);
-RowText rsrpHalfDb(std::int64_t raw);
-RowText rsrqEighthDb(std::int64_t raw);
-RowText rsrqQuarterDb(std::int64_t raw);
-RowText rssiHalfDb(std::int64_t raw);
-
+// level. Shown by "%4.2f dBm" and "%4.2f dB".
+inline constexpr Format rsrpQuarterDb = fixedFormat({.factor = 0.25, .offset = -140.0}, 2, " dBm");
+inline constexpr Format rsrpHalfDb = fixedFormat({.factor = 0.5, .offset = -140.0}, 2, " dBm");
+inline constexpr Format rsrqEighthDb = fixedFormat({.factor = 0.125, .offset = -20.0}, 2, " dB");
+inline constexpr Format rsrqQuarterDb = fixedFormat({.factor = 0.25, .offset = -30.0}, 2, " dB");
+inline constexpr Format rssiHalfDb = fixedFormat({.factor = 0.5, .offset = -140.0}, 2, " dBm");
 // raw - 30, "%d dBm".
-RowText minus30(std::int64_t raw);
+inline constexpr Format minus30 = wholeFormat(" dBm", {.offset = -30});
 // The lowest level at which a cell may be chosen: 2 * raw - 140, "%d dBm".
-RowText qrxlevmin(std::int64_t raw);
+inline constexpr Format qrxlevmin = wholeFormat(" dBm", {.factor = 2, .offset = -140});
 
 } // namespace orvane

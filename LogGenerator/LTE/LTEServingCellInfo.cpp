@@ -14,25 +14,21 @@ constexpr std::uint32_t kConfigurationCode = 0xB0C2;
 constexpr std::uint32_t kBroadcastCode = 0xB0C1;
 
 constexpr ValueName kBandwidths[] = {
-    {6,   "1.4 MHz"}, // resource blocks
-    {15,  "3 MHz"  },
-    {25,  "5 MHz"  },
-    {50,  "10 MHz" },
-    {75,  "15 MHz" },
-    {100, "20 MHz" },
+    {6,   "1.4"}, // resource blocks
+    {15,  "3"  },
+    {25,  "5"  },
+    {50,  "10" },
+    {75,  "15" },
+    {100, "20" },
 };
-
-RowText bandwidth(std::int64_t resourceBlocks)
-{
-    return nameOf(kBandwidths, resourceBlocks, "Unknown");
-}
+constexpr Format kBandwidth = namesFormat(kBandwidths, "Unknown").withSuffix(" MHz");
 
 constexpr Field kConfigurationFields[] = {
     bytesField("Physical Cell ID", 14, 2, decimal),
     bytesField("Download Frequency", 16, 2, decimal),
     bytesField("Upload Frequency", 18, 2, decimal),
-    bytesField("Download Bandwidth", 20, 1, bandwidth),
-    bytesField("Upload Bandwidth", 21, 1, bandwidth),
+    bytesField("Download Bandwidth", 20, 1, kBandwidth),
+    bytesField("Upload Bandwidth", 21, 1, kBandwidth),
     bytesField("Cell Identity", 22, 4, decimal),
     bytesField("Tracking Area Code", 26, 2, decimal),
     bytesField("Freq Band Indicator", 28, 4, decimal),
@@ -45,13 +41,14 @@ constexpr Field kBroadcastFields[] = {
 constexpr const char* kChannelRow = "UARFCN";
 
 constexpr CellRow kCellRows[] = {
-    {kTSCellMonitorTAC,      "Tracking Area Code",  "Serving Cell Info: Failed to retrieve TAC\n"    },
-    {kTSCellMonitorCellId,   "Cell Identity",       "Serving Cell Info: Failed to retrieve Cell ID\n"},
-    {kTSCellMonitorPID,      "Physical Cell ID",
-     "Serving Cell Info: Failed to retrieve Physical Cell ID\n"                                      },
-    {kTSCellMonitorBandInfo, "Freq Band Indicator",
-     "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"                                   },
-    {kTSCellMonitorUARFCN,   kChannelRow,           "Serving Cell Info: Failed to retrieve UARFCN\n" },
+    cellRow(kTSCellMonitorTAC, "Tracking Area Code", "Serving Cell Info: Failed to retrieve TAC\n"),
+    cellRow(kTSCellMonitorCellId, "Cell Identity",
+            "Serving Cell Info: Failed to retrieve Cell ID\n"),
+    cellRow(kTSCellMonitorPID, "Physical Cell ID",
+            "Serving Cell Info: Failed to retrieve Physical Cell ID\n"),
+    cellRow(kTSCellMonitorBandInfo, "Freq Band Indicator",
+            "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"),
+    cellRow(kTSCellMonitorUARFCN, kChannelRow, "Serving Cell Info: Failed to retrieve UARFCN\n"),
 };
 
 bool isServingLteCell(const PropertyValue& cell)
@@ -77,12 +74,12 @@ LTEServingCellInfo::LTEServingCellInfo() : Section(kLayout) {}
 void LTEServingCellInfo::decode(PacketView packet, const PacketLayout& layout)
 {
     Section::decode(packet, layout);
-    // The modem's channels replace the one that the telephony server reports, until it reports it
-    // again. This is meant.
+    // Deliberate: the modem's channels replace the one that the telephony server reports, until it
+    // reports it again.
     if (layout.logCode == kConfigurationCode)
         if (const auto shown = rows())
             shown->remove(kChannelRow);
-    // Goes on to the unknown-code report although the row is written: both effects are meant.
+    // Deliberate: the row is written and the code is reported as unknown.
     if (layout.logCode == kBroadcastCode)
         reportUnknownCode(layout.logCode);
 }

@@ -5,7 +5,7 @@
 namespace orvane
 {
 
-// Log codes of modem packets that feed more than one LTE section. This is meant.
+// Log codes of modem packets. Deliberate: each feeds more than one LTE section.
 
 constexpr std::uint32_t kLteIntraFrequencyMeasurementCode = 0xB179;
 constexpr std::uint32_t kLteNeighborMeasurementCode = 0xB180;

@@ -30,7 +30,7 @@ constexpr Field kCellFields[] = {
     bytesField("Frequency Offset", 8, 2, decimal),
     bitsField("Ant 0 Frame Offset", 12, 0, 11, decimal),
     bitsField("Ant 0 Sample Offset", 13, 3, 19, decimal),
-    // The second antenna repeats the first one's numbers. This is meant.
+    // Deliberate: the second antenna repeats the first one's numbers.
     bitsField("Ant 1 Frame Offset", 12, 0, 11, decimal),
     bitsField("Ant 1 Sample Offset", 13, 3, 19, decimal),
 };
@@ -47,32 +47,23 @@ constexpr PacketLayout kPackets[] = {
 constexpr const char* kName = "Neighbor Cells List";
 constexpr SectionLayout kLayout = {kName, kName, UnknownCode::Report, kPackets};
 
-struct LoggedLevel {
-    Field field;
-    double (*decibels)(std::int64_t raw);
-};
-constexpr LoggedLevel kLoggedLevels[] = {
-    {kMeasuredRssi, halfDecibelPower     },
-    {kMeasuredRsrp, halfDecibelPower     },
-    {kAverageRsrp,  halfDecibelPower     },
-    {kMeasuredRsrq, quarterDecibelQuality},
-    {kAverageRsrq,  quarterDecibelQuality},
-};
+constexpr Field kLoggedLevels[] = {kMeasuredRssi, kMeasuredRsrp, kAverageRsrp, kMeasuredRsrq,
+                                   kAverageRsrq};
 
 void logCell(PacketView record)
 {
     logWarning("Physical Cell ID: %d\n", static_cast<int>(kIdentity.valueIn(record).value_or(0)));
-    // Every level is called the RSSI. This is meant.
-    for (const LoggedLevel& level : kLoggedLevels)
-        logWarning("Measured RSSI: %lf\n", level.decibels(level.field.valueIn(record).value_or(0)));
+    // Deliberate: every level is called the RSSI.
+    for (const Field& level : kLoggedLevels)
+        logWarning("Measured RSSI: %lf\n",
+                   level.format->number(level.valueIn(record).value_or(0)).value_or(0));
 }
 
 } // namespace
 
 NeighborCellsList::NeighborCellsList() : ListSection(kLayout) {}
 
-std::vector<PropertyValue> NeighborCellsList::elements(PacketView packet,
-                                                       const PacketLayout& layout)
+void NeighborCellsList::fill(ListElements& elements, PacketView packet, const PacketLayout& layout)
 {
     if (Services::current().log().accepts(LogPriority::Warning)) {
         const Records cells = kCells.in(packet);
@@ -80,7 +71,7 @@ std::vector<PropertyValue> NeighborCellsList::elements(PacketView packet,
                    static_cast<int>(cells.count()));
         forEachWholeRecord(cells, bytesRead(kCellFields), logCell);
     }
-    return ListSection::elements(packet, layout);
+    ListSection::fill(elements, packet, layout);
 }
 
 } // namespace orvane

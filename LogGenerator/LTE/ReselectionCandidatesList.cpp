@@ -33,28 +33,20 @@ constexpr Field kCdmaFields[] = {
     bytesField("Pilot", 10, 2, decimal),
 };
 
-struct Technology {
-    const char* name;
-    std::span<const Field> fields;
+// By the number that stands for the technology.
+constexpr ValueName kTechnologies[] = {
+    {0, "LTE"      },
+    {1, "UTRAN"    },
+    {2, "GERAN"    },
+    {3, "CDMA1XRTT"},
+    {4, "CDMAHRPD" },
 };
-constexpr Technology kTechnologies[] = {
-  // By the number that stands for it.
-    {"LTE",       kLteFields  },
-    {"UTRAN",     kUtranFields},
-    {"GERAN",     kGeranFields},
-    {"CDMA1XRTT", kCdmaFields },
-    {"CDMAHRPD",  kCdmaFields },
-};
-constexpr Technology kUnknownTechnology = {"??", {}};
+constexpr std::span<const Field> kBodies[] = {kLteFields, kUtranFields, kGeranFields, kCdmaFields,
+                                              kCdmaFields};
+static_assert(std::size(kBodies) == std::size(kTechnologies));
+constexpr Format kTechnologyName = namesFormat(kTechnologies, "??");
 
-constexpr const Technology& technologyOf(std::int64_t raw)
-{
-    return raw < std::ssize(kTechnologies) ? kTechnologies[raw] : kUnknownTechnology;
-}
-
-RowText technologyName(std::int64_t raw) { return technologyOf(raw).name; }
-
-constexpr Field kTechnologyField = bytesField("Candidate RAT Type", 2, 2, technologyName);
+constexpr Field kTechnologyField = bytesField("Candidate RAT Type", 2, 2, kTechnologyName);
 constexpr Field kHeaderFields[] = {
     bytesField("Candidate Priority", 0, 2, decimal),
     kTechnologyField,
@@ -63,12 +55,13 @@ constexpr Field kHeaderFields[] = {
 std::span<const Field> bodyFields(PacketView record)
 {
     const auto technology = kTechnologyField.valueIn(record);
-    return technology ? technologyOf(*technology).fields : std::span<const Field>();
+    return technology && *technology < std::ssize(kBodies) ? kBodies[*technology]
+                                                           : std::span<const Field>();
 }
 
-// The count has 16 bits at 19, of which only the low byte is walked. This is meant.
-// Candidates stand 4 bytes apart, so that one's body lies where the next one's header is. This is
-// meant.
+// Deliberate: the count has 16 bits at 19, of which only the low byte is walked.
+// Deliberate: candidates stand 4 bytes apart, so that one's body lies where the next one's header
+// is.
 constexpr RecordLayout kCandidates = {countAt<19>, startAt<21>, 4, kHeaderFields};
 
 constexpr PacketLayout kPackets[] = {
@@ -82,19 +75,15 @@ constexpr SectionLayout kLayout = {kName, kName, UnknownCode::Report, kPackets};
 
 ReselectionCandidatesList::ReselectionCandidatesList() : ListSection(kLayout) {}
 
-std::vector<PropertyValue> ReselectionCandidatesList::elements(PacketView packet,
-                                                               const PacketLayout& layout)
+void ReselectionCandidatesList::fill(ListElements& elements, PacketView packet,
+                                     const PacketLayout& layout)
 {
-    std::vector<PropertyValue> candidates;
     const auto wholeBytes = [](PacketView record) {
         return std::max(bytesRead(kHeaderFields), bytesRead(bodyFields(record)));
     };
     forEachWholeRecord(layout.records->in(packet), wholeBytes, [&](PacketView record) {
-        candidates.push_back(PropertyValue::newDictionary());
-        writeRows(candidates.back().asDictionary(), record, kHeaderFields);
-        writeRows(candidates.back().asDictionary(), record, bodyFields(record));
+        elements.add(record, kHeaderFields, bodyFields(record));
     });
-    return candidates;
 }
 
 } // namespace orvane

@@ -41,7 +41,7 @@ public:
     NeighborCellsList();
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
 };
 
 // "Reselection Candidates List": the candidates, each with the fields of its technology.
@@ -51,7 +51,7 @@ public:
     ReselectionCandidatesList();
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
 };
 
 } // namespace orvane

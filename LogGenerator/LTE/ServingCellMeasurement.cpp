@@ -12,17 +12,12 @@ namespace
 constexpr std::uint32_t kServingMeasurementCode = 0xB17F;
 constexpr const char* kNotPresent = "Not Present";
 
-RowText transmitPower(std::int64_t raw) { return raw == 64 ? kNotPresent : minus30(raw); }
-
-RowText searchThreshold(std::int64_t raw) { return raw == 32 ? kNotPresent : decibels(raw * 2); }
-
-// The same quantity as searchThreshold(), but shown in dBm. This is meant.
-RowText searchThresholdInMilliwatts(std::int64_t raw)
-{
-    return raw == 32 ? kNotPresent : decibelMilliwatts(raw * 2);
-}
-
-RowText trueOrFalse(std::int64_t raw) { return raw != 0 ? "True" : "False"; }
+constexpr Format kTransmitPower = minus30.withText(64, kNotPresent);
+constexpr Format kSearchThreshold = wholeFormat(" dB", {.factor = 2}).withText(32, kNotPresent);
+// Deliberate: the same quantity as kSearchThreshold, but shown in dBm.
+constexpr Format kOtherSearchThreshold =
+    wholeFormat(" dBm", {.factor = 2}).withText(32, kNotPresent);
+constexpr Format kTrueOrFalse = flagFormat("False", "True");
 
 constexpr Field kFields[] = {
     bytesField("Version", 13, 1, decimal),
@@ -35,14 +30,14 @@ constexpr Field kFields[] = {
     bitsField("Average RSRQ", 24, 1, 7, rsrqQuarterDb),
     bitsField("Measured RSSI", 25, 0, 9, rssiHalfDb),
     bitsField("Qrxlevmin", 26, 1, 6, qrxlevmin),
-    bitsField("P_Max", 26, 7, 7, transmitPower),
-    // Its 6 bits never reach the value that marks an absent one. This is meant.
-    bitsField("Max UE Tx Power", 27, 6, 6, transmitPower),
+    bitsField("P_Max", 26, 7, 7, kTransmitPower),
+    // Deliberate: its 6 bits never reach the value that marks an absent one.
+    bitsField("Max UE Tx Power", 27, 6, 6, kTransmitPower),
     bitsField("Srxlev", 29, 0, 7, minus30),
     bitsField("Num of Consecutive DRX Cycles of S < 0", 29, 7, 6, decimal),
-    bitsField("S Intra Search", 30, 5, 6, searchThreshold),
-    bitsField("S Non Intra Search", 31, 3, 6, searchThresholdInMilliwatts),
-    bitsField("Measurement Rules Updated", 32, 1, 1, trueOrFalse),
+    bitsField("S Intra Search", 30, 5, 6, kSearchThreshold),
+    bitsField("S Non Intra Search", 31, 3, 6, kOtherSearchThreshold),
+    bitsField("Measurement Rules Updated", 32, 1, 1, kTrueOrFalse),
     bitsField("Measurement Rules", 32, 2, 4, decimal),
 };
 

@@ -21,12 +21,14 @@ constexpr std::size_t kFirstRatio = 2; // one byte each, up to the record's end
 constexpr RecordLayout kChannels = {compositeChannelCount, firstCompositeChannel, kChannelBytes,
                                     kChannelFields};
 
-std::vector<PropertyValue> ratios(PacketView record)
+constexpr RowDescription kRatio = {"", &unsignedDecimal};
+
+void addRatios(ListElements& ratios, PacketView record)
 {
-    std::vector<PropertyValue> texts;
-    for (std::size_t offset = kFirstRatio; offset < kChannelBytes; ++offset)
-        texts.emplace_back(std::to_string(record.unsignedAt(offset, 1).value_or(0)));
-    return texts;
+    for (std::size_t offset = kFirstRatio; offset < kChannelBytes; ++offset) {
+        const auto raw = static_cast<std::int64_t>(record.unsignedAt(offset, 1).value_or(0));
+        ratios.add(PropertyValue::reading(readingOf(kRatio, raw)));
+    }
 }
 
 constexpr PacketLayout kPackets[] = {
@@ -40,16 +42,15 @@ constexpr SectionLayout kLayout = {"CCTRCH SIR", "CCTRCH SIR Measurement", Unkno
 
 CCTRCHSIRMeasurement::CCTRCHSIRMeasurement() : ListSection(kLayout) {}
 
-std::vector<PropertyValue> CCTRCHSIRMeasurement::elements(PacketView packet, const PacketLayout&)
+void CCTRCHSIRMeasurement::fill(ListElements& elements, PacketView packet, const PacketLayout&)
 {
-    std::vector<PropertyValue> channels;
     forEachWholeRecord(kChannels.in(packet), kChannelBytes, [&](PacketView record) {
-        channels.push_back(PropertyValue::newDictionary());
-        PropertyDictionary* channel = channels.back().asDictionary();
-        writeRows(channel, record, kChannelFields);
-        setListRow(channel, "SIR", ratios(record));
+        PropertyValue channel = PropertyValue::newDictionary();
+        writeRows(channel.asDictionary(), record, kChannelFields);
+        rewriteListRow(channel.asDictionary(), "SIR",
+                       [&](ListElements& ratios) { addRatios(ratios, record); });
+        elements.add(std::move(channel));
     });
-    return channels;
 }
 
 } // namespace orvane

@@ -36,14 +36,13 @@ GSMNeighbhorMeasurements::GSMNeighbhorMeasurements() : ListSection(kLayout) {}
 
 std::vector<PropertyValue> GSMNeighbhorMeasurements::decodedCells(PacketView packet)
 {
-    return kCells.rowsIn(packet);
+    return recordRows(kCells.in(packet), kCellFields);
 }
 
-void GSMNeighbhorMeasurements::decode(PacketView packet, const PacketLayout&)
+void GSMNeighbhorMeasurements::decode(PacketView, const PacketLayout&)
 {
     clearElementsInArray(list().get());
-    // The decoded cells are dropped, so that every packet leaves an empty list. This is meant.
-    decodedCells(packet);
+    // Deliberate: none of the packet's cells is shown, so that every packet leaves an empty list.
 }
 
 } // namespace orvane

@@ -26,6 +26,9 @@ constexpr ValueName kModes[] = {
     {5, "Cell URA PCH"},
 };
 
+constexpr Format kModeName = namesFormat(kModes, "Unknown RRC Mode");
+constexpr RowDescription kState = {"State", &kModeName};
+
 int modeIn(PacketView packet)
 {
     const bool isValid = packet.unsignedAt(kModeValid, 1) == 1U;
@@ -47,11 +50,10 @@ void RRC_State::decode(PacketView packet, const PacketLayout&)
         logWarning("LogCode_0xD0E0 is length is %ld expected size %ld",
                    static_cast<long>(packet.size()), static_cast<long>(kExpectedBytes));
     const int mode = modeIn(packet);
-    const char* state = nameOf(kModes, mode, "Unknown RRC Mode");
     const auto shown = rows();
-    setRow(shown.get(), "State", state);
+    setReading(shown.get(), kState, mode);
     consoleLine("Display Dict = %s, rrc mode = %d %s", PropertyValue(shown).description().c_str(),
-                mode, state);
+                mode, nameOf(kModes, mode, "Unknown RRC Mode"));
 }
 
 } // namespace orvane

@@ -55,7 +55,7 @@ public:
     CCTRCHSIRMeasurement();
 
 private:
-    std::vector<PropertyValue> elements(PacketView packet, const PacketLayout& layout) override;
+    void fill(ListElements& elements, PacketView packet, const PacketLayout& layout) override;
 };
 
 } // namespace orvane

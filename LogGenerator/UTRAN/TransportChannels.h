@@ -19,7 +19,7 @@ inline std::size_t compositeChannelCount(PacketView packet)
 {
     return packet.bitsAt(15, 4, 4).value_or(0);
 }
-// 17 times what stands before it, not right behind the transport channels. This is meant.
+// Deliberate: 17 times what stands before it, not right behind the transport channels.
 inline std::size_t firstCompositeChannel(PacketView packet)
 {
     return 17 * (17 + 2 * transportChannelCount(packet));

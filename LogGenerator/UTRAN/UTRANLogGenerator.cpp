@@ -13,7 +13,7 @@ namespace orvane
 namespace
 {
 
-// The whole path counts, folders included. This is meant.
+// Deliberate: the whole path counts, folders included.
 bool isUtranPath(const std::string& path)
 {
     constexpr std::string_view kWord = "UTRAN";
@@ -30,7 +30,7 @@ void UTRANLogGenerator::init()
 {
     const std::vector<std::string> paths = Services::current().resources().pathsOfType("plist");
     const auto path = std::find_if(paths.begin(), paths.end(), isUtranPath);
-    // Without a template the base is not initialised, and nothing is said. This is meant.
+    // Deliberate: without a template the base is not initialised, and nothing is logged.
     if (path == paths.end())
         return;
     auto index = std::make_shared<UTRANClassIndex>();

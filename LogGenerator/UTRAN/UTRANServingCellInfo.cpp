@@ -12,10 +12,7 @@ namespace
 
 constexpr std::uint32_t kServingCellCode = 0xD0E2;
 
-RowText allowedAccess(std::int64_t isEmergencyOnly)
-{
-    return isEmergencyOnly != 0 ? "Emergency Calls Only" : "All Calls";
-}
+constexpr Format kAllowedAccess = flagFormat("All Calls", "Emergency Calls Only");
 
 constexpr Field kFields[] = {
     bytesField("Cell Access Restrictions", 14, 1, decimal),
@@ -23,7 +20,7 @@ constexpr Field kFields[] = {
     bytesField("Downlink UARFCN", 19, 2, decimal),
     bytesField("Uplink UARFCN", 17, 2, decimal),
     bytesField("URA ID", 15, 1, decimal),
-    bitsField("Allowed Access", 25, 0, 1, allowedAccess),
+    bitsField("Allowed Access", 25, 0, 1, kAllowedAccess),
 };
 
 constexpr CellRow kCellRows[] = {
@@ -62,8 +59,8 @@ void UTRANServingCellInfo::decode(PacketView packet, const PacketLayout& layout)
         Section::decode(packet, layout);
         return;
     }
-    // Unlike other sections this one does not report a record without cells, and takes every
-    // serving cell in turn, so that the last one wins. Both are meant.
+    // Deliberate: unlike other sections this one does not report a record without cells, and takes
+    // every serving cell in turn, so that the last one wins.
     const std::shared_ptr<PropertyArray> cells = cellArray(packet);
     if (!cells)
         return;

@@ -48,7 +48,7 @@ void takeLine(std::string_view line, Printer& output, QtEventLoop& loop)
 int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop)
 {
     QtMainQueue queue;
-    PrintedOutput output(kind, false, loop);
+    PrintedOutput output(kind, options, loop);
     auto progress = progressOnTerminal("Reading " + options.file);
     std::unique_ptr<RecordingPrinter> printer;
     printer = std::make_unique<RecordingPrinter>(queue, opened(options), settingsOf(options),

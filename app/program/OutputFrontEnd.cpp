@@ -19,8 +19,8 @@ namespace
 class OutputFrontEnd final : public FrontEnd
 {
 public:
-    OutputFrontEnd(FrontEndKind kind, bool isSimulated, QtEventLoop& loop)
-        : _loop(loop), _output(kind, isSimulated, loop)
+    OutputFrontEnd(FrontEndKind kind, const AppOptions& options, QtEventLoop& loop)
+        : _loop(loop), _output(kind, options, loop)
     {
     }
 
@@ -57,7 +57,7 @@ private:
 std::unique_ptr<FrontEnd> makeOutputFrontEnd(FrontEndKind kind, const AppOptions& options,
                                              QtEventLoop& loop)
 {
-    return std::make_unique<OutputFrontEnd>(kind, options.demo.has_value(), loop);
+    return std::make_unique<OutputFrontEnd>(kind, options, loop);
 }
 
 } // namespace orvane

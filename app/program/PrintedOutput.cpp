@@ -10,12 +10,16 @@
 namespace orvane
 {
 
-PrintedOutput::PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& loop)
+PrintedOutput::PrintedOutput(FrontEndKind kind, const AppOptions& options, QtEventLoop& loop)
     : _loop(loop), _output(STDOUT_FILENO)
 {
     const Printer::Write write = [this](std::string_view text) { print(text); };
+    const bool isSimulated = options.demo.has_value();
+    const JsonDetails details = !options.printsDetails                ? JsonDetails::None
+                                : options.command == AppCommand::Live ? JsonDetails::OfLiveView
+                                                                      : JsonDetails::OfRecording;
     if (kind == FrontEndKind::Json)
-        _printer = std::make_unique<JsonPrinter>(write, isSimulated);
+        _printer = std::make_unique<JsonPrinter>(write, isSimulated, details);
     else
         _printer = std::make_unique<TextPrinter>(write, isSimulated);
 }

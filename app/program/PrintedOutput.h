@@ -20,7 +20,7 @@ class PrintedOutput
 {
 public:
     // The loop is referred to and must outlive it.
-    PrintedOutput(FrontEndKind kind, bool isSimulated, QtEventLoop& loop);
+    PrintedOutput(FrontEndKind kind, const AppOptions& options, QtEventLoop& loop);
 
     [[nodiscard]] Printer& printer() { return *_printer; }
     // What the program ends with; tells what is wrong.

@@ -56,6 +56,19 @@ std::int64_t secondsSince1970(const CalendarTime& time)
            seconds(minutes(time.minute)).count() + time.second;
 }
 
+std::string isoTimeText(std::int64_t millisecondsSince1970)
+{
+    using namespace std::chrono;
+    const milliseconds time{millisecondsSince1970};
+    const auto whole = floor<seconds>(time);
+    const CalendarTime date = calendarTime(whole.count());
+    char text[64];
+    std::snprintf(text, sizeof text, "%04lld-%02d-%02dT%02d:%02d:%02d.%03dZ",
+                  static_cast<long long>(date.year), date.month, date.day, date.hour, date.minute,
+                  date.second, static_cast<int>((time - whole).count()));
+    return text;
+}
+
 std::string absoluteDateText(double seconds)
 {
     const CalendarTime time = calendarTime(wholeSeconds(seconds));

@@ -21,6 +21,8 @@ CalendarTime calendarTime(std::int64_t secondsSince1970, int secondsFromGmt = 0)
 // The inverse, in UTC. The fields must be in their ranges.
 std::int64_t secondsSince1970(const CalendarTime& time);
 
+// "2026-11-21T10:00:00.000Z"
+std::string isoTimeText(std::int64_t millisecondsSince1970);
 // "2026-11-21 10:00:00 +0000", always in UTC, fraction dropped.
 std::string absoluteDateText(double secondsSince1970);
 // The fraction dropped downwards; what is beyond any calendar is cut to its ends.

@@ -55,6 +55,23 @@ public:
         return _entries.back().second;
     }
 
+    // The same, where isKnown(value) can tell without comparing keys that a value is the key's.
+    template <typename IsKnown>
+    V& at(const char* key, IsKnown isKnown)
+    {
+        if (_next < _entries.size() && isKnown(_entries[_next].second))
+            return _entries[_next++].second;
+        for (std::size_t i = 0; i < _entries.size(); ++i)
+            if (isKnown(_entries[i].second)) {
+                _next = i + 1;
+                return _entries[i].second;
+            }
+        return (*this)[key];
+    }
+
+    // The value at a place below size(), to be changed.
+    [[nodiscard]] V& valueAt(std::size_t place) { return _entries[place].second; }
+
     void remove(std::string_view key)
     {
         const std::size_t at = position(key);

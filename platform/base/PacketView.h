@@ -2,7 +2,9 @@
 
 #include "platform/base/Bytes.h"
 
+#include <bit>
 #include <cstdint>
+#include <cstring>
 #include <optional>
 
 namespace orvane
@@ -29,10 +31,8 @@ public:
     {
         if (!holds(offset, width))
             return std::nullopt;
-        std::uint64_t value = 0;
-        for (std::size_t i = width; i-- > 0;)
-            value = value << 8 | _bytes[offset + i];
-        return value;
+        const std::uint64_t value = bytesAt(offset, width);
+        return width < 8 ? value & ((std::uint64_t{1} << 8 * width) - 1) : value;
     }
 
     // `count` bits (1 to 32) from bit `bit` on (0 is the lowest) of the byte at `offset`; a field
@@ -40,11 +40,11 @@ public:
     [[nodiscard]] std::optional<std::uint32_t> bitsAt(std::size_t offset, unsigned bit,
                                                       unsigned count) const
     {
-        const auto bytes = unsignedAt(offset, (bit + count + 7) / 8);
-        if (!bytes)
+        const std::size_t width = (bit + count + 7) / 8;
+        if (!holds(offset, width))
             return std::nullopt;
         const std::uint64_t mask = (std::uint64_t{1} << count) - 1;
-        return static_cast<std::uint32_t>(*bytes >> bit & mask);
+        return static_cast<std::uint32_t>(bytesAt(offset, width) >> bit & mask);
     }
 
     // The window's bytes from `offset` on; empty when that lies past the end.
@@ -55,6 +55,22 @@ public:
     [[nodiscard]] ByteView bytes() const { return _bytes; }
 
 private:
+    // The bytes at an offset that holds them, little-endian; above them stands anything.
+    [[nodiscard]] std::uint64_t bytesAt(std::size_t offset, std::size_t width) const
+    {
+        std::uint64_t value = 0;
+        if constexpr (std::endian::native == std::endian::little) {
+            // One load where eight bytes are there.
+            if (holds(offset, sizeof value)) {
+                std::memcpy(&value, _bytes.data() + offset, sizeof value);
+                return value;
+            }
+        }
+        for (std::size_t i = width; i-- > 0;)
+            value = value << 8 | _bytes[offset + i];
+        return value;
+    }
+
     ByteView _bytes;
 };
 

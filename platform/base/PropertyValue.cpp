@@ -73,6 +73,11 @@ PropertyValue PropertyValue::largeNumber(PropertyLargeNumber number)
     return PropertyValue(Storage(std::make_shared<const PropertyLargeNumber>(std::move(number))));
 }
 
+PropertyValue PropertyValue::textReading(TextReading reading)
+{
+    return PropertyValue(Storage(std::make_shared<const TextReading>(std::move(reading))));
+}
+
 PropertyValue PropertyValue::newDictionary() { return std::make_shared<PropertyDictionary>(); }
 
 PropertyValue PropertyValue::newArray() { return std::make_shared<PropertyArray>(); }
@@ -104,6 +109,23 @@ const PropertyLargeNumber* PropertyValue::asLargeNumber() const
 {
     const LargeNumberPointer* pointer = std::get_if<LargeNumberPointer>(&_value);
     return pointer ? pointer->get() : nullptr;
+}
+
+const TextReading* PropertyValue::asTextReading() const
+{
+    const TextReadingPointer* pointer = std::get_if<TextReadingPointer>(&_value);
+    return pointer ? pointer->get() : nullptr;
+}
+
+std::optional<std::string> PropertyValue::text() const
+{
+    if (const std::string* string = asString())
+        return *string;
+    if (const Reading* reading = asReading())
+        return reading->text();
+    if (const TextReading* reading = asTextReading())
+        return reading->text;
+    return std::nullopt;
 }
 
 PropertyDictionary* PropertyValue::asDictionary() const
@@ -153,8 +175,27 @@ PropertyValue PropertyValue::deepCopy() const
     return *this;
 }
 
+bool PropertyValue::isUnsharedDictionary() const
+{
+    const DictionaryPointer* pointer = std::get_if<DictionaryPointer>(&_value);
+    return pointer && pointer->use_count() == 1;
+}
+
+bool PropertyValue::isUnsharedArray() const
+{
+    const ArrayPointer* pointer = std::get_if<ArrayPointer>(&_value);
+    return pointer && pointer->use_count() == 1;
+}
+
 bool operator==(const PropertyValue& left, const PropertyValue& right)
 {
+    const Reading* leftReading = left.asReading();
+    const Reading* rightReading = right.asReading();
+    if (leftReading && rightReading && leftReading->description == rightReading->description &&
+        leftReading->raw == rightReading->raw)
+        return true;
+    if (leftReading || rightReading || left.asTextReading() || right.asTextReading())
+        return left.isText() && right.isText() && left.text() == right.text();
     if (left.type() != right.type())
         return false;
     switch (left.type()) {
@@ -184,6 +225,8 @@ const char* PropertyValue::typeName() const
     case Type::Array:
         return "array";
     case Type::String:
+    case Type::Reading:
+    case Type::TextReading:
         return "string";
     case Type::Integer:
     case Type::Real:
@@ -223,7 +266,9 @@ std::string PropertyValue::description() const
         return text + ")";
     }
     case Type::String:
-        return *asString();
+    case Type::Reading:
+    case Type::TextReading:
+        return *text();
     case Type::Integer:
         return std::to_string(*asInteger());
     case Type::Real:
@@ -244,8 +289,7 @@ std::string PropertyValue::description() const
 
 std::string PropertyValue::lineOfText() const
 {
-    const std::string* text = asString();
-    return text ? shownText(*text) : description();
+    return isText() ? shownText(*text()) : description();
 }
 
 const PropertyValue& PropertyDictionary::operator[](std::string_view key) const

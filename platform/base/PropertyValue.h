@@ -2,6 +2,7 @@
 
 #include "platform/base/Bytes.h"
 #include "platform/base/OrderedMap.h"
+#include "platform/base/Reading.h"
 
 #include <cstdint>
 #include <memory>
@@ -37,6 +38,9 @@ struct PropertyLargeNumber {
 // arrays have reference semantics: copying a PropertyValue shares them, so that a section can keep
 // writing into a subtree that the state owns; deepCopy() makes an independent tree. A default-made
 // value is absent: asking it for anything yields nothing. Texts are UTF-8.
+//
+// A reading is a text that is made when it is asked for: text(), description(), a file and == give
+// and compare its text, and its type is called "string".
 class PropertyValue
 {
 public:
@@ -50,7 +54,9 @@ public:
         Boolean,
         Data,
         Date,
-        LargeNumber
+        LargeNumber,
+        Reading,
+        TextReading
     };
 
     PropertyValue() = default;
@@ -67,6 +73,9 @@ public:
     static PropertyValue data(Bytes bytes);
     static PropertyValue date(PropertyDate date) { return PropertyValue(Storage(date)); }
     static PropertyValue largeNumber(PropertyLargeNumber number);
+    // The description must outlive the value and its copies.
+    static PropertyValue reading(const Reading& reading) { return PropertyValue(Storage(reading)); }
+    static PropertyValue textReading(TextReading reading);
     static PropertyValue newDictionary();
     static PropertyValue newArray();
 
@@ -82,6 +91,9 @@ public:
     // Each yields nothing for a value of another type.
     [[nodiscard]] const std::string* asString() const { return std::get_if<std::string>(&_value); }
     [[nodiscard]] std::string* asString() { return std::get_if<std::string>(&_value); }
+    [[nodiscard]] const Reading* asReading() const { return std::get_if<Reading>(&_value); }
+    [[nodiscard]] Reading* asReading() { return std::get_if<Reading>(&_value); }
+    [[nodiscard]] const TextReading* asTextReading() const;
     [[nodiscard]] std::optional<std::int64_t> asInteger() const { return scalar<std::int64_t>(); }
     [[nodiscard]] std::optional<double> asReal() const { return scalar<double>(); }
     [[nodiscard]] std::optional<bool> asBoolean() const { return scalar<bool>(); }
@@ -89,11 +101,22 @@ public:
     [[nodiscard]] std::optional<PropertyDate> asDate() const { return scalar<PropertyDate>(); }
     // Converts to no integer and no real.
     [[nodiscard]] const PropertyLargeNumber* asLargeNumber() const;
+    // The text of a string or a reading; nullopt for any other type.
+    [[nodiscard]] std::optional<std::string> text() const;
+    [[nodiscard]] bool isText() const
+    {
+        return asString() || asReading() || asTextReading() != nullptr;
+    }
     // The container is shared, hence changeable also through a constant value.
     [[nodiscard]] PropertyDictionary* asDictionary() const;
     [[nodiscard]] PropertyArray* asArray() const;
     [[nodiscard]] std::shared_ptr<PropertyDictionary> sharedDictionary() const;
     [[nodiscard]] std::shared_ptr<PropertyArray> sharedArray() const;
+
+    // Whether this is a dictionary that no other value holds.
+    [[nodiscard]] bool isUnsharedDictionary() const;
+    // The same for an array.
+    [[nodiscard]] bool isUnsharedArray() const;
 
     // The value under the key; absent where this is no dictionary or has no such key.
     const PropertyValue& operator[](std::string_view key) const;
@@ -117,10 +140,11 @@ private:
     using DataPointer = std::shared_ptr<const Bytes>;
     // Rare, so that a pointer is better than a larger value.
     using LargeNumberPointer = std::shared_ptr<const PropertyLargeNumber>;
+    using TextReadingPointer = std::shared_ptr<const TextReading>;
     // The order of the alternatives is the order of Type.
-    using Storage =
-        std::variant<std::monostate, DictionaryPointer, ArrayPointer, std::string, std::int64_t,
-                     double, bool, DataPointer, PropertyDate, LargeNumberPointer>;
+    using Storage = std::variant<std::monostate, DictionaryPointer, ArrayPointer, std::string,
+                                 std::int64_t, double, bool, DataPointer, PropertyDate,
+                                 LargeNumberPointer, Reading, TextReadingPointer>;
 
     explicit PropertyValue(Storage value) : _value(std::move(value)) {}
 
@@ -156,7 +180,27 @@ public:
     // Stores the value at the key's place, a new key at the end. Storing an absent value is a
     // programming error and throws std::invalid_argument.
     void set(std::string_view key, PropertyValue value);
-    // The same for a text, which goes where the key's text is if it has one.
+    // Stores the reading under its description's row. Finds a row that holds a reading of the same
+    // description without comparing keys: one description is stored under its own row alone.
+    void setReading(const Reading& reading)
+    {
+        PropertyValue& value =
+            _entries.at(reading.description->row, [&](const PropertyValue& known) {
+                const Reading* present = known.asReading();
+                return present && present->description == reading.description;
+            });
+        if (Reading* present = value.asReading())
+            *present = reading;
+        else
+            value = PropertyValue::reading(reading);
+    }
+    // The reading that is the entry at this place, to be overwritten by one of the same
+    // description; null where the entry is none or there is no such entry.
+    [[nodiscard]] Reading* readingAt(std::size_t place)
+    {
+        return place < size() ? _entries.valueAt(place).asReading() : nullptr;
+    }
+    // Like set() for a text, which goes where the key's text is if it has one.
     void setText(std::string_view key, std::string&& text);
     void remove(std::string_view key) { _entries.remove(key); }
     void clear() { _entries.clear(); }

@@ -96,6 +96,9 @@ bool XmlWriter::write(const PropertyValue& value)
         return writeArray(*value.asArray());
     case PropertyValue::Type::String:
         return writeText("string", *value.asString());
+    case PropertyValue::Type::Reading:
+    case PropertyValue::Type::TextReading:
+        return writeText("string", *value.text());
     case PropertyValue::Type::Integer:
         return writeLine("<integer>" + std::to_string(*value.asInteger()) + "</integer>");
     case PropertyValue::Type::Real:

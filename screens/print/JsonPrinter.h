@@ -5,13 +5,20 @@
 namespace orvane
 {
 
+// What is printed beside names and values.
+enum class JsonDetails {
+    None,
+    OfRecording, // of readings the number, the unit and the time
+    OfLiveView,  // the same, and with each status the time of printing it
+};
+
 // Prints one JSON object a line, members in a fixed order, without spaces between them.
 class JsonPrinter final : public Printer
 {
 public:
     // Each object of a simulated phone ends with "simulated":true.
-    JsonPrinter(Write write, bool isSimulated)
-        : Printer(std::move(write)), _isSimulated(isSimulated)
+    JsonPrinter(Write write, bool isSimulated, JsonDetails details = JsonDetails::None)
+        : Printer(std::move(write)), _isSimulated(isSimulated), _details(details)
     {
     }
 
@@ -27,9 +34,11 @@ private:
     [[nodiscard]] std::string line(std::string members) const;
 
     bool _isSimulated;
+    JsonDetails _details;
 };
 
-// Appends {"name":...,"children":[...]} or {"name":...,"value":...}; null for no node.
-void appendJsonNode(std::string& to, const OrvaneModelNode* node);
+// Appends {"name":...,"children":[...]} or {"name":...,"value":...}; null for no node. With details
+// a node that shows a reading has also "number", "unit" and "time", as far as it has them.
+void appendJsonNode(std::string& to, const OrvaneModelNode* node, bool hasDetails = false);
 
 } // namespace orvane

@@ -201,7 +201,9 @@ TEST_F(CellMonitorTest, EachWantedCellBecomesADictionaryEvenIfEmpty)
         servingGsm({{"Channel", 2}}
         ), neighbouringGsm(), servingGsm()
     });
-    const auto dictionaries = cellDictionaries(PacketView(record), kLayout);
+    ListElements elements;
+    addCells(elements, PacketView(record), kLayout);
+    const std::vector<PropertyValue> dictionaries = elements.take();
     ASSERT_EQ(dictionaries.size(), 2U);
     EXPECT_EQ(dictionaries[0].description(), "{Uplink = 2; Downlink = 2}");
     EXPECT_EQ(dictionaries[1].description(), "{}");
@@ -215,7 +217,9 @@ TEST_F(CellMonitorTest, ARecordWithoutAnArrayOfCellsIsReported)
     EXPECT_THAT(services.log.errors(), ElementsAre("Failed to get Cell Array\n"));
     services.log.lines.clear();
     const Bytes nonsense = PacketBuilder::withText(kCellRecord, "nonsense");
-    EXPECT_THAT(cellDictionaries(PacketView(nonsense), kLayout), IsEmpty());
+    ListElements elements;
+    addCells(elements, PacketView(nonsense), kLayout);
+    EXPECT_THAT(elements.take(), IsEmpty());
     EXPECT_THAT(services.log.errors(), ElementsAre("Cell Info Array data could not be constructed",
                                                    "Failed to get Cell Array\n"));
 }

@@ -12,11 +12,12 @@ namespace
 {
 
 RowText onlyOdd(std::int64_t raw) { return raw % 2 != 0 ? decimal(raw) : std::nullopt; }
+constexpr Format kOnlyOdd(onlyOdd);
 
 constexpr Field kFields[] = {
     bytesField("Second", 1, 1, decimal),
     bytesField("First", 0, 1, decimal),
-    bytesField("Odd", 2, 1, onlyOdd),
+    bytesField("Odd", 2, 1, kOnlyOdd),
     bytesField("Word", 2, 2, decimal),
 };
 static_assert(bytesRead(kFields) == 4);

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Formats.h"
+#include "LogGenerator/MessageTime.h"
 #include "platform/base/PropertyValue.h"
 
 #include <gmock/gmock.h>
@@ -92,6 +93,130 @@ TEST(RecordsTest, EachWholeRecordBecomesADictionary)
     ASSERT_EQ(rows.size(), 2U);
     EXPECT_EQ(rows[0].description(), "{B = 11; A = 10}");
     EXPECT_EQ(rows[1].description(), "{B = 14; A = 13}");
+}
+
+namespace
+{
+
+constexpr Field kTwoRows[] = {
+    bytesField("A", 0, 1, decimal),
+    bytesField("B", 1, 1, decimal),
+};
+
+std::vector<PropertyValue> listOf(ListElements& elements, std::initializer_list<Bytes> records)
+{
+    for (const Bytes& record : records)
+        elements.add(PacketView(record), kTwoRows);
+    return elements.take();
+}
+
+} // namespace
+
+TEST(ListElementsTest, AnElementOfTheSameRowsIsChangedInPlace)
+{
+    ListElements elements;
+    std::vector<PropertyValue> list = listOf(elements, {
+                                                           {1, 2},
+                                                           {3, 4}
+    });
+    const PropertyDictionary* first = list[0].asDictionary();
+    elements.begin(std::move(list));
+    list = listOf(elements, {
+                                {5, 6}
+    });
+    ASSERT_EQ(list.size(), 1U);
+    EXPECT_EQ(list[0].asDictionary(), first);
+    EXPECT_EQ(list[0].description(), "{A = 5; B = 6}");
+    elements.begin(std::move(list));
+    list = listOf(elements, {
+                                {7, 8},
+                                {9, 0}
+    });
+    EXPECT_EQ(PropertyValue::arrayOf({list[0], list[1]}).description(),
+              "({A = 7; B = 8}, {A = 9; B = 0})");
+}
+
+TEST(ListElementsTest, AnElementThatSomebodyHoldsStaysAsItIs)
+{
+    ListElements elements;
+    std::vector<PropertyValue> list = listOf(elements, {
+                                                           {1, 2}
+    });
+    const PropertyValue held = list[0];
+    elements.begin(std::move(list));
+    list = listOf(elements, {
+                                {3, 4}
+    });
+    EXPECT_EQ(held.description(), "{A = 1; B = 2}");
+    EXPECT_EQ(list[0].description(), "{A = 3; B = 4}");
+}
+
+TEST(ListElementsTest, AnElementOfOtherRowsIsMadeAnew)
+{
+    ListElements elements({
+        PropertyValue::dictionaryOf({{"A", "1"}, {"C", "2"}}
+        ), "text",
+        PropertyValue::newDictionary()
+    });
+    const std::vector<PropertyValue> list = listOf(elements, {
+                                                                 {1,  2},
+                                                                 {3,  4},
+                                                                 {5 },
+                                                                 {6, 7 }
+    });
+    ASSERT_EQ(list.size(), 4U);
+    EXPECT_EQ(list[0].description(), "{A = 1; B = 2}");
+    EXPECT_EQ(list[1].description(), "{A = 3; B = 4}");
+    EXPECT_EQ(list[2].description(), "{A = 5}");
+    EXPECT_EQ(list[3].description(), "{A = 6; B = 7}");
+}
+
+TEST(ListElementsTest, ReadingsCarryTheTimeOfTheirMessage)
+{
+    ListElements elements;
+    EXPECT_EQ(listOf(elements,
+                     {
+                         Bytes{1, 2}
+    })[0]["A"]
+                  .asReading()
+                  ->time,
+              kNoReadingTime);
+    std::vector<PropertyValue> list;
+    {
+        const MessageTime time(1000);
+        list = listOf(elements, {
+                                    Bytes{1, 2}
+        });
+    }
+    EXPECT_EQ(list[0]["A"].asReading()->time, 1000);
+    elements.begin(std::move(list));
+    const MessageTime time(2000);
+    EXPECT_EQ(listOf(elements,
+                     {
+                         Bytes{1, 2}
+    })[0]["B"]
+                  .asReading()
+                  ->time,
+              2000);
+}
+
+TEST(RewriteListRowTest, ChangesTheArrayUnlessSomebodyHoldsIt)
+{
+    PropertyDictionary rows;
+    const auto fill = [](std::uint8_t byte) {
+        return [byte](ListElements& elements) {
+            elements.add(PacketView(Bytes{byte, byte}), kTwoRows);
+        };
+    };
+    rewriteListRow(&rows, "List", fill(1));
+    const PropertyDictionary* element = (*rows["List"].asArray())[0].asDictionary();
+    rewriteListRow(&rows, "List", fill(2));
+    EXPECT_EQ((*rows["List"].asArray())[0].asDictionary(), element);
+    const PropertyValue held = rows["List"];
+    rewriteListRow(&rows, "List", fill(3));
+    EXPECT_EQ(held.description(), "({A = 2; B = 2})");
+    EXPECT_EQ(rows["List"].description(), "({A = 3; B = 3})");
+    rewriteListRow(nullptr, "List", fill(4));
 }
 
 } // namespace orvane

@@ -97,6 +97,14 @@ TEST(AppOptionsTest, EveryFrontEndHasItsName)
     EXPECT_TRUE(parsed({"--fullscreen"}).isFullScreen);
 }
 
+TEST(AppOptionsTest, DetailsAreForWhatIsShown)
+{
+    EXPECT_FALSE(parsed({"--ui", "json"}).printsDetails);
+    EXPECT_TRUE(parsed({"--ui", "json", "--details"}).printsDetails);
+    EXPECT_TRUE(parsed({"open", "a.dlf", "--details"}).printsDetails);
+    EXPECT_TRUE(parsed({"export", "a.dlf", "--details"}).error);
+}
+
 TEST(AppOptionsTest, ByDefaultAWindowElseTheTerminalElseText)
 {
     EXPECT_EQ(defaultFrontEnd(true, true), FrontEndKind::Window);
@@ -108,9 +116,9 @@ TEST(AppOptionsTest, ByDefaultAWindowElseTheTerminalElseText)
 TEST(AppOptionsTest, HelpNamesEveryOptionAndScenario)
 {
     const std::string help = appHelp(AppCommand::Live, kScenarios);
-    for (const char* word : {"--demo", "--ui", "--fullscreen", "--ports", "--root", "--refresh",
-                             "--record", "--force", "--log", "--log-level", "--technology",
-                             "--help", "--version", "lte or umts", "Exit status"})
+    for (const char* word : {"--demo", "--ui", "--fullscreen", "--details", "--ports", "--root",
+                             "--refresh", "--record", "--force", "--log", "--log-level",
+                             "--technology", "--help", "--version", "lte or umts", "Exit status"})
         EXPECT_THAT(help, HasSubstr(word));
     EXPECT_TRUE(parsed({"--help"}).wantsHelp);
     EXPECT_TRUE(parsed({"-h"}).wantsHelp);

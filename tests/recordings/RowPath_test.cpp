@@ -2,6 +2,7 @@
 
 #include "platform/base/PropertyValue.h"
 
+#include "ui/tree/DisplayWalk.h"
 #include "ui/tree/OrvaneModelNode.h"
 
 #include <gmock/gmock.h>
@@ -40,8 +41,8 @@ PropertyValue exampleDisplay()
 std::vector<std::string> rowsOf(const PropertyValue& display, std::string_view path)
 {
     std::vector<std::string> rows;
-    RowPath(path).forEachRow(display, [&rows](std::string_view found, const std::string& text) {
-        rows.push_back(std::string(found) + "=" + text);
+    RowPath(path).forEachRow(display, [&rows](std::string_view found, const PropertyValue& row) {
+        rows.push_back(std::string(found) + "=" + displayText(row));
     });
     return rows;
 }
@@ -112,10 +113,10 @@ TEST(RowPathTest, PathsAreThoseOfTheTreeThatIsShown)
     for (const PropertyValue& display : {sorted, exampleDisplay()}) {
         PathDictionary paths;
         OrvaneModelNode::makeTreeFromObject(display, paths);
-        RowPath("/").forEachRow(display, [&paths](std::string_view path, const std::string& text) {
+        RowPath("/").forEachRow(display, [&paths](std::string_view path, const PropertyValue& row) {
             const auto node = paths.find(std::string(path));
             ASSERT_NE(node, paths.end()) << path;
-            EXPECT_EQ(*node->second->value(), text);
+            EXPECT_EQ(*node->second->value(), displayText(row));
         });
     }
 }

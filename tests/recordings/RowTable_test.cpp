@@ -1,6 +1,7 @@
 #include "recordings/RowTable.h"
 
 #include "platform/base/PropertyValue.h"
+#include "ui/tree/DisplayWalk.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -40,7 +41,8 @@ std::vector<std::string> shown(const RowTable& table)
     std::vector<std::string> texts;
     for (const std::size_t i : table.order()) {
         const RowTable::Row& row = table.rows()[i];
-        texts.push_back((table.isPresent(row) ? row.text : "-") + (row.hasChanged ? "!" : ""));
+        texts.push_back((table.isPresent(row) ? displayText(row.value) : "-") +
+                        (row.hasChanged ? "!" : ""));
     }
     return texts;
 }

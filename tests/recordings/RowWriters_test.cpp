@@ -1,3 +1,4 @@
+#include "LogGenerator/TextReadings.h"
 #include "platform/base/PropertyValue.h"
 #include "recordings/CsvRowWriter.h"
 #include "recordings/JsonRowWriter.h"
@@ -27,11 +28,11 @@ protected:
             return --linesWanted > 0;
         };
     }
-    // A period of the rows given; its time is the number of the period.
+    // A period of the rows given, as a snapshot's texts; its time is the number of the period.
     bool take(RowWriter& writer,
               std::initializer_list<std::pair<std::string_view, PropertyValue>> rows)
     {
-        table.take(PropertyValue::dictionaryOf(rows));
+        table.take(withTextReadings(PropertyValue::dictionaryOf(rows)));
         return writer.takePeriod(std::to_string(++periods), table);
     }
     void finish(RowWriter& writer)

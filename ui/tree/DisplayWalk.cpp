@@ -3,12 +3,7 @@
 namespace orvane
 {
 
-const std::string& displayText(const PropertyValue& row)
-{
-    static const std::string kUnknown = "(unknown)";
-    const std::string* text = row.asString();
-    return text ? *text : kUnknown;
-}
+std::string displayText(const PropertyValue& row) { return row.text().value_or("(unknown)"); }
 
 std::string_view nameOfSortedKey(std::string_view key)
 {

@@ -22,7 +22,7 @@ inline bool isDisplayGroup(const PropertyValue& value)
 }
 
 // The text that a row shows: "(unknown)" for what is no text.
-const std::string& displayText(const PropertyValue& row);
+std::string displayText(const PropertyValue& row);
 
 // Under a key "_sorted" the keys are shown in the order of their characters, not of numbers: "10;Y"
 // before "2;X".

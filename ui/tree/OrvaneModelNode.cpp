@@ -28,10 +28,12 @@ NodePointer makeNode(std::string_view name, const PropertyValue& value, PathDict
         });
         node = std::make_shared<OrvaneModelTreeNode>(std::string(name), std::move(children));
     } else {
-        node = std::make_shared<OrvaneModelLeafNode>(std::string(name), displayText(value));
+        const bool isReading = value.asReading() || value.asTextReading();
+        node = std::make_shared<OrvaneModelLeafNode>(std::string(name), displayText(value),
+                                                     isReading ? value : PropertyValue());
     }
-    // Of siblings with one name, the later one is found under their path; both stay in the tree.
-    // This is meant.
+    // Deliberate: of siblings with one name, the later one is found under their path; both stay in
+    // the tree.
     paths[path] = node;
     return node;
 }

@@ -32,6 +32,8 @@ public:
     [[nodiscard]] virtual const std::vector<NodePointer>* childNodes() const { return nullptr; }
     // The shown value; null for a group.
     [[nodiscard]] virtual const std::string* value() const { return nullptr; }
+    // The reading that the value shows; absent where it shows none.
+    [[nodiscard]] virtual PropertyValue reading() const { return {}; }
 
     // Turns a display into a tree whose root is named "Orvane", and stores every node in `paths`
     // under its path. An absent display gives a leaf of the value "(unknown)".
@@ -45,14 +47,17 @@ private:
 class OrvaneModelLeafNode final : public OrvaneModelNode
 {
 public:
-    OrvaneModelLeafNode(std::string displayName, std::string value)
-        : OrvaneModelNode(std::move(displayName)), string(std::move(value))
+    OrvaneModelLeafNode(std::string displayName, std::string value, PropertyValue reading = {})
+        : OrvaneModelNode(std::move(displayName)), string(std::move(value)),
+          _reading(std::move(reading))
     {
     }
     [[nodiscard]] const std::string* value() const override { return &string; }
+    [[nodiscard]] PropertyValue reading() const override { return _reading; }
 
 private:
     std::string string;
+    PropertyValue _reading;
 };
 
 // A group of nodes, possibly without any.

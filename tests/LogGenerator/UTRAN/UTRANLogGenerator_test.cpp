@@ -23,7 +23,7 @@ using ::testing::IsEmpty;
 using ::testing::MatchesRegex;
 
 // A template that shows its own name.
-std::string named(const std::string& name)
+std::string templateNamed(const std::string& name)
 {
     return "<plist><dict><key>" + name + "</key><dict/></dict></plist>";
 }
@@ -33,7 +33,7 @@ class UTRANLogGeneratorTest : public ::testing::Test
 protected:
     void put(const std::string& name)
     {
-        services.memoryResources.put(name + ".plist", named(name));
+        services.memoryResources.put(name + ".plist", templateNamed(name));
     }
     // The name that the chosen template shows.
     std::string chosen()
@@ -64,7 +64,7 @@ TEST_F(UTRANLogGeneratorTest, LetterCaseDoesNotMatter)
     put("LTE");
     put("some-utran-template");
     EXPECT_EQ(chosen(), "some-utran-template");
-    services.memoryResources.put("UtRaN2.plist", named("UtRaN2"));
+    services.memoryResources.put("UtRaN2.plist", templateNamed("UtRaN2"));
     EXPECT_EQ(chosen(), "UtRaN2");
 }
 
@@ -80,8 +80,8 @@ TEST_F(UTRANLogGeneratorTest, TheWholePathCountsFoldersIncluded)
     const TemporaryDirectory directory;
     const std::string folder = directory.path() + "/utran";
     std::filesystem::create_directory(folder);
-    std::ofstream(folder + "/Another.plist") << named("Another");
-    std::ofstream(folder + "/UTRAN.plist") << named("UTRAN");
+    std::ofstream(folder + "/Another.plist") << templateNamed("Another");
+    std::ofstream(folder + "/UTRAN.plist") << templateNamed("UTRAN");
     DirectoryResources resources(folder);
     Services::current().setResources(&resources);
     EXPECT_EQ(chosen(), "Another");

@@ -2,6 +2,7 @@
 #include "platform/base/PropertyValue.h"
 #include "screens/print/JsonPrinter.h"
 #include "screens/print/TextPrinter.h"
+#include "support/Recording.h"
 
 #include <gtest/gtest.h>
 
@@ -92,6 +93,53 @@ TEST_F(JsonPrinterTest, AChangeOfTheStatusAloneCarriesTheTreeOnTheScreen)
     pane.setStatus("Connecting...", true);
     EXPECT_EQ(output, "{\"status\":\"Connecting...\",\"loading\":true,"
                       "\"tree\":{\"name\":\"Orvane\",\"value\":\"text\"}}\n");
+}
+
+TEST_F(JsonPrinterTest, DetailsAreNumberUnitAndTimeOfReadings)
+{
+    static constexpr Format kLevel = Format::fixed({.factor = 0.5}, 2, " dB");
+    static constexpr ValueName kNames[] = {
+        {1, "One"}
+    };
+    static constexpr Format kNamed = Format::named(kNames, "Unknown").withText(2, "Two");
+    static constexpr RowDescription kLevelRow = {"Level", &kLevel};
+    static constexpr RowDescription kNamedRow = {"State", &kNamed};
+    const PropertyValue display = PropertyValue::dictionaryOf({
+        {"Level", PropertyValue::reading({&kLevelRow, -7, 1795255200250})      },
+        {"State", PropertyValue::reading({&kNamedRow, 1})                      },
+        {"Code",  PropertyValue::textReading({"-00101 dB", "-00101", "dB", -1})},
+        {"Text",  "12"                                                         }
+    });
+    std::string plain;
+    appendJsonNode(plain, tree(display).get());
+    EXPECT_EQ(plain, "{\"name\":\"Orvane\",\"children\":["
+                     "{\"name\":\"Level\",\"value\":\"-3.50 dB\"},"
+                     "{\"name\":\"State\",\"value\":\"One\"},"
+                     "{\"name\":\"Code\",\"value\":\"-00101 dB\"},"
+                     "{\"name\":\"Text\",\"value\":\"12\"}]}");
+    JsonPrinter pane([this](std::string_view text) { output += text; }, false,
+                     JsonDetails::OfRecording);
+    pane.reloadWithNode(tree(display));
+    pane.setStatus("Updated", false);
+    EXPECT_EQ(output, "{\"status\":\"Updated\",\"loading\":false,\"tree\":"
+                      "{\"name\":\"Orvane\",\"children\":["
+                      "{\"name\":\"Level\",\"value\":\"-3.50 dB\",\"number\":-3.50,"
+                      "\"unit\":\"dB\",\"time\":\"2026-11-21T10:00:00.250Z\"},"
+                      "{\"name\":\"State\",\"value\":\"One\",\"number\":1},"
+                      "{\"name\":\"Code\",\"value\":\"-00101 dB\",\"number\":-101,"
+                      "\"unit\":\"dB\",\"time\":\"1969-12-31T23:59:59.999Z\"},"
+                      "{\"name\":\"Text\",\"value\":\"12\"}]}}\n");
+}
+
+TEST_F(JsonPrinterTest, DetailsOfALiveViewHaveTheTimeOfEachStatus)
+{
+    TestServices services;
+    services.clock.now = 1795255200.5;
+    JsonPrinter pane([this](std::string_view text) { output += text; }, true,
+                     JsonDetails::OfLiveView);
+    pane.setStatus("Connecting", true);
+    EXPECT_EQ(output, "{\"status\":\"Connecting\",\"loading\":true,\"tree\":null,"
+                      "\"time\":\"2026-11-21T10:00:00.500Z\",\"simulated\":true}\n");
 }
 
 TEST_F(JsonPrinterTest, NoStatusIsAnEmptyOne)
