@@ -11,20 +11,28 @@ namespace
 
 // A command is asked for by the option of its name.
 constexpr CommandLineCommand kCommands[] = {
-    {"demo",     "--demo=SCENARIO [OPTION...]",
+    {"demo",        "--demo=SCENARIO [OPTION...]",
      "A telephony server for a modem, a recording or a simulated phone.", "Runs until it is interrupted."},
-    {"replay",   "--replay FILE [OPTION...]",   "",                       ""                             },
-    {"messages", "--messages=NAME [OPTION...]", "",                       ""                             },
-    {"port",     "--port DEVICE [OPTION...]",   "",                       ""                             },
+    {"replay",      "--replay FILE [OPTION...]",   "",                    ""                             },
+    {"messages",    "--messages=NAME [OPTION...]", "",                    ""                             },
+    {"port",        "--port DEVICE [OPTION...]",   "",                    ""                             },
+    {"modem",       "--modem[=ID] [OPTION...]",    "",                    ""                             },
+    {"list-modems", "--list-modems [OPTION...]",   "",                    ""                             },
 };
 
 constexpr unsigned kReplay = 1U << 1;
 constexpr unsigned kPort = 1U << 3;
+constexpr unsigned kModem = 1U << 4;
+constexpr unsigned kListModems = 1U << 5;
 constexpr CommandSet kRecordings{kReplay,
                                  "is for a recording: use it with --replay FILE, or leave it out"};
-constexpr CommandSet kRecordingsAndModems{
-    kReplay | kPort,
-    "is for a recording or a modem: use it with --replay FILE or --port DEVICE, or leave it out"};
+constexpr CommandSet kRecordingsAndModems{kReplay | kPort | kModem,
+                                          "is for a recording or a modem: use it with --replay "
+                                          "FILE, --modem or --port DEVICE, or leave it out"};
+constexpr CommandSet kModems{
+    kModem | kListModems, "is for modems: use it with --modem or --list-modems, or leave it out"};
+constexpr CommandSet kLists{kListModems,
+                            "is for a list: use it with --list-modems, or leave it out"};
 
 using DaemonOption = Option<DaemonOptions>;
 
@@ -45,6 +53,20 @@ constexpr DaemonOption kOptions[] = {
     DaemonOption(
         {"port", "DEVICE", "serve the modem whose diagnostic port this is, such as /dev/ttyUSB0"},
         &DaemonOptions::port),
+    DaemonOption(
+        {"modem", "[ID]",
+         "serve the modem of this ID, found through ModemManager (default: the only modem there "
+         "is; --port DEVICE names its diagnostic port where ModemManager does not)"},
+        [](DaemonOptions& options, const GivenOption& given) { options.modem = given.value(); }),
+    DaemonOption(
+        {"list-modems", "", "list the modems that ModemManager knows, with their IDs, and end"},
+        &DaemonOptions::listsModems),
+    DaemonOption({"json", "", "a line of JSON for each modem", kLists},
+                 &DaemonOptions::listsAsJson),
+    DaemonOption({"bus", "system|session", "where ModemManager is (default system)", kModems},
+                 [](DaemonOptions& options, const GivenOption& given) {
+                     options.usesSessionBus = given.choice() == 1;
+                 }),
     DaemonOption(
         {"technology", "NAME",
          "what was recorded, or what the modem serves: {} (default: by the log codes that come)",
@@ -95,12 +117,14 @@ void parse(DaemonOptions& options, std::span<const std::string> arguments,
         line.checkCommand(i);
         ++given;
     }
+    if (given == 2 && line.has("modem") && line.has("port"))
+        given = 1;
     if (given > 1)
-        throw UsageError(
-            "--demo, --replay, --messages and --port exclude each other: give one of them");
+        throw UsageError("--demo, --replay, --messages, --port, --modem and --list-modems exclude "
+                         "each other: give one of them");
     if (given == 0)
-        throw UsageError("give --demo=SCENARIO, --replay FILE, --messages=NAME or --port DEVICE: "
-                         "there is nothing to serve otherwise");
+        throw UsageError("give --demo=SCENARIO, --replay FILE, --messages=NAME, --modem or --port "
+                         "DEVICE: there is nothing to serve otherwise");
     line.storeIn(options, kOptions);
 }
 

@@ -15,12 +15,17 @@ struct DaemonOptions {
     bool wantsVersion = false;
     LogChoice log;
 
-    // Exactly one of the four is given.
+    // One of them is given, or both modem and port.
     std::optional<std::string> demo;     // the scenario of a simulated phone
     std::optional<std::string> replay;   // the recording that is sent again
     std::optional<std::string> messages; // the technology constant of the messages that are typed
+    std::optional<std::string> port;     // the device that is a modem's diagnostic port
+    std::optional<std::string> modem;    // the ID of a modem; empty = the only one there is
+    bool listsModems = false;
 
-    std::optional<std::string> port; // the device that is a modem's diagnostic port
+    // Of a modem, or of the list of them.
+    bool usesSessionBus = false;
+    bool listsAsJson = false;
 
     // Of a recording or a modem.
     std::optional<std::string> technology; // the constant; nothing = by the log codes that come

@@ -1,6 +1,7 @@
 #include "LogGenerator/LogTechnology.h"
 #include "platform/base/Bytes.h"
 #include "platform/linux/LineReader.h"
+#include "platform/linux/ModemManagerClient.h"
 #include "platform/linux/PortsDirectory.h"
 #include "platform/linux/PrivatePortsDirectory.h"
 #include "platform/linux/QtEventLoop.h"
@@ -20,6 +21,8 @@
 #include "telephonyd/ReplaySource.h"
 #include "telephonyd/TypedMessages.h"
 #include "telephonyd/modem/DiagnosticModem.h"
+#include "telephonyd/modem/FollowedModem.h"
+#include "telephonyd/modem/ManagedModem.h"
 #include "telephonyd/phone/Scenarios.h"
 
 #include <chrono>
@@ -37,6 +40,8 @@ namespace
 
 constexpr int kFailure = 1;
 constexpr int kUnusableArguments = 2;
+// More than ModemManager's answer is waited for.
+constexpr std::chrono::seconds kServiceTime{10};
 constexpr auto kCleaningInterval = std::chrono::minutes(1);
 
 void complain(const std::string& text) { printComplaint("telephonyd", text); }
@@ -70,13 +75,92 @@ LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
     };
 }
 
-std::unique_ptr<DiagnosticModem> modemOf(const DaemonOptions& options, MainQueue& queue)
+ModemManagerClient::Bus busOf(const DaemonOptions& options)
 {
-    const auto open = [device = *options.port](std::string& error) {
-        return openSerialDevice(device, error);
+    return options.usesSessionBus ? ModemManagerClient::Bus::Session
+                                  : ModemManagerClient::Bus::System;
+}
+
+int listModems(const DaemonOptions& options)
+{
+    QtEventLoop loop;
+    ModemManagerClient service(busOf(options));
+    std::optional<std::string> problem;
+    service.ask([&](const PropertyValue& objects, const std::string& error) {
+        problem = error;
+        const auto modems = managedModemsIn(objects);
+        const std::string text = !error.empty()        ? ""
+                                 : options.listsAsJson ? modemListJson(modems)
+                                                       : modemListText(modems);
+        std::fputs(text.c_str(), stdout);
+        loop.quit();
+    });
+    loop.run();
+    if (problem->empty())
+        return 0;
+    complain("ModemManager cannot be asked: " + *problem);
+    return kFailure;
+}
+
+// A modem with what it is opened and followed by.
+struct ServedModem {
+    std::unique_ptr<ModemManagerClient> service;
+    std::unique_ptr<FollowedModem> followed;
+    std::unique_ptr<DiagnosticModem> modem;
+};
+
+// The modem that ModemManager knows; null, with a complaint, when it does not.
+std::unique_ptr<FollowedModem> followedModem(const DaemonOptions& options, ModemService& service,
+                                             QtEventLoop& loop)
+{
+    auto followed = std::make_unique<FollowedModem>(service, *options.modem);
+    std::optional<std::string> problem;
+    bool isAnswered = false;
+    followed->start([&](const std::optional<std::string>& error) {
+        problem = error;
+        isAnswered = true;
+    });
+    loop.runUntil([&] { return isAnswered; }, kServiceTime);
+    // A diagnostic port that is named need not be listed.
+    if (!isAnswered || (problem && !(options.port && followed->isPresent()))) {
+        complain(problem.value_or("ModemManager does not answer: start it again, or name the "
+                                  "diagnostic port with --port DEVICE"));
+        return nullptr;
+    }
+    return followed;
+}
+
+// Without a modem, after a complaint, when it cannot be served.
+ServedModem modemOf(const DaemonOptions& options, QtEventLoop& loop, MainQueue& queue)
+{
+    ServedModem served;
+    if (options.modem) {
+        served.service = std::make_unique<ModemManagerClient>(busOf(options));
+        served.followed = followedModem(options, *served.service, loop);
+        if (!served.followed)
+            return served;
+    }
+    const FollowedModem* followed = served.followed.get();
+    const auto open = [port = options.port,
+                       followed](std::string& error) -> std::unique_ptr<ByteDevice> {
+        const std::string device = port ? *port : followed->diagnosticPort();
+        if (!device.empty())
+            return openSerialDevice(device, error);
+        error = "ModemManager does not list the diagnostic port of the modem " + followed->id() +
+                " now";
+        return nullptr;
     };
-    return std::make_unique<DiagnosticModem>(
-        queue, open, DiagnosticModem::Settings{*options.port, options.technology});
+    const std::string device = options.port ? *options.port : followed->diagnosticPort();
+    served.modem = std::make_unique<DiagnosticModem>(
+        queue, open, DiagnosticModem::Settings{device, options.technology});
+    if (served.followed) {
+        const auto tell = [modem = served.modem.get(), followed] {
+            modem->tellTechnology(followed->technology());
+        };
+        tell();
+        served.followed->setChangedCallback(tell);
+    }
+    return served;
 }
 
 // What the server tells its clients of the modem. Both must outlive the modem's events.
@@ -101,11 +185,14 @@ int serve(const DaemonOptions& options)
     SocketTransport transport(*directory);
     std::unique_ptr<TypedMessages> messages;
     std::unique_ptr<LineReader> reader;
-    std::unique_ptr<DiagnosticModem> modem;
+    ServedModem served;
+    DiagnosticModem* modem = nullptr;
     LogSourceFactory factory;
-    if (options.port) {
-        modem = modemOf(options, queue);
-        factory = [&modem] { return std::make_unique<ModemSource>(*modem); };
+    if (options.port || options.modem) {
+        served = modemOf(options, loop, queue);
+        modem = served.modem.get();
+        if (modem)
+            factory = [modem] { return std::make_unique<ModemSource>(*modem); };
     } else if (options.messages) {
         messages = std::make_unique<TypedMessages>(*options.messages, queue, complain);
         factory = messages->sources();
@@ -185,7 +272,7 @@ int main(int argc, char** argv)
     services.setResources(&resources);
     int status = kFailure;
     try {
-        status = serve(options);
+        status = options.listsModems ? listModems(options) : serve(options);
     } catch (const std::exception& failure) {
         complain(failure.what());
     }

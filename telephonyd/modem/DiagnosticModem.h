@@ -78,6 +78,12 @@ public:
 
     // The technology's constant. An empty text while it is not known: it is then found out.
     std::string technology() { return _technology.ask(); }
+    // What a service knows of the modem's technology now: the constant, or nullopt where it does
+    // not know.
+    void tellTechnology(const std::optional<std::string>& technology)
+    {
+        _technology.tell(technology);
+    }
     [[nodiscard]] Presence presence() const { return _presence; }
     // The listener must not outlive the modem. The callback must not destroy its own listener.
     [[nodiscard]] std::unique_ptr<Listener> listen(LogCodes codes, MessageCallback callback);

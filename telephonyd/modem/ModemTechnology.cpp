@@ -1,6 +1,7 @@
 #include "telephonyd/modem/ModemTechnology.h"
 
 #include "platform/base/Technology.h"
+#include "platform/base/TelephonyConstants.h"
 #include "platform/services/SystemLog.h"
 
 #include <utility>
@@ -18,10 +19,22 @@ ModemTechnology::ModemTechnology(MainQueue& queue, std::optional<std::string> na
 std::string ModemTechnology::ask()
 {
     // Without a modem the last known one lets the viewer stay, and say that the modem is missing.
-    if (_isNamed || _isConfirmed || (!_isPresent && !_known.empty()))
+    if (_isNamed || _isTold || _isConfirmed || (!_isPresent && !_known.empty()))
         return _known;
     probeWhileClientsWait();
     return "";
+}
+
+void ModemTechnology::tell(const std::optional<std::string>& technology)
+{
+    if (_isNamed)
+        return;
+    _isTold = technology.has_value();
+    // Services do not tell these two apart.
+    const bool isCloser = _known == kTSLogChannelTechnology_Varnel_UTRAN2 && _isConfirmed &&
+                          technology == kTSLogChannelTechnology_Varnel_GSM;
+    if (technology && !isCloser && (technology != _known || !_isConfirmed))
+        found(*technology);
 }
 
 void ModemTechnology::modemCame()
@@ -39,7 +52,7 @@ void ModemTechnology::modemWent()
 
 void ModemTechnology::itemCame(std::uint16_t code, bool isListenedTo)
 {
-    if (_isNamed || _isConfirmed)
+    if (_isNamed || _isTold || _isConfirmed)
         return;
     if (_probe.isShownBy(code))
         found(_probe.technology());
@@ -77,7 +90,7 @@ void ModemTechnology::probeWhileClientsWait()
 void ModemTechnology::watchForSilence()
 {
     ++_silences;
-    if (_isNamed || _isConfirmed || !_isListenedTo || !_isPresent)
+    if (_isNamed || _isTold || _isConfirmed || !_isListenedTo || !_isPresent)
         return;
     _queue.after(kSilence, _lifetime.whileAlive([this, silence = _silences] {
         if (silence == _silences)

@@ -13,7 +13,8 @@
 namespace orvane
 {
 
-// Which technology a modem serves: what was named on the command line, or else what probing finds.
+// Which technology a modem serves: what was named on the command line, or else what a service tells
+// of the modem, or else what probing finds.
 //
 // Probing begins when a client asks and the answer is not known. What was found stays known until
 // the modem goes away, and is the answer until it is back. A modem that has come back is probed
@@ -39,6 +40,9 @@ public:
     // The constant, or an empty text while it is not known: it is then found out.
     std::string ask();
 
+    // What a service knows of the modem now: the constant, or nullopt where it does not know.
+    void tell(const std::optional<std::string>& technology);
+
     // What the modem does.
     void modemCame();
     void modemWent();
@@ -59,6 +63,7 @@ private:
     Events _events;
     TechnologyProbe _probe;
     std::string _known; // the last that was known; empty for none
+    bool _isTold = false;
     bool _isConfirmed = false;
     bool _isPresent = false;
     bool _isListenedTo = false;

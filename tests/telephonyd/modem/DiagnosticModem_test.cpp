@@ -417,5 +417,41 @@ TEST_F(DiagnosticModemTest, AModemThatComesBackAndIsSilentForAMinuteIsProbedForA
     EXPECT_THAT(phone.codes, ElementsAre(0xB0C2));
 }
 
+TEST_F(DiagnosticModemTest, ATechnologyThatAServiceTellsNeedsNoProbing)
+{
+    startUnknown();
+    modem->tellTechnology(kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(changes, 0);
+    modem->tellTechnology(kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(changes, 1);
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_GSM);
+    // Without service nothing is told: that is no change.
+    modem->tellTechnology(std::nullopt);
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(changes, 1);
+    queue.advance(10s);
+    EXPECT_THAT(phone.requests, SizeIs(3));
+}
+
+TEST_F(DiagnosticModemTest, ANamedTechnologyStaysWhateverAServiceTells)
+{
+    startLte();
+    modem->tellTechnology(kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(changes, 0);
+}
+
+TEST_F(DiagnosticModemTest, ServicesCannotTellUtranFromUmts)
+{
+    startUnknown();
+    EXPECT_EQ(technologyWhileLogging(0xD00A), kTSLogChannelTechnology_Varnel_UTRAN2);
+    modem->tellTechnology(kTSLogChannelTechnology_Varnel_GSM);
+    EXPECT_EQ(modem->technology(), kTSLogChannelTechnology_Varnel_UTRAN2);
+    EXPECT_EQ(changes, 0);
+    modem->tellTechnology(kTSLogChannelTechnology_Varnel_LTE);
+    EXPECT_EQ(changes, 1);
+}
+
 } // namespace
 } // namespace orvane
