@@ -8,7 +8,7 @@ build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev 
     libqt6opengl6-dev)
 # shellcheck disable=SC2034
 check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev
-    libvterm-dev python3)
+    libvterm-dev python3 python3-dbusmock modemmanager dbus-daemon libglib2.0-bin)
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -44,6 +44,10 @@ purpose_of() {
     libbenchmark-dev) echo "Google Benchmark with its CMake package" ;;
     libvterm-dev) echo "libvterm with its headers, a terminal for tests" ;;
     python3) echo "Python 3, which plays modems in tests" ;;
+    python3-dbusmock) echo "python-dbusmock, which stands in for services on a bus in tests" ;;
+    modemmanager) echo "ModemManager, for tests on a bus of their own" ;;
+    dbus-daemon) echo "dbus-daemon, for tests on a bus of their own" ;;
+    libglib2.0-bin) echo "gdbus, with which tests call services" ;;
     gcovr) echo "gcovr" ;;
     esac
 }

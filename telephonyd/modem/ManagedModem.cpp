@@ -14,6 +14,7 @@ namespace
 
 constexpr const char* kModemInterface = "org.freedesktop.ModemManager1.Modem";
 constexpr std::int64_t kDiagnosticPortType = 4;
+constexpr std::int64_t kDisabled = 3;
 
 constexpr std::uint32_t bits(unsigned first, unsigned last)
 {
@@ -35,19 +36,19 @@ constexpr struct {
     std::int64_t state;
     const char* name;
 } kStates[] = {
-    {-1, "failed"       },
-    {0,  "unknown"      },
-    {1,  "initializing" },
-    {2,  "locked"       },
-    {3,  "disabled"     },
-    {4,  "disabling"    },
-    {5,  "enabling"     },
-    {6,  "enabled"      },
-    {7,  "searching"    },
-    {8,  "registered"   },
-    {9,  "disconnecting"},
-    {10, "connecting"   },
-    {11, "connected"    },
+    {-1,        "failed"       },
+    {0,         "unknown"      },
+    {1,         "initializing" },
+    {2,         "locked"       },
+    {kDisabled, "disabled"     },
+    {4,         "disabling"    },
+    {5,         "enabling"     },
+    {6,         "enabled"      },
+    {7,         "searching"    },
+    {8,         "registered"   },
+    {9,         "disconnecting"},
+    {10,        "connecting"   },
+    {11,        "connected"    },
 };
 
 std::string textOf(const PropertyValue& value)
@@ -97,6 +98,12 @@ std::string logCodesText(const ManagedModem& modem)
         return "not shown: ModemManager lists no diagnostic port; if you know its device, run "
                "telephonyd --port DEVICE";
     return "shown by telephonyd --modem=" + modem.id;
+}
+
+std::string stateText(const ManagedModem& modem)
+{
+    return modem.stateName() +
+           (modem.state == kDisabled ? "; enable it with mmcli -m " + modem.path + " -e" : "");
 }
 
 std::string portsText(const ManagedModem& modem)
@@ -171,7 +178,7 @@ std::string modemListText(const std::vector<ManagedModem>& modems)
             {"ID",         modem.id             },
             {"maker",      modem.maker          },
             {"model",      modem.model          },
-            {"state",      modem.stateName()    },
+            {"state",      stateText(modem)     },
             {"technology", technologyText(modem)},
             {"ports",      portsText(modem)     },
             {"log codes",  logCodesText(modem)  },
