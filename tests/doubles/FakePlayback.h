@@ -9,7 +9,7 @@
 namespace orvane
 {
 
-// A recording that does nothing but note what its controls ask of it.
+// A recording that only records the calls of its controls.
 class FakePlayback final : public Playback
 {
 public:

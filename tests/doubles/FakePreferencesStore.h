@@ -10,7 +10,7 @@
 namespace orvane
 {
 
-// Notes, in order and in words, what is asked of it.
+// Records its calls in order, as texts.
 class FakePreferencesStore final : public PreferencesStore
 {
 public:

@@ -15,9 +15,9 @@ namespace orvane
 
 class TableView;
 
-// A front end without a screen, with fixed font metrics, in which tests press, type and read
-// frames. Every code point is 8 points wide, in bold 9; a line is 3 points higher than the font's
-// size. Is the main screen as long as it lives.
+// A front end without a screen and with fixed font metrics, in which tests press, type and read
+// frames. A code point is 8 points wide, 9 in bold; a line is 3 points higher than the font size.
+// It is the main screen during its lifetime.
 class FakeScreen final : public Screen
 {
 public:
@@ -40,23 +40,23 @@ public:
         if (onUpdate)
             onUpdate();
     }
-    // Called for each change, while what changes is still at work.
+    // Called for each change, from within the call that makes it.
     std::function<void()> onUpdate;
 
-    // How often something has changed.
+    // The number of changes so far.
     [[nodiscard]] int updateCount() const { return _updateCount; }
-    // The interface files that there are, by name.
+    // The interface files that exist, by name.
     void setInterface(const std::string& name, std::function<std::unique_ptr<Interface>()> make)
     {
         _interfaces[name] = std::move(make);
     }
 
-    // What a user sees and does. Nothing, null or empty where that is not on the screen.
+    // What a user sees and does. Null or empty if it is not on the screen.
 
     // The stack that fills the window.
     [[nodiscard]] NavigationController* navigation() const;
     [[nodiscard]] std::string title() const;
-    // The table in front, all of whose rows are visible from now on.
+    // The table in front. From then on all its rows are visible.
     [[nodiscard]] TableView* table() const;
     [[nodiscard]] std::shared_ptr<TableViewCell> row(std::size_t index) const;
     void pressRow(std::size_t index);

@@ -41,7 +41,7 @@ void LoopbackEnd::send(std::int32_t messageId, std::uint32_t serial, bool wantsR
     write();
 }
 
-// Moves to the other end what the way takes.
+// Moves to the other end as much as it takes.
 void LoopbackEnd::write()
 {
     const auto other = _other.lock();
@@ -111,7 +111,7 @@ void LoopbackEnd::deliver()
     scheduleDelivery();
 }
 
-// Hands on the next segment, or the other end's close after the last.
+// Delivers the next segment or, after the last, the close of the other end.
 void LoopbackEnd::readSome()
 {
     if (!_open || _room || !_frameCallback)

@@ -10,8 +10,8 @@
 namespace orvane
 {
 
-// One end of a connection of LoopbackTransport: bytes written to the other end, bytes arrived from
-// it, and the tasks that hand them on. Owned by the LoopbackConnection of its side.
+// One end of a connection of LoopbackTransport: the bytes written to the other end, the bytes that
+// arrived from it, and the tasks that deliver them. The LoopbackConnection of its side owns it.
 class LoopbackEnd final : public std::enable_shared_from_this<LoopbackEnd>
 {
 public:
@@ -32,14 +32,14 @@ public:
               ByteView data);
     bool withdrawLast();
     bool waitUntil(const std::function<bool()>& done, std::chrono::nanoseconds timeout);
-    // Ends it without a call back; the other end sees so once it has read what was sent.
+    // Closes it without a callback. The other end sees the close after it has read all data.
     void close();
 
-    // Ends it as a transport failure does, with the closed callback.
+    // Closes it as a transport failure does, with the closed callback.
     void fail();
     // Bytes on their way to this end.
     void arrive(ByteView bytes);
-    // Nothing = this end reads; else how many more bytes the way to it takes.
+    // nullopt while this end reads; else the bytes that can still be sent to it.
     void setRoom(std::optional<std::size_t> room);
     void setSegmentBytes(std::optional<std::size_t> bytes) { _segmentBytes = bytes; }
 

@@ -14,7 +14,7 @@ namespace orvane
 namespace
 {
 
-// What both ends of a listening name know of it.
+// The state that both ends of a listening name share.
 struct LoopbackListening {
     explicit LoopbackListening(ManualMainQueue& listenersQueue) : queue(listenersQueue) {}
     ManualMainQueue& queue;
@@ -78,8 +78,8 @@ public:
         });
         connections.push_back({connector, accepted});
 
-        // Dropped together with the task where the listener goes first: the connector then finds
-        // its connection closed.
+        // If the listener goes first, the task is dropped with this, and the connector sees its
+        // connection close.
         auto connection = std::make_shared<std::unique_ptr<FrameConnection>>(
             std::make_unique<LoopbackConnection>(accepted));
         listening->queue.async([weak = std::weak_ptr(listening), connection] {
@@ -92,7 +92,7 @@ public:
         return std::make_unique<LoopbackConnection>(connector);
     }
 
-    // The other settings are kept by the name, also before anything listens there.
+    // The other settings belong to the name and hold before anything listens there.
     void refuse(const std::string& name, bool refuses) { _ports[name].refuses = refuses; }
 
     void refuseListener(const std::string& name, bool refuses)
@@ -122,7 +122,7 @@ public:
         }
     }
 
-    // Calls action(end) for each end at the name's connectors, or at the port, that is there.
+    // Calls action(end) for each existing end of the name, connecting or listening.
     template <typename Action>
     void forConnectors(const std::string& name, const Action& action) const
     {

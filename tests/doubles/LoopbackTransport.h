@@ -12,20 +12,20 @@
 namespace orvane
 {
 
-// A frame transport inside one process, without sockets and in a test's own time.
+// A frame transport inside one process, without sockets, on a clock that the test advances.
 //
-// It has two sides, as a client's and a server's process have: this object is the one, peerSide()
-// the other, each with a main queue of its own on one clock. Frames are serialised and parsed as on
-// a socket. Nothing arrives within a call, but as tasks of the receiver's queue. While a connection
-// waits (FrameConnection::waitUntil), only it and the other side are served, for as long as the
-// other side has something to do within the timeout; a peer on the same side does not act
-// meanwhile. A wait in vain turns the clock on by its timeout.
+// It has two sides, like a client process and a server process: this object is one, peerSide() is
+// the other. Each has its own main queue on the same clock. Frames are serialised and parsed as on
+// a socket. Data never arrives during a call, always as a task of the receiver's queue. While a
+// connection waits (FrameConnection::waitUntil), only that connection and the other side run, and
+// only while the other side has tasks due within the timeout; peers on the same side are paused. A
+// wait that times out advances the clock by its timeout.
 //
 // Connections and listeners must not outlive the transport's queues.
 class LoopbackTransport final : public FrameTransport
 {
 public:
-    // `queue` is this side's.
+    // `queue` is the queue of this side.
     explicit LoopbackTransport(ManualMainQueue& queue);
     ~LoopbackTransport() override;
 
@@ -35,30 +35,30 @@ public:
     [[nodiscard]] FrameTransport& peerSide();
     [[nodiscard]] ManualMainQueue& peerQueue();
 
-    // What a test does to connections. Each is named by the port that it leads to and may lie on
-    // either side; what is set for a name holds for connections made later, too.
+    // Faults that a test sets. A name selects all connections to the port of that name, on either
+    // side, also those made later.
 
     // Whether anything listens on the name.
     [[nodiscard]] bool hasListener(const std::string& name) const;
-    // How many connections to the name are open at the end that made them.
+    // The number of connections to the name that are open at the connecting end.
     [[nodiscard]] std::size_t openConnections(const std::string& name) const;
-    // Connections to the name fail from here on although something listens, or no longer do.
+    // Makes new connections to the name fail although something listens, or work again.
     void refuseConnections(const std::string& name, bool refuse = true);
-    // Nobody can listen on the name from here on, or somebody can again.
+    // Makes listening on the name fail, or work again.
     void refuseListener(const std::string& name, bool refuse = true);
-    // The port of the name no longer reads: of what is sent to it from here on, `room` more bytes a
-    // connection are taken, the rest stays unsent with the sender.
+    // The port of that name stops reading. Each connection takes `room` more bytes; the sender
+    // keeps the rest unsent.
     void stopReading(const std::string& name, std::size_t room = 0);
     void resumeReading(const std::string& name);
-    // The same for the ends that connected to the name: what the port sends is not read.
+    // The same for the connecting ends: they stop reading what the port sends.
     void stopReadingFromPort(const std::string& name, std::size_t room = 0);
     void resumeReadingFromPort(const std::string& name);
-    // Breaks all connections to the name: both ends find them closed.
+    // Breaks all connections to the name: both ends see them close.
     void cutConnections(const std::string& name);
-    // Bytes as though they had been sent on each connection to the name, to the port or from it.
+    // Inserts bytes into each connection to the name, as sent to the port or by it.
     void injectToPort(const std::string& name, ByteView bytes);
     void injectFromPort(const std::string& name, ByteView bytes);
-    // At most this many bytes arrive at once; nothing = all that are there.
+    // At most this many bytes arrive at once; nullopt: no limit.
     void setSegmentBytes(std::optional<std::size_t> bytes);
 
 private:

@@ -14,8 +14,8 @@ using std::chrono::nanoseconds;
 
 constexpr nanoseconds kShortestInterval = std::chrono::milliseconds(1);
 
-// Counts the tasks of one moment, so that tasks that queue themselves for ever fail a test instead
-// of hanging it.
+// Counts the tasks of one moment: a task that queues itself without end fails a test instead of
+// hanging it.
 class RunawayGuard
 {
 public:
@@ -59,7 +59,7 @@ ManualMainQueue::ManualMainQueue(ManualMainQueue& sameClock) : _timeline(sameClo
 ManualMainQueue::~ManualMainQueue()
 {
     std::erase(_timeline->queues, this);
-    // What a dropped task owned may queue tasks as it goes.
+    // Destroying what a dropped task owns may queue tasks.
     while (!_tasks.empty())
         std::exchange(_tasks, {}).clear();
 }
@@ -88,7 +88,7 @@ void ManualMainQueue::advance(nanoseconds duration)
     RunawayGuard guard;
     while (timeline->runFirst(deadline))
         guard.taskRan(timeline->now);
-    // A task that waited may have turned the clock past the deadline.
+    // A task that blocked may have advanced the clock past the deadline.
     timeline->now = std::max(timeline->now, deadline);
 }
 

@@ -10,16 +10,16 @@
 namespace orvane
 {
 
-// A main queue whose time stands still until a test turns it.
+// A main queue on a clock that only the test advances.
 //
-// Tasks run in the order of their times, those of one time in the order in which they were queued.
-// Several queues may share one clock, as processes of one machine do: turning any of them runs the
-// tasks of all, merged in that order. Tasks still waiting at destruction are dropped.
+// Tasks run in the order of their times; tasks of the same time, in the order of queuing. Several
+// queues may share one clock, as processes of one machine do: advancing any of them runs the tasks
+// of all, merged in that order. The destructor drops waiting tasks.
 class ManualMainQueue final : public MainQueue
 {
 public:
     ManualMainQueue();
-    // A further queue on the clock of `sameClock`.
+    // Another queue on the clock of `sameClock`.
     explicit ManualMainQueue(ManualMainQueue& sameClock);
     ~ManualMainQueue() override;
     ManualMainQueue(const ManualMainQueue&) = delete;
@@ -27,25 +27,25 @@ public:
 
     void async(Task task) override;
     void after(std::chrono::nanoseconds delay, Task task) override;
-    // Ticks that a wait has run past come as one, as with a real event loop. Intervals below a
-    // millisecond are taken as one.
+    // Ticks missed during a wait are delivered as one, as in a real event loop. Intervals below
+    // one millisecond count as one millisecond.
     [[nodiscard]] std::unique_ptr<Timer> repeatingTimer(std::chrono::nanoseconds interval,
                                                         Task task) override;
 
-    // Since the clock was made.
+    // Time since the clock was created.
     [[nodiscard]] std::chrono::nanoseconds now() const;
-    // Runs everything that is due now, and what that queues for now. A million tasks without an end
-    // throw std::logic_error.
+    // Runs all tasks that are due now, also those queued meanwhile. Throws std::logic_error after a
+    // million tasks.
     void runPending() { advance(std::chrono::nanoseconds(0)); }
-    // Turns the clock on by the duration and runs what falls due on the way, each at its time.
+    // Advances the clock by the duration and runs each task that falls due at its time.
     void advance(std::chrono::nanoseconds duration);
-    // How many tasks and running timers wait in this queue, due or not.
+    // The number of waiting tasks and running timers of this queue, due or not.
     [[nodiscard]] std::size_t waitingTasks() const;
 
-    // For a fake call that waits on the thread of this queue: turns the clock on by at most the
-    // timeout, running the tasks of the other queues of the clock, until `stop` is true (asked
-    // first and after each task). Tasks of this queue wait meanwhile, also when another queue in
-    // turn waits for it.
+    // For a fake call that blocks the thread of this queue: advances the clock by at most the
+    // timeout and runs the tasks of the other queues of the clock until `stop` returns true (called
+    // first, and after each task). Tasks of this queue wait meanwhile, even when another queue
+    // blocks on this one.
     void runOthers(std::chrono::nanoseconds timeout, const std::function<bool()>& stop);
 
 private:
@@ -63,7 +63,7 @@ private:
         std::uint64_t order;
         friend auto operator<=>(const Due&, const Due&) = default;
     };
-    // What the queues of one clock share.
+    // The state that the queues of one clock share.
     struct Timeline {
         std::chrono::nanoseconds now{0};
         std::uint64_t queued = 0;

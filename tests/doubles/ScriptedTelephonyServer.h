@@ -14,47 +14,47 @@
 namespace orvane
 {
 
-// A telephony server whose answers a test chooses and which keeps what clients sent it.
+// A telephony server that answers as the test chooses and records what clients send.
 //
-// It speaks the true wire format over any frame transport. The public fields say what it answers
-// from then on; they may be changed at any time.
+// It uses the real wire format over any frame transport. The public fields set the answers from
+// then on; a test may change them at any time.
 class ScriptedTelephonyServer
 {
 public:
     enum class ChannelAnswer { Channel, EmptyPort, NoPort, Garbage, Empty, None };
     enum class TechnologyAnswer { Technology, NoKey, Garbage, Empty, None };
 
-    // Listens at once. On a loopback the server is on the peer's side.
+    // Listens at once. With LoopbackTransport the server is on the peer side.
     explicit ScriptedTelephonyServer(LoopbackTransport& loopback);
     ScriptedTelephonyServer(FrameTransport& transport, MainQueue& queue);
     ~ScriptedTelephonyServer();
     ScriptedTelephonyServer(const ScriptedTelephonyServer&) = delete;
     ScriptedTelephonyServer& operator=(const ScriptedTelephonyServer&) = delete;
 
-    // The answer to a request for a log channel. One with an error other than 0 has no port.
+    // The answer to a request for a log channel. With an error other than 0 it has no port.
     ChannelAnswer channelAnswer = ChannelAnswer::Channel;
     std::int32_t channelError = 0;
-    // Whether the port that the answer names is really there.
+    // Whether the port that the answer names exists.
     bool channelPortExists = true;
     // The answer to the technology query; the value may be of any type.
     TechnologyAnswer technologyAnswer = TechnologyAnswer::Technology;
     PropertyValue technology = kTSLogChannelTechnology_Varnel_LTE;
     // How long each answer takes.
     std::chrono::milliseconds answerDelay{0};
-    // Called once each answer to a technology query is sent, before the client has it: the place to
-    // let the channel's port stop reading or the server die ahead of the start command.
+    // Called after each answer to a technology query is sent, before the client receives it: here
+    // the channel's port can stop reading, or the server die, before the start command.
     std::function<void()> afterTechnologyAnswer;
 
-    // What clients have sent, in order of arrival.
+    // What clients sent, in order of arrival.
     [[nodiscard]] const std::vector<std::string>& requestedPorts() const { return _requestedPorts; }
     [[nodiscard]] const std::vector<PropertyValue>& technologyQueries() const
     {
         return _technologyQueries;
     }
-    // Absent values stand for commands that are no property lists.
+    // A command that is not a property list is an absent value.
     [[nodiscard]] const std::vector<PropertyValue>& startCommands() const { return _startCommands; }
 
-    // How many clients are connected to the server itself.
+    // The number of clients connected to the server port.
     [[nodiscard]] std::size_t clientCount() const { return _clients.size(); }
     [[nodiscard]] std::size_t channelCount() const { return _channels.size(); }
     // Names of the newest channel's ports, the server's and the client's; empty without a channel.
@@ -64,15 +64,15 @@ public:
     // Sends a message to the client's port of the newest channel, whether or not a start command
     // has come. False when there is no channel or nothing accepts on the port.
     bool sendLogMessage(ByteView data, std::int32_t messageId = 0);
-    // Sends a notification to every client; an absent info is left out.
+    // Sends a notification to every client, without the info if that is absent.
     void notify(const std::string& name, const PropertyValue& info = {});
     // Sends the bytes to every client as a message.
     void sendToClients(std::int32_t messageId, ByteView data);
-    // Ends every channel, while the server lives on.
+    // Closes every channel; the server goes on.
     void closeChannels();
-    // Closes everything, as at the end of the server's process.
+    // Closes everything, as the end of the server process does.
     void die();
-    // Listens again. False while something else has the name.
+    // Listens again. Returns false while something else uses the name.
     bool restart();
 
 private:

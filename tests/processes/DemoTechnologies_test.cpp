@@ -14,7 +14,7 @@ namespace
 
 using ::testing::HasSubstr;
 
-// A simulated phone and what is shown of it.
+// A simulated phone and the panes that it fills.
 struct Demo {
     const char* name;
     std::vector<std::string> filled; // panes that have rows
@@ -32,7 +32,7 @@ bool isFilled(const std::string& line, const std::string& pane)
     return at != std::string::npos && line.compare(at + start.size(), 1, "{") == 0;
 }
 
-// The whole way: a phone's packets over real ports, through the generator, into the panes.
+// The whole path: packets from a phone over real ports, through the generator, into the panes.
 class DemoTechnologiesTest : public ::testing::TestWithParam<Demo>
 {
 protected:

@@ -34,7 +34,7 @@ std::vector<std::string> exportArguments(std::vector<std::string> more)
     return all;
 }
 
-// One line on standard error, nothing on standard output.
+// Expects one line on standard error and none on standard output.
 void expectFailure(std::vector<std::string> arguments, int status)
 {
     ChildProcess program(exportArguments(std::move(arguments)));
@@ -130,7 +130,7 @@ TEST(ExportProgramTest, AFullDiskUnderTheOutputIsAFailure)
                                 "device; send it somewhere else\n");
 }
 
-// Both standard output and standard error of what `script` runs are a terminal.
+// `script` gives its command a terminal as standard output and standard error.
 TEST(ExportProgramTest, ProgressIsShownOnATerminalThatTheRowsDoNotGoTo)
 {
     const std::string command =

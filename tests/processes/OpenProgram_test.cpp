@@ -34,7 +34,7 @@ std::unique_ptr<ChildProcess> orvane(std::vector<std::string> arguments)
     return std::make_unique<ChildProcess>(all);
 }
 
-// Kilobytes that the process has in memory.
+// Resident memory of the process, in kilobytes.
 long residentKilobytes(pid_t pid)
 {
     std::ifstream status("/proc/" + std::to_string(pid) + "/status");
@@ -44,7 +44,7 @@ long residentKilobytes(pid_t pid)
     return 0;
 }
 
-// The LTE drive again and again, each round later than the one before, up to that many bytes.
+// Writes the LTE drive over and over, each round later than the last, up to that many bytes.
 std::string longDrive(const TemporaryDirectory& directory, std::size_t bytes)
 {
     const Bytes drive = readFile(recording("lte-drive.dlf")).value_or(Bytes());

@@ -26,7 +26,7 @@ using ::testing::IsEmpty;
 using ::testing::Not;
 using ::testing::StartsWith;
 
-// The programs, in a ports directory and a root of their own.
+// Runs the programs with their own ports directory and root.
 class ProgramTest : public ::testing::Test
 {
 protected:

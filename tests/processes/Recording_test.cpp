@@ -26,7 +26,7 @@ using ::testing::IsEmpty;
 using ::testing::Not;
 using ::testing::StartsWith;
 
-// A live view that records.
+// Records a live view.
 class RecordingProgramTest : public ::testing::Test
 {
 protected:
@@ -63,8 +63,8 @@ protected:
     {
         return telephonyd({"--replay", kDrive, "--speed", "max"});
     }
-    // What all rows show at the end of the log; without its time, which that of an item may be that
-    // was not asked for.
+    // Returns the values of all rows at the end of the log, without the time: an item that no
+    // section subscribes to may set the time.
     static std::string rowsAtTheEnd(const std::string& log)
     {
         ChildProcess exporting(
@@ -75,7 +75,7 @@ protected:
         const std::string& line = exporting.lines().front();
         return line.substr(std::min(line.find(','), line.size()));
     }
-    // Once that is what the recording shows.
+    // Waits until the recording ends with these rows; false after the time-out.
     bool waitForRows(const std::string& rows) const
     {
         const auto deadline = std::chrono::steady_clock::now() + 30s;
@@ -84,7 +84,7 @@ protected:
                 return false;
         return true;
     }
-    // Once the recording is longer than that.
+    // Waits until the recording is longer than that; false after the time-out.
     bool waitForMoreThan(std::size_t bytes) const
     {
         const auto deadline = std::chrono::steady_clock::now() + 30s;
@@ -180,7 +180,7 @@ TEST_F(RecordingProgramTest, AFileThatCannotBeMadeEndsItBeforeTheView)
 
 TEST_F(RecordingProgramTest, AFullDiskEndsTheRecordingWhileTheViewGoesOn)
 {
-    // The least that the shell can limit files to is 512 bytes.
+    // The shell counts file sizes in units of 512 bytes.
     std::vector<std::string> limited = {"/bin/sh", "-c", "ulimit -f 1; exec \"$0\" \"$@\""};
     for (const std::string& argument : viewerArguments({}))
         limited.push_back(argument);

@@ -20,7 +20,7 @@ namespace
 using ::testing::IsEmpty;
 using ::testing::StartsWith;
 
-// The server as a process, in a ports directory of its own.
+// Runs the server as a process with its own ports directory.
 class TelephonydProgramTest : public ::testing::Test
 {
 protected:
@@ -30,7 +30,7 @@ protected:
         all.insert(all.end(), arguments.begin(), arguments.end());
         return std::make_unique<ChildProcess>(all, std::vector{"ORVANE_PORTS=" + ports()});
     }
-    // The same, once clients can connect.
+    // Starts the server and waits until clients can connect.
     std::unique_ptr<ChildProcess> servingTelephonyd(std::vector<std::string> arguments)
     {
         arguments.insert(arguments.end(), {"--log", "stderr", "--log-level", "notice"});
@@ -44,7 +44,7 @@ protected:
             std::vector<std::string>{ORVANE_PROGRAM, "--ports", ports(), "--ui", "json",
                                      "--refresh", "0.1", "--log", "none"});
     }
-    // It ends with the status, nothing on standard output and one line on standard error.
+    // Expects it to end with the status, and to print one line, on standard error.
     void expectRefusal(const std::vector<std::string>& arguments, int status)
     {
         const auto server = telephonyd(arguments);

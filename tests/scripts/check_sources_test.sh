@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
-# tools/check-sources finds each kind of broken rule, names its place, and is content with the rest.
+# tools/check-sources finds each kind of broken rule, names its place, and reports nothing else.
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 
-# A small tree in which every rule is kept.
+# A small tree that keeps every rule.
 make_tree() {
     rm -rf "$scratch/tree"
     mkdir "$scratch/tree"

@@ -8,7 +8,7 @@ cp "$tree/check" "$copy/"
 cp "$tree/.ci/run" "$copy/.ci/"
 cp "$tree"/tools/* "$copy/tools/"
 
-# The tools that ./check calls, each noted down. FAIL names the call that fails.
+# Stand-ins for the tools that ./check calls; they record their calls. FAIL names the call that fails.
 note='
 call="$(basename "$0") $*"
 echo "$call" >>"$SCRATCH/calls"
@@ -25,7 +25,7 @@ stand_in "$scratch/bin" dpkg-query <<<$'shift 3\nprintf \'installed %s\\n\' "$@"
 stand_in "$scratch/bin" apt-get <<<"$note"
 stand_in "$scratch/bin" cmake <<<"[ \"\$1\" != --version ] || exec echo 'cmake version 3.25.1'
 $note"
-# Three cases pass; one more fails where the suite is to fail.
+# Three cases pass. A fourth fails if the suite is to fail.
 stand_in "$scratch/bin" ctest <<'END'
 echo "ctest $2" >>"$SCRATCH/calls"
 ! read -r line || echo "ctest reads $line" >>"$SCRATCH/calls"
@@ -42,10 +42,10 @@ if [ "ctest $2" = "${FAIL:-}" ]; then
 fi
 END
 
-# Runs ./check with the options given; its report, its last line and what it called.
+# Runs ./check with the options; sets its report, its last line and its calls.
 run_check() {
     : >"$scratch/calls"
-    # What was found by an earlier run must not count.
+    # Results of an earlier run must not count.
     mkdir -p "$copy/build/dev/Testing/Temporary" "$copy/build/coverage"
     echo "1:unit" >"$copy/build/dev/Testing/Temporary/LastTestsFailed.log"
     report=$(SCRATCH=$scratch PATH=$scratch/bin:$PATH "$copy/${script:-check}" "$@" 2>"$scratch/errors" <<<"typed")

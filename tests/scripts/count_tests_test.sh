@@ -3,19 +3,19 @@
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 results=$scratch/build/Testing/Temporary
 
-# A log as ctest writes it, of the tests added to it.
+# Begins a log like that of ctest.
 begin_log() {
     rm -rf "$scratch/build"
     mkdir -p "$results"
     echo "Start testing: Nov 21 10:00 UTC" >"$results/LastTest.log"
 }
 
-# add_test NAME: a test with standard input as its output.
+# add_test NAME: adds a test to the log with standard input as its output.
 add_test() {
     {
         printf '1/9 Testing: %s\n1/9 Test: %s\nCommand: "/x"\nOutput:\n-----\n' "$1" "$1"
         cat
-        # Also where the program could not be started.
+        # ctest writes this also if the program could not be started.
         printf '<end of output>\nTest time = 0.00 sec\n-----\nTest Passed.\n\n'
     } >>"$results/LastTest.log"
 }

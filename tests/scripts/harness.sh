@@ -8,7 +8,7 @@ scratch=$(mktemp -d)
 trap 'rm -rf "$scratch"' EXIT
 cases=0 failures=0
 
-# The case that the expectations below it belong to.
+# case_named NAME: starts a case; the expectations after it belong to it.
 case_named() {
     current=$1
     cases=$((cases + 1))
@@ -37,7 +37,7 @@ put() {
     cat >"$1"
 }
 
-# Makes a command of a folder that is to be first on the PATH: a script whose body is standard input.
+# stand_in FOLDER NAME: makes a command in the folder: a bash script whose body is standard input.
 stand_in() {
     { echo '#!/bin/bash' && cat; } | put "$1/$2"
     chmod +x "$1/$2"

@@ -9,7 +9,7 @@ if ! command -v git >/dev/null; then
     echo "git is not here"
     exit 77
 fi
-# Neither the repository of whoever runs the tests nor their settings.
+# Not the repository and the settings of the user who runs the tests.
 # shellcheck disable=SC2046
 unset $(git rev-parse --local-env-vars)
 export HOME=$scratch GIT_CONFIG_NOSYSTEM=1

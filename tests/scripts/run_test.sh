@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# ./run builds when there is something to build, keeps standard output for the program, and becomes it.
+# ./run builds what is out of date, leaves standard output to the program, and execs it.
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 unset CMAKE_CXX_COMPILER_LAUNCHER
 copy=$scratch/copy
@@ -48,7 +48,7 @@ chmod +x "$2/bin/orvane"
 END
 }
 
-# Starts ./run in the background with the arguments given, to know its process id.
+# Starts ./run in the background with the arguments, to know its process id.
 start() {
     : >"$scratch/calls"
     SCRATCH=$scratch PATH=$scratch/bin:$PATH "$copy/run" "$@" \
@@ -79,10 +79,10 @@ start open "a file.dlf" --ui text
 expect_equal "$output" "pid $pid in $scratch:"$'\n<open>\n<a file.dlf>\n<--ui>\n<text>\nread a line'
 expect_equal "$status|$calls|$errors" "7||"
 
-# expect_build WHAT COMMAND...: a start after that change builds anew, and the next one does not.
+# expect_build WHAT COMMAND...: the first start after that change builds, and the second does not.
 expect_build() {
     case_named "a start after $1 builds"
-    # As if the last build had been some time ago: a clock's ticks are too coarse for this test.
+    # Makes the last build old, since the resolution of file times is too coarse for this test.
     find "$copy" -exec touch -d '1 hour ago' {} +
     "${@:2}"
     start

@@ -1,9 +1,9 @@
 #!/usr/bin/env bash
-# tools/setup.sh installs what is missing and nothing else, and says what to do where it cannot.
+# tools/setup.sh installs only what is missing, and says what to do if it cannot.
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 bin=$scratch/bin
 
-# A machine of stand-ins alone: Debian with the packages given, somebody with that user id.
+# A machine made of stand-ins: Debian with the packages given, and a user with that id.
 machine() {
     rm -rf "$bin" "$scratch/installed" "$scratch/calls"
     local user=$1 tool
@@ -41,7 +41,7 @@ esac
 END
 }
 
-# Runs ensure_packages for the packages given; keeps what it says on either stream.
+# Runs ensure_packages for the packages; keeps what it prints on either stream.
 ensure() {
     output=$(SCRATCH=$scratch PATH=$bin "$bin/bash" -c '
         set -euo pipefail

@@ -7,7 +7,7 @@ namespace orvane
 
 // The path of a file below tests/data.
 std::string testDataPath(const std::string& fileName);
-// The folder of the resources that the program ships.
+// The folder of the shipped resources.
 std::string shippedResourcesPath();
 
 } // namespace orvane

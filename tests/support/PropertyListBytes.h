@@ -11,10 +11,10 @@
 namespace orvane
 {
 
-// An exactly sized copy, so that the address sanitizer sees one byte too many.
+// A copy of exactly that size, so that the address sanitizer finds a read one byte beyond it.
 inline Bytes bytesOf(std::string_view text) { return Bytes(text.begin(), text.end()); }
 
-// The bytes written as pairs of hexadecimal digits with a space between them.
+// Parses bytes from pairs of hexadecimal digits with a space between them.
 inline Bytes hexBytes(std::string_view pairs)
 {
     Bytes bytes;
@@ -35,10 +35,10 @@ inline std::string xmlList(std::string_view root)
     return "<plist version=\"1.0\">" + std::string(root) + "</plist>";
 }
 
-// Ways to spoil a byte: each bit alone, and several at once.
+// Masks that corrupt a byte: each bit alone, and several bits.
 constexpr int kFlippedBits[] = {1, 2, 4, 8, 16, 32, 64, 128, 0x0F, 0xF0, 0x7F, 0xFF};
 
-// Puts a binary property list together, object by object, well-formed or not.
+// Builds a binary property list object by object, well-formed or not.
 class BinaryListBuilder
 {
 public:
@@ -105,7 +105,7 @@ public:
             to.push_back(static_cast<std::uint8_t>(i < 8 ? number >> (8 * i) : 0));
     }
 
-    // The offset table, for tests that spoil it.
+    // The offset table, for tests that corrupt it.
     std::vector<std::size_t> offsets;
 
 private:

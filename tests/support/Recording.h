@@ -14,7 +14,7 @@
 namespace orvane
 {
 
-// A log that tests read.
+// A log that keeps its lines for tests.
 class RecordingLog final : public SystemLog
 {
 public:
@@ -38,7 +38,7 @@ public:
                 found.push_back(line.text);
         return found;
     }
-    // All lines in order, of whatever priority.
+    // All lines in order, of every priority.
     [[nodiscard]] std::vector<std::string> texts() const
     {
         std::vector<std::string> found;
@@ -64,7 +64,7 @@ public:
     std::vector<std::string> lines;
 };
 
-// Resources by "NAME.TYPE" that tests put in; their paths are "/resources/NAME.TYPE".
+// Resources that a test sets, by "NAME.TYPE"; their paths are "/resources/NAME.TYPE".
 class MemoryResources final : public Resources
 {
 public:
@@ -77,7 +77,7 @@ private:
     std::map<std::string, Bytes> _files;
 };
 
-// A clock at rest until a test turns it, with a zone that a test chooses.
+// A clock and a time zone that the test sets.
 class TestClock final : public Clock
 {
 public:
@@ -87,7 +87,7 @@ public:
     TimeZone zone;
 };
 
-// Puts recording services in place of the process's for as long as it lives.
+// Replaces the services of the process by recording ones during its lifetime.
 struct TestServices {
     TestServices();
     ~TestServices();
@@ -97,7 +97,7 @@ struct TestServices {
     RecordingLog log;
     RecordingConsole console;
     MemoryResources memoryResources;
-    // The resources that the program ships; useShippedResources() puts them in place.
+    // The shipped resources; useShippedResources() makes them current.
     DirectoryResources shippedResources;
     TestClock clock;
 

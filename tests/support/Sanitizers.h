@@ -1,7 +1,7 @@
 #pragma once
 
-// Whether the address sanitizer is built in. It keeps what was freed for a while, so that memory
-// seems to grow.
+// Whether the address sanitizer is built in. It delays the reuse of freed memory, so that resident
+// memory grows.
 #ifdef __has_feature
 #define ORVANE_ADDRESS_SANITIZER __has_feature(address_sanitizer)
 #elif defined(__SANITIZE_ADDRESS__)

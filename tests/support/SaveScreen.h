@@ -10,8 +10,8 @@
 namespace orvane
 {
 
-// The save screen's interface as a front end makes it from the file, without the parts whose names
-// are in `missing`.
+// The save screen's interface as a front end loads it from the file, without the parts named in
+// `missing`.
 inline std::unique_ptr<Interface> makeSaveScreen(const std::string& missing = "")
 {
     const auto background = std::make_shared<Control>();

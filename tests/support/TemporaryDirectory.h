@@ -8,7 +8,7 @@
 namespace orvane
 {
 
-// A new directory below the system's temporary one, removed with all it holds.
+// A new directory in the system's temporary directory; the destructor removes it and its content.
 class TemporaryDirectory
 {
 public:

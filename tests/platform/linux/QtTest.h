@@ -10,7 +10,7 @@
 namespace orvane
 {
 
-// A test within an event loop. What it waits for must come long before this limit.
+// A test with an event loop.
 class QtTest : public testing::Test
 {
 protected:

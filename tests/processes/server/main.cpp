@@ -1,6 +1,6 @@
-// A telephony server of its own process that misbehaves as told: scripted_server DIRECTORY MODE.
-// Prints a line for each start command. In the mode "other-ids" it sends messages with other ids
-// than 0, then one with 0; in "streaming" one message after each start command.
+// A telephony server that misbehaves as its mode says: scripted_server DIRECTORY MODE. Prints a
+// line for each start command, then sends one message with id 0. In the mode "other-ids" messages
+// with other ids come before it.
 
 #include "doubles/ScriptedTelephonyServer.h"
 #include "platform/base/TelephonyConstants.h"

@@ -184,7 +184,7 @@ void ChildProcess::sendSignal(int signal) const { ::kill(_pid, signal); }
 std::optional<int> ChildProcess::waitForEnd(std::chrono::milliseconds timeout)
 {
     const auto deadline = Clock::now() + timeout;
-    // The end of both streams comes no later than the end of the process.
+    // Both streams end before the process does, or with it.
     readUntil([this] { return _output < 0 && _error < 0; }, timeout);
     while (!_status) {
         int status = 0;

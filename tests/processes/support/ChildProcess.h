@@ -10,33 +10,33 @@
 namespace orvane
 {
 
-// A program run as a user runs it, with pipes at its three standard streams. Killed at the end if
-// it still runs.
+// Runs a program with pipes as its three standard streams. The destructor kills it if it still
+// runs.
 class ChildProcess
 {
 public:
-    // argv[0] is the program's path; `environment` are "NAME=VALUE" texts set in addition.
+    // arguments[0] is the program's path. Adds the "NAME=VALUE" texts to the environment.
     explicit ChildProcess(const std::vector<std::string>& arguments,
                           const std::vector<std::string>& environment = {});
     ~ChildProcess();
     ChildProcess(const ChildProcess&) = delete;
     ChildProcess& operator=(const ChildProcess&) = delete;
 
-    // Reads on until a line of standard output is accepted, and returns it; nothing when the
-    // program has closed its output or the time is over.
+    // Reads until a line of standard output is accepted, and returns it; nullopt when the program
+    // closes its output first or after the time-out.
     std::optional<std::string>
     waitForLine(const std::function<bool(const std::string&)>& accepts,
                 std::chrono::milliseconds timeout = std::chrono::seconds(30));
-    // The same for a line that holds the text.
+    // The same for a line that contains the text.
     std::optional<std::string>
     waitForText(const std::string& text,
                 std::chrono::milliseconds timeout = std::chrono::seconds(30));
-    // Reads on until standard error holds the text.
+    // Reads until standard error contains the text; false after the time-out.
     bool waitForError(const std::string& text,
                       std::chrono::milliseconds timeout = std::chrono::seconds(30));
 
-    // Waits, without reading, until the pipe at standard output of a program that writes without
-    // pause takes no more.
+    // Waits without reading until the pipe of standard output is full. The program must write
+    // without pause. False after the time-out.
     [[nodiscard]] bool
     waitForFullOutput(std::chrono::milliseconds timeout = std::chrono::seconds(30)) const;
 
@@ -44,11 +44,11 @@ public:
     void closeInput();
     void closeOutput();
     void sendSignal(int signal) const;
-    // The exit status, or minus the signal that ended it; nothing when it still runs at the end of
-    // the time. What it still writes is kept.
+    // Waits for the end and keeps what the program still writes. Returns the exit status, minus
+    // the signal number if a signal ended it, or nullopt after the time-out.
     std::optional<int> waitForEnd(std::chrono::milliseconds timeout = std::chrono::seconds(30));
 
-    // All lines of standard output so far, and all of standard error.
+    // What has been read so far: the lines of standard output, and standard error.
     [[nodiscard]] const std::vector<std::string>& lines() const { return _lines; }
     [[nodiscard]] const std::string& errors() const { return _errors; }
     [[nodiscard]] pid_t pid() const { return _pid; }

@@ -25,7 +25,7 @@ TEST(BackgroundJobTest, WhatIsTypedForTheShellDoesNotStopTheViewer)
     shell.send("until grep -q Serving " + directory.path() +
                "/out; do sleep 0.1; done; echo sh''ows\r");
     ASSERT_TRUE(shell.waitFor("shows")) << shell.screen();
-    // Typed while nobody but the job in the background waits for input.
+    // Typed while only the background job waits for input.
     shell.send("sleep 1; jobs; kill %1; wait; echo en''ded\r");
     shell.send("true\r");
     ASSERT_TRUE(shell.waitFor("ended")) << shell.screen();

@@ -8,7 +8,7 @@
 namespace orvane
 {
 
-// A terminal that is nothing but what it was shown last, and keys that a test presses.
+// A terminal that keeps the last grid shown, and returns the keys that a test presses.
 class GridDevice final : public TerminalDevice
 {
 public:
@@ -40,7 +40,7 @@ public:
     void retake() override { ++retakes; }
 
     [[nodiscard]] std::string text(int line) const { return shown.text(line); }
-    // All lines, the empty ones at the end left out.
+    // All lines except the empty ones at the end.
     [[nodiscard]] std::string screen() const
     {
         std::string all;
@@ -48,7 +48,7 @@ public:
             all += text(line) + "\n";
         return all;
     }
-    // The line that holds the text; -1 where none does.
+    // The number of the line that contains the text; -1 if there is none.
     [[nodiscard]] int lineOf(const std::string& part) const
     {
         for (int line = 0; line < shown.lines(); ++line)

@@ -27,7 +27,7 @@ using ::testing::EndsWith;
 using ::testing::HasSubstr;
 using ::testing::StartsWith;
 
-// What comes of a process of its own that does this at a terminal.
+// The result of running a function in a child process at a terminal.
 struct Outcome {
     std::string output;
     int status = 0; // as of waitpid()

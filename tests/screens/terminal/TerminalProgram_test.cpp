@@ -1,4 +1,4 @@
-// `orvane --ui terminal` as a person at a terminal meets it.
+// `orvane --ui terminal` as a user sees it.
 
 #include "processes/support/ChildProcess.h"
 #include "screens/terminal/LineWidth.h"
@@ -97,8 +97,8 @@ protected:
         if (hasFolder)
             fs::create_directories(root() + kSaveFolder);
     }
-    // The program sends a picture of the screen in pieces: whatever a test expects to see, it waits
-    // for.
+    // The program sends its screen in several writes, so a test must wait for all that it
+    // expects.
     static void expectShown(VirtualTerminal& terminal, const std::string& text)
     {
         EXPECT_TRUE(terminal.waitFor(text)) << text << " is not in\n" << terminal.screen();
@@ -113,8 +113,8 @@ protected:
         terminal.waitUntil([&] { return matcher.Matches(terminal.line(number)); });
         EXPECT_THAT(terminal.line(number), matcher);
     }
-    // Sends the key until the text is shown; for keys that a program may still drop. Each is left
-    // that time before the next.
+    // Sends the key again after each pause until the text is shown, for a state in which the
+    // program may drop keys.
     static bool sendUntilShown(VirtualTerminal& terminal, const std::string& key,
                                const std::string& text, std::chrono::milliseconds pause)
     {
@@ -126,7 +126,7 @@ protected:
         } while (std::chrono::steady_clock::now() < end);
         return false;
     }
-    // For a program that has ended: nothing is sent any more.
+    // Only for a program that has ended and sends nothing more.
     static void expectRestored(const VirtualTerminal& terminal)
     {
         EXPECT_FALSE(terminal.isOnOtherScreen());
@@ -175,7 +175,7 @@ TEST_F(TerminalProgramTest, EscapeLeadsBackWithoutNoticeableDelay)
 {
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
-    // On a busy machine one round may take long; with ncurses' own delay each takes a second.
+    // A busy machine can delay a round, but not all. ncurses' own delay is a second.
     constexpr int kRounds = 20;
     auto shortest = std::chrono::steady_clock::duration::max();
     for (int round = 0; round < kRounds && shortest >= 500ms; ++round) {
@@ -214,7 +214,7 @@ TEST_F(TerminalProgramTest, AnEndlessAnswerDoesNotKeepTheKeysForEver)
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     terminal->send(kEscape + ("]" + std::string(2000, 'x')));
-    // The answer ends with a pause of the keys.
+    // A pause ends the answer.
     EXPECT_TRUE(sendUntilShown(*terminal, "?", "filter as you type", 500ms)) << terminal->screen();
 }
 
@@ -349,8 +349,8 @@ TEST_F(TerminalProgramTest, ARefreshOfTheServingMeasurementsSendsLittle)
     ASSERT_TRUE(terminal->waitFor("Serving Cell Measurements"));
     terminal->send(std::string(kDown) + kEnter);
     ASSERT_TRUE(terminal->waitFor("Measured RSRP"));
-    // Until the status has told of five further seconds. There can't have been more refreshes than
-    // periods; a busy machine makes fewer.
+    // Waits until the time in the status has changed five times. There are at most as many
+    // refreshes as periods; a busy machine makes fewer.
     const auto start = std::chrono::steady_clock::now();
     const std::size_t before = terminal->received().size();
     for (int i = 0; i < 5; ++i) {

@@ -22,7 +22,7 @@
 namespace orvane
 {
 
-// Panes on a terminal's screen that is a grid, and somebody at its keys.
+// Shows panes on a terminal screen that is a grid, and presses keys.
 class TerminalScreenTest : public ::testing::Test, public Shell
 {
 protected:
@@ -64,7 +64,7 @@ protected:
             rows.emplace_back("Row " + std::to_string(i), "value " + std::to_string(i));
         return rows;
     }
-    // As the shell does after a refresh of the model.
+    // Does what the shell does after a refresh of the model.
     void refresh(const std::vector<Row>& rows)
     {
         PathDictionary paths;
@@ -103,7 +103,7 @@ protected:
         screen->sizeHasChanged();
         queue.runPending();
     }
-    // The text of the selected line; empty where there is none.
+    // The text of the selected line; empty if no line is selected.
     [[nodiscard]] std::string selected() const
     {
         for (int line = 0; line < device.shown.lines(); ++line)

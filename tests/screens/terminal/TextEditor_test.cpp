@@ -23,7 +23,7 @@ protected:
     {
         return editor.take(keyOfCharacter(static_cast<char32_t>(letter) & 0x1F));
     }
-    // The field of ten columns, and where the cursor is in it.
+    // The text in a field of ten columns, and the cursor's column.
     std::pair<std::string, int> drawn()
     {
         Canvas canvas;

@@ -54,7 +54,7 @@ struct VirtualTerminal::State {
         vterm_screen_get_cell(screen, {line, column}, &cell);
         return cell;
     }
-    // That of the text's first character; nothing where it is not shown.
+    // The cell of the text's first character; nullopt if the text is not on the screen.
     [[nodiscard]] std::optional<VTermScreenCell> cellOf(const VirtualTerminal& terminalOf,
                                                         const std::string& text) const
     {
@@ -187,7 +187,7 @@ bool VirtualTerminal::waitUntil(const std::function<bool()>& isTrue,
 
 std::optional<int> VirtualTerminal::waitForEnd(std::chrono::milliseconds timeout)
 {
-    // Until the program has closed its end; what it wrote is kept.
+    // Until the program closes its end. Its output is kept.
     waitUntil([this] { return _state->isClosed; }, timeout);
     int status = 0;
     if (!_state->status &&

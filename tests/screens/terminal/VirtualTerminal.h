@@ -11,14 +11,14 @@
 namespace orvane
 {
 
-// A program in a pseudo-terminal, and what its terminal shows. Killed at the end if it still runs.
+// Runs a program in a pseudo-terminal and shows its screen. The destructor kills the program.
 class VirtualTerminal
 {
 public:
     static constexpr std::chrono::seconds kPatience{30};
 
-    // argv[0] is the program's path or a name on PATH; `environment` are "NAME=VALUE" texts set in
-    // addition, "NAME" removes one.
+    // arguments[0] is the program's path or a name on PATH. In `environment`, "NAME=VALUE" sets a
+    // variable and "NAME" removes one.
     VirtualTerminal(const std::vector<std::string>& arguments,
                     const std::vector<std::string>& environment, int lines = 24, int columns = 80);
     ~VirtualTerminal();
@@ -29,7 +29,7 @@ public:
     void resize(int lines, int columns);
     void sendSignal(int signal) const;
 
-    // Shows what comes until that is true; false when the time is over or the program has gone.
+    // Shows the output until that is true; false after the time-out or when the program ends.
     bool waitUntil(const std::function<bool()>& isTrue,
                    std::chrono::milliseconds timeout = kPatience);
     bool waitFor(const std::string& text)
@@ -40,14 +40,14 @@ public:
     {
         return waitUntil([&] { return !shows(text); });
     }
-    // The exit status, or minus the signal that ended it; nothing when it still runs.
+    // The exit status, or minus the signal that ended it; nullopt after the time-out.
     std::optional<int> waitForEnd(std::chrono::milliseconds timeout = kPatience);
 
     [[nodiscard]] std::string line(int number) const;
-    // All lines, blanks at their ends left out.
+    // All lines without trailing blanks.
     [[nodiscard]] std::string screen() const;
     [[nodiscard]] bool shows(const std::string& text) const;
-    // How the character at the first place of the text looks.
+    // The look of the first character of the text, where the text is first on the screen.
     [[nodiscard]] bool isBold(const std::string& text) const;
     [[nodiscard]] bool isReversed(const std::string& text) const;
     [[nodiscard]] bool isColoured(const std::string& text) const;
@@ -59,7 +59,7 @@ public:
     // Whether the terminal echoes and edits lines, as a shell expects it.
     [[nodiscard]] bool isInLineMode() const;
 
-    // Everything that the program has sent.
+    // All bytes that the program sent.
     [[nodiscard]] const std::string& received() const;
 
 private:

@@ -10,7 +10,7 @@ namespace orvane
 namespace
 {
 
-// Rows of one identifier; counts the cells that it had to make.
+// Rows of one identifier; counts the cells that it created.
 class Rows final : public TableViewDataSource, public TableViewDelegate
 {
 public:

@@ -26,7 +26,7 @@ protected:
     }
     [[nodiscard]] FlatButton& back() const { return frame().titleBar().backButton(); }
     void open() { clickRow(1); }
-    // With one finger that is still down; in the window's coordinates, which no pane moves.
+    // Leaves the finger down. In the window's coordinates, which do not move with a pane.
     void swipe(int from, int to)
     {
         QTest::touchEvent(&table(), touchScreen()).press(0, {from, kSwipeY}, &frame());

@@ -31,7 +31,7 @@ protected:
     }
 };
 
-// For as long as it lives, the desktop's palette.
+// Sets the desktop's palette during its lifetime.
 class DarkDesktop
 {
 public:

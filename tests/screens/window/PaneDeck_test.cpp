@@ -17,7 +17,7 @@ namespace
 
 using namespace std::chrono_literals;
 
-// Animations that go on only when a test says so.
+// Animations that only a test advances.
 class SteppedAnimations final : public QAnimationDriver
 {
 public:
@@ -32,7 +32,7 @@ public:
     [[nodiscard]] qint64 elapsed() const override { return _elapsed.count(); }
 
 protected:
-    // Qt counts from the start of the first animation of several.
+    // Qt counts the time from the start of the first of overlapping animations.
     void start() override
     {
         _elapsed = {};
@@ -56,7 +56,7 @@ protected:
         show(rootNode({groupNode("Group", {valueNode("Key", "1")})}));
     }
     [[nodiscard]] PaneDeck& deck() const { return frame().deck(); }
-    // Steps to the end of a slide.
+    // Advances to the end of the slide.
     void endSlide()
     {
         for (int i = 0; i < 100 && deck().isSliding(); ++i)

@@ -18,8 +18,8 @@ namespace
 
 using namespace std::chrono_literals;
 
-// The pictures of the docs, of a recorded drive, written to the directory that ORVANE_PICTURES
-// names; without it, the windows are drawn all the same.
+// Draws the pictures of the docs from a recorded drive, and writes them to the directory in
+// ORVANE_PICTURES if that is set.
 class PicturesTest : public WindowedApplication
 {
 protected:
@@ -45,7 +45,7 @@ protected:
         }
     }
 
-    // The program after so many seconds of the drive.
+    // Runs the program for that many seconds of the drive.
     void drive(double seconds = 60)
     {
         launch();

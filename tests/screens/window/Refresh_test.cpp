@@ -12,7 +12,7 @@ namespace orvane
 namespace
 {
 
-// Counts what is drawn of the widget and what is below it.
+// Counts the paint events of a widget and of its children.
 class PaintCounter final : public QObject
 {
 public:

@@ -102,7 +102,7 @@ TEST_F(TableTouchTest, PanGoesOnWithMomentumAndATouchStopsIt)
 {
     const QPoint place = middleOf(9);
     const QScroller& scroller = *QScroller::scroller(&table());
-    // On a busy machine a finger may stand still for too long, or the momentum be over too soon.
+    // On a busy machine the finger may be too slow for momentum, or the momentum end too soon.
     constexpr int kAttempts = 50;
     bool isInMotion = false;
     for (int attempt = 0; attempt < kAttempts && !isInMotion; ++attempt) {

@@ -33,7 +33,7 @@ NodePointer manyRows(int count)
     return rootNode(std::move(rows));
 }
 
-// The frame of the row's label of that text, in the row's coordinates.
+// The frame of the label with that text, in the row's coordinates.
 QRectF frameOf(const RowWidget& row, const QString& text)
 {
     for (const DrawnLabel& label : row.content().labels)

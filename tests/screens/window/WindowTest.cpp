@@ -31,7 +31,7 @@ NodePointer childAt(const NodePointer& node, std::string_view path)
     return nullptr;
 }
 
-// Qt's application object, on the platform without a display, around all tests.
+// Qt's application object for all tests, on the platform without a display.
 class WindowEnvironment final : public testing::Environment
 {
 public:

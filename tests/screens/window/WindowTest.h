@@ -29,24 +29,24 @@
 namespace orvane
 {
 
-// For QTest's touches.
+// The device of QTest's touch events.
 QPointingDevice* touchScreen();
 
-// Serves whatever there is to serve now.
+// Processes all pending events.
 void turnEvents();
-// Serves events until that is true; false after half a minute.
+// Processes events until that is true; false after 30 seconds.
 bool turnEventsUntil(const std::function<bool()>& done);
 
-// What is on the screen of the widget, at that many pixels a point.
+// Renders the widget at that many pixels a point.
 QImage pictureOf(QWidget& widget, double scale = 1);
 
 NodePointer valueNode(const std::string& name, const std::string& value);
 NodePointer groupNode(const std::string& name, std::vector<NodePointer> children);
-// The tree that a refresh brings.
+// A tree as a refresh makes it.
 NodePointer rootNode(std::vector<NodePointer> children);
 
-// Panes in the real window, 360 points wide and 640 high, that a test feeds with nodes. Nothing
-// slides unless a test says so.
+// Shows panes of a test's nodes in the real window, 360 points wide and 640 high. Animations are
+// off by default.
 class WindowTest : public ::testing::Test, public Shell
 {
 protected:
@@ -55,9 +55,9 @@ protected:
 
     static QtScreen::Settings stillSettings();
 
-    // Opens the window with one pane, on that node.
+    // Opens the window with one pane that shows the node.
     void show(NodePointer root);
-    // Gives each pane of the stack the node of its path, as after a refresh, and draws it.
+    // Reloads each pane with the node of its path, as a refresh does, and draws it.
     void refresh(const NodePointer& root);
     void setStatus(const std::string& text, bool isBusy);
 
@@ -69,7 +69,7 @@ protected:
     [[nodiscard]] WindowFrame& frame() const { return screen.frame(); }
     [[nodiscard]] OrvaneSaveViewController* saveScreen() const { return _saveScreen.get(); }
 
-    // With the mouse, in the middle of the row.
+    // Clicks with the mouse in the middle of the row.
     void clickRow(std::size_t index);
     [[nodiscard]] QPoint middleOf(std::size_t index) const;
 

@@ -15,7 +15,7 @@
 namespace orvane
 {
 
-// The application in its window, on a telephony server that answers by a script.
+// Runs the application in its window with a scripted telephony server.
 class WindowedApplication : public ::testing::Test
 {
 protected:
@@ -49,7 +49,7 @@ protected:
     }
     [[nodiscard]] WindowFrame& frame() const { return screen.frame(); }
     [[nodiscard]] TableWidget& table() const { return frame().deck().top()->table(); }
-    // The index of the row of that key; the number of rows where there is none.
+    // The index of the row with that key; the number of rows if there is none.
     [[nodiscard]] std::size_t rowOf(const QString& key) const
     {
         std::size_t row = 0;
