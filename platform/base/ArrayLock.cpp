@@ -28,9 +28,9 @@ void ArrayLock::lockArray()
 
 void ArrayLock::unlockArray()
 {
-    // Nested calls acquire the lock several times but release it only once, when the outermost pair
-    // ends. This is meant: every user runs on the main thread, so the lock that stays held is held
-    // by its only user.
+    // Deliberate: nested calls acquire the lock several times and release it once, when the
+    // outermost pair ends. The lock that stays held blocks nobody, since all users run on the main
+    // thread.
     if (--depth == 0)
         arrayMutex().unlock();
 }

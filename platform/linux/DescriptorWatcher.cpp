@@ -13,7 +13,7 @@ DescriptorWatcher::DescriptorWatcher(int descriptor, For what, std::function<voi
     : _notifier(new Notifier{QSocketNotifier(
           descriptor, what == For::Reading ? QSocketNotifier::Read : QSocketNotifier::Write)})
 {
-    // The connection keeps the callback until it has returned, should it destroy the notifier.
+    // The connection holds the callback until it has returned: it may destroy the notifier.
     QObject::connect(&_notifier->notifier, &QSocketNotifier::activated, &_notifier->notifier,
                      std::move(callback));
 }

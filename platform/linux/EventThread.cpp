@@ -19,8 +19,7 @@
 namespace orvane
 {
 
-// The threads share nothing but this, and Qt objects never: the thread is stopped through a
-// descriptor of its own.
+// All that the two threads share. They share no Qt object: a descriptor stops the thread.
 struct EventThread::State {
     FileDescriptor stopRequest;
     std::mutex mutex;
@@ -82,7 +81,7 @@ void EventThread::stop()
     if (!_state->thread.joinable())
         return;
     const std::uint64_t one = 1;
-    // Only a counter that is full already could refuse it.
+    // Fails only where the counter is full, and then the thread is being woken already.
     [[maybe_unused]] const auto written = ::write(_state->stopRequest.get(), &one, sizeof one);
     _state->thread.join();
 }

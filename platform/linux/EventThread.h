@@ -13,7 +13,7 @@ namespace orvane
 class EventThread
 {
 public:
-    // Makes, inside the thread, what lives there. The queue outlives what is returned.
+    // Called inside the thread: makes the object that lives there. The queue outlives that object.
     using SetUp = std::function<std::shared_ptr<void>(MainQueue&)>;
 
     // Starts the thread and returns once `setUp` has returned. What `setUp` throws is thrown here.

@@ -17,15 +17,14 @@ namespace
 
 using SteadyClock = std::chrono::steady_clock;
 
-// As much as one wake-up reads. Larger blocks make frames wait in this process rather than in the
-// socket, and timers wait for the frames.
+// Read at most by one wake-up. With larger blocks timers would wait longer for the frames in them.
 constexpr std::size_t kReadBlockBytes = 128U * 1024;
-// As much as is kept for a frame callback to come.
+// Bytes held at most while there is no frame callback.
 constexpr std::size_t kHeldBytesLimit = 256U * 1024;
-// Frames of one turn are written together up to this.
+// From here on the frames of one turn are written before its end.
 constexpr std::size_t kWriteTogetherBytes = 64U * 1024;
 
-// One block for all connections of a thread: it is empty again when the read has returned.
+// One block serves all connections of a thread: its bytes are copied out after each read.
 Bytes& readBlock()
 {
     thread_local Bytes block(kReadBlockBytes);
@@ -43,7 +42,7 @@ void FrameStream::start()
         });
 }
 
-// The queue dies with the stream, so that the plain pointer is safe until the step begins.
+// The plain pointer is safe until the step begins: the queue ends with the stream.
 void FrameStream::later(void (FrameStream::*step)())
 {
     _queue.async([this, step] {
@@ -177,7 +176,7 @@ void FrameStream::readable()
     settle(received);
 }
 
-// What there is to do once all frames read so far are delivered.
+// Called once all frames read so far are delivered: ends the stream where nothing more can come.
 void FrameStream::settle(Received last)
 {
     if (!_socket)
@@ -238,7 +237,7 @@ void FrameStream::abandon()
     _drainedCallback = nullptr;
 }
 
-// The events that came on the socket by the deadline; none if nothing did.
+// Returns the events on the socket, waiting until the deadline; 0 if there were none.
 short FrameStream::waitForEvents(SteadyClock::time_point deadline) const
 {
     using std::chrono::milliseconds;
@@ -255,7 +254,7 @@ void FrameStream::keepDeliveredFrame()
     if (_deliveries == 0)
         return;
     FrameReader copy = _in;
-    std::swap(copy, _in); // the frame stays where it is, and reading goes on in the copy
+    std::swap(copy, _in); // the frame keeps its place, and the copy takes what is read next
     _keptReaders.push_back(std::move(copy));
 }
 
@@ -275,7 +274,7 @@ bool FrameStream::waitUntil(const std::function<bool()>& done, std::chrono::mill
         if (!_writeBlocked)
             flush(); // what callbacks have sent meanwhile
 
-        // What is there already still counts, however late it is.
+        // One more look after the deadline: what has arrived by then counts.
         isLate = SteadyClock::now() >= deadline;
         const short events = waitForEvents(deadline);
         if ((events & POLLOUT) != 0)

@@ -16,15 +16,15 @@
 namespace orvane
 {
 
-// What is behind a SocketConnection. Apart from it because a callback may destroy the connection:
-// whatever calls one keeps the stream until it has returned.
+// The implementation of SocketConnection. A class of its own, since a callback may destroy the
+// connection: whoever calls one holds the stream until the callback has returned.
 class FrameStream : public std::enable_shared_from_this<FrameStream>
 {
 public:
     using FrameCallback = std::function<void(const FrameReader::View&)>;
 
     explicit FrameStream(FileDescriptor socket) : _socket(std::move(socket)) {}
-    // Watches the socket. Apart from the constructor, which has no shared pointer yet.
+    // Starts watching the socket. Not in the constructor, where there is no shared pointer yet.
     void start();
 
     void setFrameCallback(FrameCallback callback);
@@ -60,7 +60,7 @@ private:
     void tellDrained();
     void later(void (FrameStream::*step)());
     short waitForEvents(std::chrono::steady_clock::time_point deadline) const;
-    // Before a wait reads on within a frame's delivery.
+    // Called before a wait inside a frame callback reads more: keeps that frame's bytes in place.
     void keepDeliveredFrame();
 
     FileDescriptor _socket; // none once closed
@@ -81,7 +81,7 @@ private:
     int _waits = 0;             // calls of waitUntil() under way
     int _deliveries = 0;        // calls of the frame callback under way
     std::size_t _heldBytes = 0; // read while there was no frame callback
-    // What frames that are being delivered point into, when a wait within reads on.
+    // The bytes of frames that are being delivered while a wait inside their callback reads more.
     std::vector<FrameReader> _keptReaders;
 
     QtMainQueue _queue; // what is put off until the loop's next turn

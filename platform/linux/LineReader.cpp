@@ -78,7 +78,7 @@ LineReader::LineReader(int descriptor, LineCallback lineCallback, EndCallback en
     _state->descriptor = descriptor;
     _state->lineCallback = std::move(lineCallback);
     _state->endCallback = std::move(endCallback);
-    // What the loop calls keeps the state while it runs, should a callback destroy the reader.
+    // Calls from the loop hold the state while they run: a callback may destroy the reader.
     const std::weak_ptr weak(_state);
     if (::fcntl(descriptor, F_GETFD) < 0) {
         _state->queue.async([weak] {

@@ -16,8 +16,8 @@ namespace
 
 void discardMessage(QtMsgType, const QMessageLogContext&, const QString&) {}
 
-// Qt tells on standard error that it has left a locale without UTF-8 for one with it; nobody needs
-// to know, and the programs' standard error is for their users.
+// Drops Qt's line on standard error about changing to a locale with UTF-8. The programs' standard
+// error is for their users.
 std::unique_ptr<QCoreApplication> makeApplication(int& argumentCount, char** arguments)
 {
     const QtMessageHandler earlier = qInstallMessageHandler(discardMessage);
@@ -75,7 +75,7 @@ bool QtEventLoop::runUntil(const std::function<bool()>& done, std::chrono::milli
     alarm.setTimerType(Qt::PreciseTimer);
     alarm.start(std::clamp(timeout, std::chrono::milliseconds{0},
                            std::chrono::milliseconds{std::chrono::hours(24)}));
-    // Not every kind of dispatcher returns after the tasks that made `done` true.
+    // Some dispatchers do not return after the task that made `done` true.
     auto* dispatcher = QAbstractEventDispatcher::instance();
     QObject::connect(dispatcher, &QAbstractEventDispatcher::aboutToBlock, &alarm, [&] {
         if (done())

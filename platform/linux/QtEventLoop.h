@@ -18,12 +18,12 @@ public:
     QtEventLoop(const QtEventLoop&) = delete;
     QtEventLoop& operator=(const QtEventLoop&) = delete;
 
-    // Runs until quit(), and returns its code: at once if quit() came before.
+    // Runs until quit() and returns its code; returns at once if quit() was called before.
     int run();
     // Ends run() as soon as what is under way has returned.
     void quit(int code = 0);
-    // Runs until `done` is true or the time is over; returns what `done` then says. `done` is asked
-    // after whatever the loop has served.
+    // Runs until `done` is true or the time is over; returns what `done` then says. Calls `done`
+    // after each event.
     bool runUntil(const std::function<bool()>& done, std::chrono::milliseconds timeout);
 
 private:

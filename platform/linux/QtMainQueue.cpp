@@ -38,7 +38,7 @@ SteadyClock::time_point deadlineAfter(nanoseconds delay)
 
 } // namespace
 
-// Qt's side of a queue. Its end drops the events posted to it and stops its timers.
+// The QObject of a queue. Its destructor drops the events posted to it and stops its timers.
 class QtMainQueue::Receiver final : public QObject
 {
 public:

@@ -8,9 +8,9 @@ namespace orvane
 // The queue of the thread that makes it, on that thread's Qt event loop. Make it after the thread's
 // QtEventLoop (an EventThread makes its own); several queues in one thread share the loop.
 //
-// Times are kept to the millisecond and never early. A repeating timer keeps to its grid: a late
-// call does not shift later ones, and calls that were missed altogether do not come. An interval
-// below one millisecond gives a call a millisecond. Timers that outlive the queue are harmless.
+// Calls come with the precision of a millisecond and never early. A late call of a repeating timer
+// does not delay the next ones, and a call that was missed altogether does not come. An interval
+// below one millisecond counts as one. A timer may outlive the queue and then does nothing.
 class QtMainQueue final : public MainQueue
 {
 public:

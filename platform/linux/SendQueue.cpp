@@ -19,7 +19,7 @@ constexpr std::size_t kKeptCapacity = 256U * 1024;
 void SendQueue::add(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
                     ByteView data)
 {
-    // Only when half is written, so that the moving stays in proportion to the writing.
+    // Only once half is written: the bytes moved stay in proportion to those written.
     if (_start > _bytes.size() / 2) {
         _bytes.erase(_bytes.begin(), _bytes.begin() + static_cast<std::ptrdiff_t>(_start));
         _start = 0;

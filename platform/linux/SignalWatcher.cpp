@@ -31,7 +31,7 @@ void handleSignal(int signal)
 {
     const int savedErrno = errno;
     const auto number = static_cast<unsigned char>(signal);
-    // A pipe that is full holds this signal's number already, or enough others to wake the loop.
+    // A full pipe has enough in it to wake the loop.
     [[maybe_unused]] const auto written =
         ::write(pipes[static_cast<std::size_t>(signal)].load() - 1, &number, 1);
     errno = savedErrno;

@@ -9,17 +9,17 @@ namespace orvane
 {
 
 // Turns signals of the process into calls from the event loop of the thread that makes it. While it
-// lives the signals do nothing else; its end restores what was set before. Watchers of the same
-// signal end in the reverse order of their making.
+// lives the signals do nothing else; its destructor restores what was set before. Watchers of the
+// same signal must be destroyed in the reverse order of their construction.
 class SignalWatcher
 {
 public:
-    // One call for each signal that arrives; the same signal coming twice before the loop gets to
-    // it may be one call. The callback may destroy the watcher.
+    // Called for each signal that arrives. A signal that arrives twice before the loop handles it
+    // may give one call. The callback may destroy the watcher.
     using Callback = std::function<void(int signal)>;
 
-    // `EndsProgram`: once one of the signals has come, another SIGINT or SIGTERM does what it did
-    // before the watcher, whether or not the loop has heard of the first one.
+    // What a second signal does. `EndsProgram`: after the first signal, SIGINT and SIGTERM do what
+    // they did before the watcher was made, even if the loop has not run since.
     enum class Second { IsCalledToo, EndsProgram };
 
     // Throws std::system_error when the process has run out of descriptors, and

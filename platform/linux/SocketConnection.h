@@ -7,12 +7,12 @@
 namespace orvane
 {
 
-// Frames over a connected socket that does not block. What SocketTransport makes.
+// Frames over a connected socket that does not block. Made by SocketTransport.
 //
 // A wake-up of the event loop reads one block, so that timers run between the blocks of a peer that
-// never pauses. The frames sent in one turn of the loop are written together at its end, earlier
-// once they are many: in a turn of its own a frame waits no longer for that than for a write of its
-// own, and under load one write carries hundreds.
+// never pauses. The frames sent in one turn of the loop are written together at its end, or earlier
+// once they are many. This adds no latency to a single frame, and under load one write carries
+// hundreds.
 class SocketConnection final : public FrameConnection
 {
 public:

@@ -19,7 +19,7 @@ namespace
 
 using ConnectionCallback = std::function<void(std::unique_ptr<FrameConnection>)>;
 
-// Callers wait in the socket until there is a connection callback.
+// Callers wait in the socket's backlog until there is a connection callback.
 class SocketListener final : public FrameListener
 {
 public:
@@ -97,7 +97,7 @@ bool isUsable(const std::string& name, std::string& error)
     return false;
 }
 
-// None, with the reason in `error`, where nobody who is trusted accepts on the name.
+// Returns none, with the reason in `error`, where nobody who is trusted accepts on the name.
 FileDescriptor connectedSocket(const PortsDirectory& directory, const std::string& name,
                                std::string& error)
 {

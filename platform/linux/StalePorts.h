@@ -10,7 +10,7 @@ namespace orvane
 
 // What killed programs leave in a ports directory.
 
-// Files whose names begin so are none of a port: sockets before their publication, and stale ones
+// Begins the names of files that are not ports: sockets before their publication, and stale ones
 // that were moved aside.
 inline constexpr char kUnpublishedPrefix = '~';
 
@@ -22,7 +22,7 @@ bool isStaleSocket(const std::string& path);
 
 enum class StalePorts {
     Clients, // ports that viewers have made
-    All,     // beside those the channels' ports; for the running telephony server alone
+    All,     // also the channels' ports; only the running telephony server may remove them
 };
 
 // Removes stale sockets: the effective user's own, or in a directory of his everybody's; and

@@ -11,7 +11,7 @@ namespace orvane
 
 void prepareStandardDescriptors()
 {
-    // The lowest free number is taken, so going upwards fills each gap with itself.
+    // open() takes the lowest free number: in ascending order that is the missing one.
     for (const int descriptor : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
         if (::fcntl(descriptor, F_GETFD) < 0 && errno == EBADF) [[maybe_unused]]
             const int opened = ::open("/dev/null", O_RDWR);

@@ -3,10 +3,10 @@
 namespace orvane
 {
 
-// What a program does first: opens /dev/null for each of standard input, output and error that it
-// was started without, so that no file or socket of its own takes that number and is written or
-// read by mistake; and ignores SIGPIPE and SIGXFSZ, so that a reader that leaves, or a file that
-// may not grow further, is seen as an error of the write.
+// The first call of a program. Opens /dev/null for each of standard input, output and error that is
+// not open: otherwise a file or socket of the program could get that number and be read or written
+// by mistake. Ignores SIGPIPE and SIGXFSZ, so that a closed pipe and the limit of a file's size are
+// errors of the write.
 void prepareStandardDescriptors();
 
 } // namespace orvane

@@ -11,7 +11,7 @@ namespace
 constexpr std::uint32_t kWantsReply = 1;
 constexpr std::uint32_t kIsReply = 2;
 constexpr std::size_t kLengthBytes = 4;
-// A buffer that one long message has made larger than this is given back once it is read.
+// A buffer larger than this is freed once its frames are read.
 constexpr std::size_t kKeptCapacity = 256U * 1024;
 
 void append32(Bytes& to, std::uint32_t value)
@@ -50,8 +50,8 @@ void FrameReader::append(ByteView bytes)
     _buffer.insert(_buffer.end(), bytes.begin(), bytes.end());
 }
 
-// Waiting until half of the buffer is read keeps the moving of the rest in proportion to what was
-// read, whatever the sizes of frames and reads.
+// Moves the rest only once half of the buffer is read: the bytes moved stay in proportion to those
+// read.
 void FrameReader::discardRead()
 {
     if (_start == 0 || _start < _buffer.size() - _start)

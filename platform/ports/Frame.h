@@ -11,8 +11,8 @@ namespace orvane
 
 // One message on a connection: a 16-byte header (length of the data, message id, serial, flags; all
 // 32-bit little-endian), then the data. Flag bit 0 says that a reply is wanted, bit 1 that this is
-// a reply. The other bits are written as 0 and not looked at when reading, so that a later version
-// may give them a meaning that older readers can do without.
+// a reply. The other bits are written as 0 and ignored when read, so that a later version may use
+// them for what older readers do not need.
 struct Frame {
     std::int32_t messageId = 0;
     std::uint32_t serial = 0; // chosen by the sender; a reply carries its request's
@@ -29,15 +29,15 @@ void appendFrame(Bytes& to, std::int32_t messageId, std::uint32_t serial, bool w
                  bool isReply, ByteView data);
 
 // Cuts a byte stream into frames, however the stream is split. Holds only bytes that it was given:
-// an announced length takes no memory before the bytes come. Each byte is moved a bounded number of
+// an announced length takes no memory in advance. Each byte is moved a bounded number of
 // times, also where one append() brings many small frames.
 class FrameReader
 {
 public:
-    // Adds bytes of the stream. Nothing is taken once the reader has failed.
+    // Adds bytes of the stream. Does nothing once the reader has failed.
     void append(ByteView bytes);
-    // The next whole frame, or nothing until more bytes come. The view in `data` of the returned
-    // frame is valid until the next append() or next().
+    // Returns the next whole frame, or nullopt until more bytes come. The view in `data` is valid
+    // until the next append() or next().
     struct View {
         std::int32_t messageId;
         std::uint32_t serial;

@@ -13,15 +13,16 @@
 namespace orvane
 {
 
-// A stream of frames to and from one peer, driven by the thread's event loop: nothing here waits.
+// A stream of frames to and from one peer, driven by the thread's event loop. Only
+// waitUntil() waits.
 // Message ports and the telephony server are both built on it.
 class FrameConnection
 {
 public:
     virtual ~FrameConnection() = default;
 
-    // Called for every frame that arrives. Neither this nor the next is called from within a call
-    // of the owner, and a callback may destroy the connection.
+    // Called for every frame that arrives. Neither this callback nor the next one comes from within
+    // a call of the owner. A callback may destroy the connection.
     virtual void setFrameCallback(std::function<void(const FrameReader::View&)> callback) = 0;
     // Called once when the peer has closed or the transport has failed, not after close().
     virtual void setClosedCallback(std::function<void()> callback) = 0;
@@ -29,12 +30,12 @@ public:
     virtual void setDrainedCallback(std::function<void()> callback) = 0;
 
     [[nodiscard]] virtual bool isOpen() const = 0;
-    // Queues a frame; what the peer does not take at once is sent as it reads. False when closed.
+    // Queues a frame, which is sent as the peer reads. Returns false when closed.
     // The data must be within kFrameDataLimit (std::length_error otherwise).
     virtual bool send(std::int32_t messageId, std::uint32_t serial, bool wantsReply, bool isReply,
                       ByteView data) = 0;
-    // Takes back the frame queued last, if none of its bytes has been written yet. False when some
-    // have been, or where the transport cannot: the frame then stays queued.
+    // Takes back the frame queued last if none of its bytes has been written. Returns false when
+    // some have been, or where the transport cannot take back frames; the frame then stays queued.
     virtual bool withdrawLast() { return false; }
     [[nodiscard]] virtual std::size_t queuedBytes() const = 0;
     // The number of the frame that has arrived in part, the connection's first being 0; nullopt
@@ -63,10 +64,10 @@ class FrameTransport
 {
 public:
     virtual ~FrameTransport() = default;
-    // Null, with the reason in `error`, when the name is unusable, too long for a socket address,
-    // or a live listener has it. A stale name is taken over.
+    // Returns null, with the reason in `error`, when the name is unusable, too long for a socket
+    // address, or a live listener has it. A stale name is taken over.
     virtual std::unique_ptr<FrameListener> listen(const std::string& name, std::string& error) = 0;
-    // Null, with the reason in `error`, when nothing accepts on the name.
+    // Returns null, with the reason in `error`, when nothing accepts on the name.
     virtual std::unique_ptr<FrameConnection> connect(const std::string& name,
                                                      std::string& error) = 0;
 };

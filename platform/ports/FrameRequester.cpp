@@ -9,7 +9,7 @@ namespace orvane
 namespace
 {
 
-// Replies that a peer may leave unread: one of the largest size and what follows it.
+// Bytes of replies that a peer may leave unread: room for two of the largest.
 constexpr std::size_t kUnreadLimit = 2 * kFrameDataLimit;
 
 } // namespace
@@ -81,13 +81,13 @@ SendStatus FrameRequester::push(std::int32_t messageId, std::uint32_t serial, bo
 {
     if (!_connection->send(messageId, serial, wantsReply, false, data))
         return SendStatus::TransportError;
-    // A transport that has failed may count nothing as queued any more.
+    // A failed transport may report an empty queue.
     const auto taken = [this] { return isOpen() && _connection->queuedBytes() == 0; };
     if (taken() || _connection->waitUntil(taken, timeout))
         return SendStatus::Success;
     if (!isOpen())
         return SendStatus::TransportError;
-    // The stream cannot go on after half a frame; one of which nothing has left is taken back.
+    // After half a frame the stream is useless. A frame of which nothing was sent is taken back.
     if (!_connection->withdrawLast())
         _connection->close();
     return SendStatus::SendTimeout;

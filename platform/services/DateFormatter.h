@@ -8,9 +8,9 @@
 namespace orvane
 {
 
-// Puts a time into words by a format: yyyy, MM, dd, HH, mm and ss are year, month, day, hour,
-// minute and second, what stands between apostrophes and everything else is itself. In the clock's
-// local zone; fractions of a second are dropped.
+// Formats a time: yyyy, MM, dd, HH, mm and ss stand for year, month, day, hour, minute and second.
+// Everything else, and every text between apostrophes, is copied. Uses the clock's local zone and
+// drops fractions of a second.
 class DateFormatter
 {
 public:

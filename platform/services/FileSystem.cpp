@@ -92,7 +92,7 @@ bool writeFile(const std::string& path, ByteView content)
 {
     if (!removeOwnFile(path))
         return false;
-    // O_EXCL: nothing that somebody has put there meanwhile is followed, opened or waited for.
+    // O_EXCL: never follows, opens or waits for a file that somebody has put there meanwhile.
     const int descriptor = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
     if (descriptor < 0)
         return false;

@@ -13,7 +13,7 @@ namespace orvane
 OutputDescriptor::State OutputDescriptor::write(std::string_view data)
 {
     while (_state == State::Open && !data.empty()) {
-        // Waiting here rather than in write(2): unlike that, poll(2) always ends with a signal.
+        // Waits in poll(2), which every signal ends, and not in write(2).
         pollfd waiting{_descriptor, POLLOUT, 0};
         if (::poll(&waiting, 1, -1) < 0) {
             _error = errno;

@@ -5,9 +5,8 @@
 namespace orvane
 {
 
-// Writes data to a file descriptor, standard output as a rule, waiting while its reader is behind.
-// A signal that the program handles ends the wait, and with it the writing: the program is then
-// about to end.
+// Writes data to a file descriptor, usually standard output, and waits while its reader is behind.
+// A signal that the program handles ends the wait and all writing: the program is about to end.
 class OutputDescriptor
 {
 public:

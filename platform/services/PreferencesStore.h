@@ -7,8 +7,8 @@
 namespace orvane
 {
 
-// Preferences of applications, a domain each, and the notice that makes an application read its own
-// anew. Failures are told in one error line.
+// Preferences of applications, one domain for each, and the notice that makes an application read
+// its own again. A failure is logged in one error line.
 class PreferencesStore
 {
 public:

@@ -11,7 +11,7 @@ enum class LogPriority { Error = 3, Warning = 4, Notice = 5, Info = 6 };
 
 // "error", "warning", "notice" or "info".
 const char* logPriorityName(LogPriority priority);
-// The inverse; nothing for any other text.
+// The inverse; nullopt for any other text.
 std::optional<LogPriority> logPriorityNamed(std::string_view name);
 
 // Where the program's log lines go. write() may be called from any thread.

@@ -6,7 +6,7 @@
 namespace orvane
 {
 
-// A new random UUID as text, upper-case with hyphens; nothing when the machine gives no random
+// A new random UUID as text, upper-case with hyphens; nullopt when the machine gives no random
 // numbers.
 std::optional<std::string> makeUuid();
 

@@ -75,7 +75,7 @@ protected:
     {
         return top().statusText() + (top().isBusy() ? " busy" : "");
     }
-    // Onto the pane in front, as if the tree had led there.
+    // Pushes a pane for the path, whether or not the tree has it.
     void push(const std::string& path)
     {
         screen.navigation()->pushViewController(

@@ -47,7 +47,7 @@ public:
     std::function<void()> onUpdate;
 };
 
-// No display can be made of a number.
+// A template that gives a section a number where it needs a dictionary.
 constexpr const char* kBadTemplate =
     "<plist><dict><key>bad</key><integer>1</integer></dict></plist>";
 
@@ -91,7 +91,7 @@ protected:
     {
         return PacketBuilder(0xB0C2, 38).put16(14, cellId);
     }
-    // Lets a message come while there is no template, and a bad one lie ready for the refresh.
+    // Receives a message while there is no template; then provides a bad one for the refresh.
     void receiveBeforeABadTemplate()
     {
         Services::current().setResources(&services.memoryResources);
@@ -102,7 +102,7 @@ protected:
         observer.onUpdate = [this] { model->topLevelNodes(); };
         services.log.lines.clear();
     }
-    // The session that follows a good template shows what comes.
+    // With a good template, the next session shows its messages.
     void expectRecovery()
     {
         services.useShippedResources();
@@ -136,7 +136,7 @@ protected:
     std::shared_ptr<OrvaneModel> model = makeModel();
 };
 
-// What is wrong with the server, and the lines that tell it.
+// A fault of the server, and the log lines that it causes.
 struct Failure {
     const char* name;
     void (*arrange)(ScriptedTelephonyServer& server, LoopbackTransport& transport);
@@ -263,7 +263,7 @@ TEST_F(ConnectionTest, TheLineOfCreatedPortsNamesTheSendingPortFirst)
     startConnected();
     server.closeChannels();
     queue.advance(2s);
-    // It is the local port that the health check invalidates.
+    // The health check invalidates the local port.
     const auto invalidated = errorsThatStart(" ***** INVALIDATED ");
     ASSERT_THAT(invalidated, SizeIs(1));
     const std::string receiving = invalidated[0].substr(19, invalidated[0].rfind(" *****") - 19);
@@ -448,7 +448,7 @@ TEST_F(ConnectionTest, ABadTemplateInAStartGivesOneErrorLineAndTheProgramGoesOn)
 {
     receiveBeforeABadTemplate();
     observer.onUpdate = {};
-    // The restart comes before the view update, and makes the tree of the old generator once more.
+    // The restart comes before the view update and makes the old generator's tree once more.
     server.closeChannels();
     queue.advance(1s);
     EXPECT_TRUE(model->isConnected());

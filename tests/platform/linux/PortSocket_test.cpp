@@ -229,7 +229,7 @@ TEST_F(SharedPortSocketTest, NothingThatAMemberPutsThereKeepsTheServerFromStarti
     EXPECT_TRUE(claimAs(kOwner, "TelephonyServer")) << error;
     asAnna([&] { std::filesystem::create_symlink("nowhere", name); });
     EXPECT_TRUE(claimAs(kOwner, "TelephonyServer")) << error;
-    // Nor where the name to which a stale server's file is moved is taken.
+    // The name to which a stale server's file would be moved is taken, too.
     {
         const EffectiveUser owner(kOwner, kGroup);
         leaveStaleSocket(name);
