@@ -61,13 +61,17 @@ std::optional<std::string> TechnologyFinder::technology() const
     return best;
 }
 
-std::optional<std::string> technologyOfLog(ByteView file)
+std::optional<std::string> technologyOfItems(DlfReader reader)
 {
     TechnologyFinder finder;
-    DlfReader reader(file);
     while (const auto item = reader.next())
         finder.take(*item);
     return finder.technology();
+}
+
+std::optional<std::string> technologyOfLog(ByteView file)
+{
+    return technologyOfItems(DlfReader(file));
 }
 
 } // namespace orvane

@@ -26,7 +26,9 @@ private:
     std::unordered_map<std::uint16_t, std::uint64_t> _itemsByCode;
 };
 
-// The technology of a whole recording.
+// The technology of all items that the reader still has to read.
+std::optional<std::string> technologyOfItems(DlfReader reader);
+// The technology of a whole recording in memory.
 std::optional<std::string> technologyOfLog(ByteView file);
 
 } // namespace orvane

@@ -1,16 +1,26 @@
 #include "LogGenerator/VRNLogGenerator.h"
 
+#include "LogGenerator/KeptMessages.h"
 #include "LogGenerator/StateKeys.h"
 #include "dlf/VersionReport.h"
 #include "platform/base/Bytes.h"
 #include "platform/base/PropertyValue.h"
 #include "platform/services/SystemLog.h"
 
+#include <algorithm>
 #include <cstdio>
 #include <utility>
 
 namespace orvane
 {
+
+namespace
+{
+
+// So much more than is kept may gather before the oldest is dropped, since dropping moves the rest.
+constexpr std::size_t kSlackBytes = 4U << 20;
+
+} // namespace
 
 void VRNLogGenerator::init()
 {
@@ -20,8 +30,14 @@ void VRNLogGenerator::init()
 
 void VRNLogGenerator::appendToBinData(ByteView message)
 {
-    if (_binData && _keepsMessages)
-        _binData->insert(_binData->end(), message.begin(), message.end());
+    if (!_binData || !_keepsMessages)
+        return;
+    _binData->insert(_binData->end(), message.begin(), message.end());
+    if (_binData->size() <= kMostKeptBytes + kSlackBytes)
+        return;
+    const std::size_t dropped = lengthOfFirstMessages(*_binData, kSlackBytes);
+    _binData->erase(_binData->begin(), _binData->begin() + static_cast<std::ptrdiff_t>(dropped));
+    _hasDroppedMessages = true;
 }
 
 void VRNLogGenerator::moveBinDataToState(PropertyDictionary& state)
@@ -29,6 +45,21 @@ void VRNLogGenerator::moveBinDataToState(PropertyDictionary& state)
     if (!_binData)
         return;
     state.set(kDisplayStateKey, PropertyValue::data(std::exchange(*_binData, Bytes())));
+}
+
+void VRNLogGenerator::recordSnapshot(PropertyDictionary& state)
+{
+    moveBinDataToState(state);
+    updateHistoryInState(state);
+    if (std::exchange(_hasDroppedMessages, false)) {
+        const PropertyArray& history = *state[kHistoryKey].asArray();
+        PropertyValue marked = PropertyValue::newArray();
+        for (std::size_t i = 0; i < history.size(); ++i)
+            marked.asArray()->append(i + 1 < history.size() ? history[i]
+                                                            : incompleteEntry(history[i]));
+        state.set(kHistoryKey, marked);
+    }
+    state.set(kHistoryKey, boundedHistory(state[kHistoryKey], kMostKeptBytes));
 }
 
 std::optional<Bytes> VRNLogGenerator::generateDlfFromState(const PropertyDictionary& state)
@@ -46,8 +77,8 @@ std::optional<Bytes> VRNLogGenerator::generateDlfFromState(const PropertyDiction
             logError("Got wrong class writing history to DLF; aborting writing the DLF file");
             return std::nullopt;
         }
-        // Only the first message of a snapshot loses its type byte; later ones keep theirs, and
-        // wrapped ones their wrapper. This is meant.
+        // Deliberate: only the first message of a snapshot loses its type byte. Later ones keep
+        // theirs, and wrapped ones their wrapper.
         if (bytes->size() >= 2)
             dlf->insert(dlf->end(), bytes->begin() + 1, bytes->end());
     }
@@ -58,8 +89,13 @@ PropertyValue VRNLogGenerator::getSaveContentsFromState(PropertyDictionary& stat
 {
     PropertyValue contents = historyOf(state);
     if (std::optional<Bytes> dlf = generateDlfFromState(state)) {
+        const PropertyArray& snapshots = *contents.asArray();
+        const bool isIncomplete =
+            std::any_of(snapshots.begin(), snapshots.end(), isIncompleteEntry);
         char description[64];
-        std::snprintf(description, sizeof description, "DLF binary (%d bytes)",
+        std::snprintf(description, sizeof description,
+                      isIncomplete ? "DLF binary (%d bytes, oldest messages left out)"
+                                   : "DLF binary (%d bytes)",
                       static_cast<int>(dlf->size()));
         contents.asArray()->append(PropertyValue::dictionaryOf({
             {kDescriptionKey, description                         },

@@ -29,11 +29,15 @@ protected:
     void appendToBinData(ByteView message);
     // Stores what was gathered as the state's "DisplayState" and starts anew.
     void moveBinDataToState(PropertyDictionary& state);
+    // Does that, then appends a snapshot of the state to the history. All snapshots together keep
+    // at most kMostKeptBytes of raw messages.
+    void recordSnapshot(PropertyDictionary& state);
 
 private:
     // The messages since the last display. Absent in an object that was never initialised.
     std::optional<Bytes> _binData;
     bool _keepsMessages = true;
+    bool _hasDroppedMessages = false; // since the last display
 };
 
 } // namespace orvane

@@ -132,8 +132,7 @@ PropertyValue VRNLogGenerator2::generateLogUsingState(PropertyDictionary& state)
     PropertyValue display = getDisplayFromState(state);
     if (!isInitialised())
         return {};
-    moveBinDataToState(state);
-    updateHistoryInState(state);
+    recordSnapshot(state);
     return display;
 }
 

@@ -81,8 +81,7 @@ NodePointer LogPlayer::topLevelNodes()
 NodePointer LogPlayer::nodeAtPath(const std::string& path)
 {
     topLevelNodes();
-    const auto found = _nodesByPath.find(path);
-    return found == _nodesByPath.end() ? nullptr : found->second;
+    return _nodesByPath.at(path);
 }
 
 double LogPlayer::position() const { return secondsOf(_log.position()); }

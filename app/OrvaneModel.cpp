@@ -37,10 +37,7 @@ NodePointer OrvaneModel::nodeAtPath(const std::string& path)
 {
     if (!_nodesByPath)
         topLevelNodes();
-    if (!_nodesByPath)
-        return nullptr;
-    const auto found = _nodesByPath->find(path);
-    return found == _nodesByPath->end() ? nullptr : found->second;
+    return _nodesByPath ? _nodesByPath->at(path) : nullptr;
 }
 
 void OrvaneModel::updateWithData(ByteView data)

@@ -32,6 +32,7 @@
 #include <cstdio>
 #include <ctime>
 #include <exception>
+#include <new>
 #include <optional>
 #include <stdexcept>
 #include <unistd.h>
@@ -166,9 +167,19 @@ int main(int argc, char** argv)
     const auto log = makeLog(options.log, "orvane");
     // Standard output carries data, or the terminal's screen, unless there is a window.
     const ProgramServices services(log.get(), kind == FrontEndKind::Window ? stdout : stderr);
+    if (const auto& problem = services.problem()) {
+        complain(*problem);
+        // Snapshots are shown without templates.
+        if (options.command == AppCommand::Live)
+            return kFailure;
+    }
     int status = kFailure;
     try {
         status = isExport ? runExport(options) : run(options, kind);
+    } catch (const std::bad_alloc&) {
+        complain(options.file.empty() ? "there is not enough memory"
+                                      : "there is not enough memory for \"" + options.file +
+                                            "\": name a smaller file, or end other programs");
     } catch (const std::exception& failure) {
         complain(failure.what());
     }

@@ -21,7 +21,7 @@ constexpr std::size_t kWindowBytes = 1 << 20;
 
 std::shared_ptr<FileWindow> FileWindow::open(const std::string& path, std::string& error)
 {
-    // Without waiting, should it be a pipe that nobody writes to.
+    // Opening a named pipe without O_NONBLOCK would wait for a writer.
     const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (descriptor < 0) {
         error = std::strerror(errno);
@@ -36,6 +36,14 @@ std::shared_ptr<FileWindow> FileWindow::open(const std::string& path, std::strin
     }
     return std::shared_ptr<FileWindow>(
         new FileWindow(descriptor, static_cast<std::uint64_t>(status.st_size)));
+}
+
+std::shared_ptr<FileWindow> FileWindow::another() const
+{
+    const int descriptor = ::fcntl(_descriptor, F_DUPFD_CLOEXEC, 0);
+    if (descriptor < 0)
+        return nullptr;
+    return std::shared_ptr<FileWindow>(new FileWindow(descriptor, _size));
 }
 
 FileWindow::~FileWindow() { ::close(_descriptor); }

@@ -9,13 +9,17 @@
 namespace orvane
 {
 
-// A file of which only a window is in memory, however long it is. What is cut off or cannot be read
-// while it is open is not there any more: size() becomes less. What is added later is not seen.
+// A file of which only a window of about 1 MiB is in memory, however long it is. size() becomes
+// less if the file is cut, or cannot be read any more, while it is open. What is appended to the
+// file later is not seen.
 class FileWindow final : public ByteSource
 {
 public:
-    // Null, with the system's reason in `error`, for what is no regular file or may not be read.
+    // Null, with the system's reason in `error`, unless it is a regular file that may be read.
     static std::shared_ptr<FileWindow> open(const std::string& path, std::string& error);
+    // A further window on the same file, also if that has been renamed or deleted since. Null if
+    // the process has too many open files.
+    [[nodiscard]] std::shared_ptr<FileWindow> another() const;
     ~FileWindow() override;
     FileWindow(const FileWindow&) = delete;
     FileWindow& operator=(const FileWindow&) = delete;

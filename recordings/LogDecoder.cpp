@@ -4,6 +4,7 @@
 #include "LogGenerator/Silence.h"
 #include "LogGenerator/StateKeys.h"
 #include "platform/base/PropertyValue.h"
+#include "platform/base/Technology.h"
 #include "recordings/LogSlice.h"
 #include "recordings/TimesAhead.h"
 
@@ -30,7 +31,7 @@ std::unique_ptr<LogGenerator> newGenerator(const std::string& technology)
 } // namespace
 
 LogDecoder::LogDecoder(std::shared_ptr<ByteSource> log, const std::string& technology)
-    : _place{DlfReader(std::move(log)), ServingCell(technology)},
+    : _technology(technology), _place{DlfReader(std::move(log)), ServingCell(technology)},
       _generator(newGenerator(technology))
 {
 }
@@ -100,6 +101,15 @@ void LogDecoder::decodeNext()
 }
 
 const PropertyValue& LogDecoder::display() const { return _state[kDisplayKey]; }
+
+std::optional<std::string> LogDecoder::problem() const
+{
+    // A cell monitor has no template: its display begins with the first list of cells.
+    if (display() || itemsTaken() == 0 || _technology == kTSLogChannelTechnology_IFX)
+        return std::nullopt;
+    return "the display template of \"" + nameOfTechnology(_technology) +
+           "\" is missing or damaged: install orvane again";
+}
 
 std::size_t LogDecoder::Checkpoint::bytes() const
 {

@@ -47,6 +47,10 @@ public:
     // shown after all items of one time.
     [[nodiscard]] std::uint64_t servingCellChanges() const { return _place.servingCellChanges; }
 
+    // One line that says why nothing is shown although items were decoded, and what to do: the
+    // technology's display template is missing or damaged.
+    [[nodiscard]] std::optional<std::string> problem() const;
+
     // How many items that were found so far have a time that cannot be.
     [[nodiscard]] std::uint64_t impossibleTimes() const { return _place.impossibleTimes; }
 
@@ -89,6 +93,7 @@ private:
     [[nodiscard]] bool believe(std::uint64_t timestamp);
     void decodeNext();
 
+    std::string _technology;
     Place _place;
     std::unique_ptr<LogGenerator> _generator;
     PropertyDictionary _state;

@@ -88,8 +88,11 @@ void LogRecorder::synchroniseSoon()
         return;
     _queue.after(kSynchronisation, _lifetime.whileAlive([this] {
         _isSynchronisationQueued = false;
-        if (_file)
-            endIfFailed(_file->synchronise());
+        if (!_file)
+            return;
+        endIfFailed(_file->synchronise());
+        if (_file && _file->isBehind())
+            synchroniseSoon();
     }));
 }
 
@@ -97,8 +100,11 @@ void LogRecorder::endIfFailed(int error)
 {
     if (error == 0)
         return;
-    _notify("Recording to \"" + _path + "\" has ended: " + std::strerror(error) +
-            ". What came before is kept.");
+    if (error == ENOENT)
+        _notify("Recording to \"" + _path + "\" has ended: the file has been deleted.");
+    else
+        _notify("Recording to \"" + _path + "\" has ended: " + std::strerror(error) +
+                ". What came before is kept.");
     _file.reset();
 }
 

@@ -24,7 +24,8 @@ RecordingWalk::Reached RecordingWalk::takeSlice()
     case RefreshPeriods::Reached::Nothing:
         return Reached::Nothing;
     case RefreshPeriods::Reached::Period:
-        return Reached::Display;
+        _failure = _periods->decoder().problem();
+        return _failure ? Reached::End : Reached::Display;
     case RefreshPeriods::Reached::End:
         break;
     }

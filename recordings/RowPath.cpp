@@ -63,7 +63,8 @@ public:
             const std::size_t length = _path.size();
             if (!name.empty())
                 (_path += '/') += name;
-            visit(child, *below);
+            if (_path.size() <= RowPath::kLongest)
+                visit(child, *below);
             _path.resize(length);
         });
     }

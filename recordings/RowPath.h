@@ -18,6 +18,10 @@ using RowVisitor = std::function<void(std::string_view path, const PropertyValue
 class RowPath
 {
 public:
+    // Rows with a longer path, in bytes, are passed over: the paths of a hostile file could
+    // otherwise be a thousand times larger than the file.
+    static constexpr std::size_t kLongest = 4096;
+
     // Slashes that are missing at the start, doubled or trailing do not matter.
     explicit RowPath(std::string_view text);
 

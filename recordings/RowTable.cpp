@@ -2,7 +2,8 @@
 
 #include "platform/base/PropertyValue.h"
 
-#include <algorithm>
+#include <unordered_set>
+#include <utility>
 
 namespace orvane
 {
@@ -22,8 +23,11 @@ void RowTable::take(const PropertyValue& display)
 {
     ++_period;
     _previous = kNoRow;
-    for (Row& row : _rows)
-        row.hasChanged = false;
+    for (const std::size_t row : _changed)
+        _rows[row].hasChanged = false;
+    _changed.clear();
+    std::swap(_present, _presentBefore);
+    _present.clear();
     for (Asked& asked : _asked) {
         if (asked.row != kNoRow)
             _previous = asked.row;
@@ -32,9 +36,9 @@ void RowTable::take(const PropertyValue& display)
                 note(asked, path, row);
             });
     }
-    for (Row& row : _rows)
-        if (row.lastPeriod != 0 && row.lastPeriod + 1 == _period)
-            row.hasChanged = true;
+    for (const std::size_t row : _presentBefore)
+        if (_rows[row].lastPeriod + 1 == _period)
+            change(row);
 }
 
 void RowTable::note(Asked& asked, std::string_view path, const PropertyValue& value)
@@ -43,9 +47,11 @@ void RowTable::note(Asked& asked, std::string_view path, const PropertyValue& va
     _previous = rowAt(asked, path);
     Row& row = _rows[_previous];
     if (row.lastPeriod == 0 || row.lastPeriod + 1 < _period || row.value != value) {
-        row.hasChanged = true;
+        change(_previous);
         row.value = value;
     }
+    if (row.lastPeriod != _period)
+        _present.push_back(_previous);
     row.lastPeriod = _period;
 }
 
@@ -56,32 +62,44 @@ std::size_t RowTable::rowAt(const Asked& asked, std::string_view path)
     for (const std::size_t likely : {asked.row, follower})
         if (likely != kNoRow && _rows[likely].path == path)
             return likely;
-    const auto known = _indices.find(std::string(path));
+    const auto known = _indices.find(path);
     const std::size_t row = known == _indices.end() ? add(path) : known->second;
     if (_previous != kNoRow)
         _followers[_previous] = row;
     return row;
 }
 
-// A new row stands behind the one that was met before it.
+// A new row stands after the one that was met before it.
 std::size_t RowTable::add(std::string_view path)
 {
     const std::size_t row = _rows.size();
-    const auto previous = std::find(_order.begin(), _order.end(), _previous);
-    _order.insert(previous == _order.end() ? _order.begin() : previous + 1, row);
+    std::size_t& link = _previous == kNoRow ? _first : _next[_previous];
+    const std::size_t next = std::exchange(link, row);
+    _next.push_back(next);
     _rows.emplace_back().path = path;
     _followers.push_back(kNoRow);
-    _indices.emplace(path, row);
+    _indices.emplace(_rows.back().path, row);
     return row;
+}
+
+void RowTable::change(std::size_t row)
+{
+    if (!std::exchange(_rows[row].hasChanged, true))
+        _changed.push_back(row);
 }
 
 std::vector<std::size_t> RowTable::order() const
 {
-    std::vector<std::size_t> shown = _order;
     // What turned out to be a group has rows instead of one of its own.
+    std::unordered_set<std::size_t> groups;
     for (const Asked& asked : _asked)
         if (asked.hasOccurred && asked.row != kNoRow && _rows[asked.row].lastPeriod == 0)
-            std::erase(shown, asked.row);
+            groups.insert(asked.row);
+    std::vector<std::size_t> shown;
+    shown.reserve(_rows.size());
+    for (std::size_t row = _first; row != kNoRow; row = _next[row])
+        if (!groups.contains(row))
+            shown.push_back(row);
     return shown;
 }
 

@@ -4,6 +4,7 @@
 #include "recordings/RowPath.h"
 
 #include <cstdint>
+#include <deque>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -30,14 +31,14 @@ public:
     // Takes the display at the end of the next period.
     void take(const PropertyValue& display);
 
-    // In the order in which they were found. An index stays a row's own.
-    [[nodiscard]] const std::vector<Row>& rows() const { return _rows; }
+    // In the order in which they were found. The index of a row does not change.
+    [[nodiscard]] const std::deque<Row>& rows() const { return _rows; }
     [[nodiscard]] bool isPresent(const Row& row) const
     {
         return _period != 0 && row.lastPeriod == _period;
     }
     // Indices of the rows in the order of the paths that were asked for, those of a pattern or a
-    // group as they are shown. A path without "*" is a row of its own also where it never occurred.
+    // group as they are shown. A path without "*" is a row of its own even if it never occurred.
     [[nodiscard]] std::vector<std::size_t> order() const;
     // The paths that were asked for and did not occur.
     [[nodiscard]] std::vector<std::string> missingPaths() const;
@@ -53,12 +54,18 @@ private:
     void note(Asked& asked, std::string_view path, const PropertyValue& value);
     [[nodiscard]] std::size_t rowAt(const Asked& asked, std::string_view path);
     std::size_t add(std::string_view path);
+    void change(std::size_t row);
 
     std::vector<Asked> _asked;
-    std::vector<Row> _rows;
-    std::unordered_map<std::string, std::size_t> _indices; // by path
-    std::vector<std::size_t> _followers;                   // the row met next, the last time
-    std::vector<std::size_t> _order;
+    std::deque<Row> _rows; // which stay where they are, with their paths
+    std::unordered_map<std::string_view, std::size_t> _indices; // by path
+    std::vector<std::size_t> _followers;                        // the row met next, the last time
+    // The order, as a list: inserting takes no time, however many rows there are.
+    std::size_t _first = kNoRow;
+    std::vector<std::size_t> _next;
+    std::vector<std::size_t> _present; // in this period, and in the one before
+    std::vector<std::size_t> _presentBefore;
+    std::vector<std::size_t> _changed;
     std::size_t _previous = kNoRow; // the row that was met last in this period
     std::uint64_t _period = 0;
 };

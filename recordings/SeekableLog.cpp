@@ -70,6 +70,9 @@ void SeekableLog::stopReading()
         return;
     }
     _decoder->setTellsErrors(false);
+    _failure = _decoder->problem();
+    if (_failure)
+        return;
     _end = _decoder->checkpoint();
     _position = duration();
 }

@@ -1,6 +1,9 @@
 #include "recordings/SnapshotTree.h"
 
 #include "platform/base/PropertyValue.h"
+#include "ui/tree/DisplayWalk.h"
+
+#include <unordered_map>
 
 namespace orvane
 {
@@ -11,19 +14,32 @@ namespace
 constexpr const char* kDescriptionRow = "Description";
 constexpr const char* kTimestampRow = "Saved";
 
-// By description and date, each name once.
-std::string nameOf(const Snapshot::Entry& entry, const PropertyDictionary& taken)
+// Names the entries by description and date, each name once.
+class EntryNames
 {
-    std::string name = entry.description;
-    if (!entry.date.empty() && name.find(entry.date) == std::string::npos)
-        name += (name.empty() ? "" : " ") + ("(" + entry.date + ")");
-    if (name.empty())
-        name = "Entry";
-    std::string unique = name;
-    for (int i = 2; taken.contains(unique); ++i)
-        unique = name + " " + std::to_string(i);
-    return unique;
-}
+public:
+    explicit EntryNames(const PropertyDictionary& taken) : _taken(taken) {}
+
+    std::string nameOf(const Snapshot::Entry& entry)
+    {
+        std::string name = entry.description;
+        if (!entry.date.empty() && name.find(entry.date) == std::string::npos)
+            name += (name.empty() ? "" : " ") + ("(" + entry.date + ")");
+        if (name.empty())
+            name = "Entry";
+        name = shownName(name);
+        std::string unique = name;
+        // Entries of one name go on counting where the one before stopped.
+        for (std::size_t& count = _counts.try_emplace(name, 1).first->second;
+             _taken.contains(unique);)
+            unique = name + " " + std::to_string(++count);
+        return unique;
+    }
+
+private:
+    const PropertyDictionary& _taken;
+    std::unordered_map<std::string, std::size_t> _counts;
+};
 
 } // namespace
 
@@ -33,8 +49,9 @@ SnapshotTree::SnapshotTree(const Snapshot& snapshot)
         {kDescriptionRow, snapshot.description},
         {kTimestampRow,   snapshot.timestamp  }
     });
+    EntryNames names(*rows.asDictionary());
     for (const Snapshot::Entry& entry : snapshot.entries) {
-        const std::string name = nameOf(entry, *rows.asDictionary());
+        const std::string name = names.nameOf(entry);
         rows.asDictionary()->set(name,
                                  entry.display ? entry.display : PropertyValue::newDictionary());
         const std::string path = pathByAppending("/", name);
@@ -43,11 +60,7 @@ SnapshotTree::SnapshotTree(const Snapshot& snapshot)
     _root = OrvaneModelNode::makeTreeFromObject(rows, _nodes);
 }
 
-NodePointer SnapshotTree::nodeAtPath(const std::string& path) const
-{
-    const auto found = _nodes.find(path);
-    return found == _nodes.end() ? nullptr : found->second;
-}
+NodePointer SnapshotTree::nodeAtPath(const std::string& path) const { return _nodes.at(path); }
 
 const SnapshotTree::Group* SnapshotTree::groupOf(const std::string& path) const
 {

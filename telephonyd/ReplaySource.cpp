@@ -19,10 +19,10 @@ constexpr int kItemsATurn = 1000;
 
 } // namespace
 
-ReplaySource::ReplaySource(MainQueue& queue, Now now, std::shared_ptr<const Bytes> file,
+ReplaySource::ReplaySource(MainQueue& queue, Now now, std::shared_ptr<ByteSource> file,
                            ReplaySettings settings)
     : _queue(queue), _now(std::move(now)), _file(std::move(file)), _settings(std::move(settings)),
-      _reader(*_file)
+      _reader(_file)
 {
 }
 
@@ -79,7 +79,7 @@ bool ReplaySource::startOver()
 {
     if (!_settings.loops || !std::exchange(_hasSentInRound, false))
         return false;
-    _reader = DlfReader(*_file);
+    _reader = DlfReader(_file);
     _reached.reset();
     _due += atSpeed(static_cast<double>(kLoopPause.count()));
     return true;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "dlf/ByteSource.h"
 #include "dlf/DlfReader.h"
 #include "platform/base/Bytes.h"
 #include "platform/services/Lifetime.h"
@@ -35,11 +36,12 @@ public:
     static constexpr std::chrono::seconds kLongestGap{3600};
     static constexpr std::chrono::seconds kLoopPause{1};
 
-    // Time that goes on steadily, from any start.
+    // A steady clock, from any start.
     using Now = std::function<std::chrono::nanoseconds()>;
 
-    // The queue is not owned. The file is shared by all channels.
-    ReplaySource(MainQueue& queue, Now now, std::shared_ptr<const Bytes> file,
+    // The queue is not owned. The file must not be read by anybody else: an item is kept in the
+    // source's memory until it is sent.
+    ReplaySource(MainQueue& queue, Now now, std::shared_ptr<ByteSource> file,
                  ReplaySettings settings);
 
     [[nodiscard]] std::string technology() const override { return _settings.technology; }
@@ -57,7 +59,7 @@ private:
 
     MainQueue& _queue;
     Now _now;
-    std::shared_ptr<const Bytes> _file;
+    std::shared_ptr<ByteSource> _file;
     const ReplaySettings _settings;
     LogSelection _selection;
     Send _send;

@@ -1,4 +1,5 @@
 #include "LogGenerator/LogTechnology.h"
+#include "dlf/FileWindow.h"
 #include "platform/base/Bytes.h"
 #include "platform/linux/LineReader.h"
 #include "platform/linux/ModemManagerClient.h"
@@ -13,7 +14,6 @@
 #include "platform/linux/StalePorts.h"
 #include "platform/linux/StandardDescriptors.h"
 #include "platform/services/Complaint.h"
-#include "platform/services/FileSystem.h"
 #include "platform/services/Services.h"
 #include "telephonyd/DaemonOptions.h"
 #include "telephonyd/LogServer.h"
@@ -29,7 +29,6 @@
 #include <cstdio>
 #include <ctime>
 #include <exception>
-#include <filesystem>
 #include <unistd.h>
 #include <utility>
 
@@ -49,29 +48,31 @@ void complain(const std::string& text) { printComplaint("telephonyd", text); }
 // Null, with a complaint, when the recording cannot be served.
 LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
 {
-    std::error_code error;
-    auto content = std::filesystem::is_regular_file(*options.replay, error)
-                       ? readFile(*options.replay)
-                       : std::nullopt;
-    if (!content) {
-        complain("cannot read \"" + *options.replay +
-                 "\": check that it is a file and may be read");
+    std::string reason;
+    const auto file = FileWindow::open(*options.replay, reason);
+    if (!file) {
+        complain("cannot read \"" + *options.replay + "\" (" + reason +
+                 "): check that it is a file and may be read");
         return nullptr;
     }
-    const auto technology = options.technology ? options.technology : technologyOfLog(*content);
+    const auto technology =
+        options.technology ? options.technology : technologyOfItems(DlfReader(file));
     if (!technology) {
         complain("\"" + *options.replay +
                  "\" holds no log codes that tell its technology: name "
                  "it with --technology");
         return nullptr;
     }
-    const auto file = std::make_shared<const Bytes>(std::move(*content));
     const ReplaySettings settings{*technology, options.speed, options.loops};
-    return [file, settings, &queue] {
+    // Each channel reads through a window of its own.
+    return [file, settings, &queue]() -> std::unique_ptr<LogSource> {
         const auto now = [] {
             return std::chrono::nanoseconds(std::chrono::steady_clock::now().time_since_epoch());
         };
-        return std::make_unique<ReplaySource>(queue, now, file, settings);
+        auto window = file->another();
+        if (!window)
+            return nullptr;
+        return std::make_unique<ReplaySource>(queue, now, std::move(window), settings);
     };
 }
 

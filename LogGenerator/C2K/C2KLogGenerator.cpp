@@ -125,8 +125,7 @@ PropertyValue C2KLogGenerator::getDisplayFromState(PropertyDictionary& state)
 PropertyValue C2KLogGenerator::generateLogUsingState(PropertyDictionary& state)
 {
     PropertyValue display = getDisplayFromState(state);
-    moveBinDataToState(state);
-    updateHistoryInState(state);
+    recordSnapshot(state);
     return display;
 }
 

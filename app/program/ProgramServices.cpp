@@ -7,8 +7,13 @@ namespace orvane
 {
 
 ProgramServices::ProgramServices(SystemLog* log, std::FILE* console)
-    : _console(console), _resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES))
+    : _console(console),
+      _resourceDirectory(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES)),
+      _resources(_resourceDirectory)
 {
+    if (_resources.pathsOfType("plist").empty())
+        _problem = "there are no display templates in \"" + _resourceDirectory +
+                   "\": install orvane again, or run it from the directory that it was built in";
     Services& services = Services::current();
     services.setLog(log);
     services.setConsole(&_console);

@@ -3,6 +3,9 @@
 #include "platform/services/Console.h"
 #include "platform/services/Resources.h"
 
+#include <optional>
+#include <string>
+
 namespace orvane
 {
 
@@ -15,12 +18,16 @@ public:
     // The log may be null. Lines for a person at the console go to that stream.
     ProgramServices(SystemLog* log, std::FILE* console);
     ~ProgramServices();
+    // One line that says that the resources are missing, and where they were looked for.
+    [[nodiscard]] const std::optional<std::string>& problem() const { return _problem; }
     ProgramServices(const ProgramServices&) = delete;
     ProgramServices& operator=(const ProgramServices&) = delete;
 
 private:
     StreamConsole _console;
+    std::string _resourceDirectory;
     DirectoryResources _resources;
+    std::optional<std::string> _problem;
 };
 
 } // namespace orvane

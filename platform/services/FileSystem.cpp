@@ -36,12 +36,21 @@ bool FileSystem::exists(std::string_view path) const
 
 std::optional<Bytes> readFile(const std::string& path, std::size_t limit)
 {
-    std::error_code error;
-    if (std::filesystem::is_directory(path, error))
+    // Opening a named pipe without O_NONBLOCK would wait for a writer.
+    const int descriptor = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+    if (descriptor < 0)
         return std::nullopt;
-    const std::unique_ptr<std::FILE, FileCloser> file(std::fopen(path.c_str(), "rb"));
-    if (!file)
+    struct stat status {
+    };
+    if (::fstat(descriptor, &status) != 0 || !S_ISREG(status.st_mode)) {
+        ::close(descriptor);
         return std::nullopt;
+    }
+    const std::unique_ptr<std::FILE, FileCloser> file(::fdopen(descriptor, "rb"));
+    if (!file) {
+        ::close(descriptor);
+        return std::nullopt;
+    }
     Bytes content;
     std::uint8_t block[65536];
     while (const std::size_t count = std::fread(block, 1, sizeof block, file.get())) {

@@ -25,7 +25,8 @@ private:
     std::string _root;
 };
 
-// Returns the whole file; nullopt when it cannot be read or is longer than `limit` bytes.
+// Returns the whole file; nullopt if it is not a regular file, cannot be read or is longer than
+// `limit` bytes.
 std::optional<Bytes> readFile(const std::string& path, std::size_t limit = SIZE_MAX);
 // Creates the file and writes it directly. An earlier regular file of the own user is removed
 // first; anything else of that name (a symbolic link, a pipe, another user's file) makes it fail

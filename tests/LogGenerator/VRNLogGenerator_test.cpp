@@ -1,5 +1,6 @@
 #include "LogGenerator/VRNLogGenerator.h"
 
+#include "LogGenerator/KeptMessages.h"
 #include "LogGenerator/StateKeys.h"
 #include "dlf/VersionReport.h"
 #include "platform/base/PacketView.h"
@@ -31,6 +32,7 @@ class OpenGenerator final : public VRNLogGenerator
 public:
     using VRNLogGenerator::appendToBinData;
     using VRNLogGenerator::moveBinDataToState;
+    using VRNLogGenerator::recordSnapshot;
 };
 
 class VRNLogGeneratorTest : public ::testing::Test
@@ -201,6 +203,90 @@ TEST_F(VRNLogGeneratorTest, WithoutInitNothingIsGathered)
     generator.moveBinDataToState(state);
     EXPECT_TRUE(state.empty());
     EXPECT_THAT(services.log.lines, IsEmpty());
+}
+
+TEST_F(VRNLogGeneratorTest, RawMessagesOfAllSnapshotsAreBoundedAndTheOldestGoFirst)
+{
+    constexpr std::size_t kItem = 60'000;
+    constexpr std::size_t kMessages = 20U << 20;
+    OpenGenerator generator;
+    generator.init();
+    state.set(kDisplayKey, PropertyValue::newDictionary());
+    state.set(kExtraInfoKey, PropertyValue::newDictionary());
+    std::uint8_t mark = 0;
+    for (int snapshot = 0; snapshot < 5; ++snapshot) {
+        for (std::size_t bytes = 0; bytes < kMessages; bytes += kItem + 1) {
+            Bytes message(kItem + 1, mark++);
+            message[0] = 1;
+            message[1] = kItem & 0xFF;
+            message[2] = kItem >> 8;
+            generator.appendToBinData(message);
+        }
+        generator.recordSnapshot(state);
+    }
+    std::size_t total = 0;
+    std::vector<bool> incomplete;
+    for (const PropertyValue& entry : *state[kHistoryKey].asArray()) {
+        const Bytes& bytes = *entry[kDisplayStateKey].asData();
+        EXPECT_EQ(bytes.size() % (kItem + 1), 0U) << "whole messages";
+        total += bytes.size();
+        incomplete.push_back(isIncompleteEntry(entry));
+    }
+    EXPECT_THAT(incomplete, ElementsAre(true, true, false, false, false));
+    EXPECT_LE(total, kMostKeptBytes);
+    EXPECT_GT(total, kMostKeptBytes - 2 * kItem);
+    EXPECT_EQ(state[kHistoryKey].asArray()->elements().back()[kDisplayStateKey].asData()->back(),
+              static_cast<std::uint8_t>(mark - 1));
+    const PropertyValue contents = generator.getSaveContentsFromState(state);
+    EXPECT_THAT((*contents.asArray())[0][kDescriptionKey].description(),
+                ::testing::EndsWith("(oldest raw messages left out)"));
+    EXPECT_THAT(contents.asArray()->elements().back()[kDescriptionKey].description(),
+                ::testing::EndsWith(" bytes, oldest messages left out)"));
+}
+
+TEST_F(VRNLogGeneratorTest, OnePeriodKeepsNoMoreThanAllTogetherMay)
+{
+    OpenGenerator generator;
+    generator.init();
+    Bytes message(60'001, 7);
+    message[0] = 1;
+    message[1] = 60'000 & 0xFF;
+    message[2] = 60'000 >> 8;
+    for (std::size_t bytes = 0; bytes < 2 * kMostKeptBytes; bytes += message.size())
+        generator.appendToBinData(message);
+    state.set(kDisplayKey, PropertyValue::newDictionary());
+    generator.recordSnapshot(state);
+    const PropertyValue& entry = (*state[kHistoryKey].asArray())[0];
+    EXPECT_LE(entry[kDisplayStateKey].asData()->size(), kMostKeptBytes);
+    EXPECT_EQ(entry[kDisplayStateKey].asData()->size() % message.size(), 0U);
+    EXPECT_TRUE(isIncompleteEntry(entry));
+}
+
+TEST_F(VRNLogGeneratorTest, MessagesWithoutAUsableLengthGoTogether)
+{
+    const Bytes message = {1, 13, 0, 9, 9, 9, 9, 9, 9, 9, 9, 9, 9, 9};
+    Bytes messages = message;
+    messages.insert(messages.end(), {0x81, 0});
+    messages.insert(messages.end(), message.begin(), message.end());
+    messages.insert(messages.end(), {1, 2, 0});
+    const struct {
+        std::size_t count;
+        std::size_t length;
+    } cases[] = {
+        {0,    0 },
+        {1,    14},
+        {14,   14},
+        {15,   30},
+        {30,   30},
+        {31,   33},
+        {1000, 33}
+    };
+    for (const auto& each : cases)
+        EXPECT_EQ(lengthOfFirstMessages(messages, each.count), each.length) << each.count;
+    for (std::size_t length = 0; length <= messages.size(); ++length) {
+        const Bytes cut(messages.begin(), messages.begin() + static_cast<std::ptrdiff_t>(length));
+        EXPECT_EQ(lengthOfFirstMessages(cut, 1000), length);
+    }
 }
 
 } // namespace orvane

@@ -57,6 +57,17 @@ TEST_F(FileWindowTest, OnlyAWindowIsInMemory)
         EXPECT_LE(file->bytes(position, 100'000).size(), std::size_t{1} << 20);
 }
 
+TEST_F(FileWindowTest, AFurtherWindowReadsTheSameFileAlsoOnceItIsDeleted)
+{
+    std::filesystem::remove(path);
+    const std::shared_ptr<FileWindow> other = file->another();
+    ASSERT_TRUE(other);
+    const ByteView last = other->bytes(kFileBytes - 1, 1);
+    expectBytes(0, 10);
+    ASSERT_EQ(last.size(), 1U);
+    EXPECT_EQ(last[0], byteAt(kFileBytes - 1)) << "windows do not move each other";
+}
+
 TEST_F(FileWindowTest, NothingIsBehindTheEnd)
 {
     EXPECT_TRUE(file->bytes(kFileBytes, 10).empty());

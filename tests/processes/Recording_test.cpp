@@ -159,7 +159,7 @@ TEST_F(RecordingProgramTest, AnExistingFileIsOverwrittenOnlyByForce)
         EXPECT_EQ(viewer->waitForEnd(), 1);
         EXPECT_THAT(viewer->lines(), IsEmpty());
         EXPECT_EQ(viewer->errors(), "orvane: \"" + file +
-                                        "\" is there already: give --force to overwrite it, or "
+                                        "\" already exists: give --force to overwrite it, or "
                                         "another name\n");
         EXPECT_EQ(recorded(), (Bytes{'o', 'l', 'd'}));
     }

@@ -1,14 +1,17 @@
 #include "platform/services/FileSystem.h"
 #include "processes/support/ChildProcess.h"
 #include "support/Paths.h"
+#include "support/Sanitizers.h"
 #include "support/TemporaryDirectory.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <climits>
 #include <csignal>
 #include <filesystem>
+#include <fstream>
 #include <memory>
 
 namespace orvane
@@ -65,6 +68,16 @@ protected:
     const std::string drive = testDataPath("lte-drive.dlf");
 };
 
+// The most memory that the process has had resident so far.
+long peakResidentKilobytes(pid_t process)
+{
+    std::ifstream status("/proc/" + std::to_string(process) + "/status");
+    for (std::string line; std::getline(status, line);)
+        if (line.starts_with("VmHWM:"))
+            return std::stol(line.substr(6));
+    return LONG_MAX;
+}
+
 constexpr const char* kRow = "\"name\":\"Physical Cell ID\"";
 
 } // namespace
@@ -77,6 +90,25 @@ TEST_F(TelephonydProgramTest, AClientThatDiesWhileItIsSentToCostsTheServerNothin
         ASSERT_TRUE(client->waitForText(kRow)) << "round " << round;
         client->sendSignal(SIGKILL);
     }
+    server->sendSignal(SIGTERM);
+    EXPECT_EQ(server->waitForEnd(), 0);
+}
+
+TEST_F(TelephonydProgramTest, ALongRecordingIsNotHeldInMemory)
+{
+    if (ORVANE_ADDRESS_SANITIZER)
+        GTEST_SKIP() << "the address sanitizer makes memory seem to grow";
+    constexpr std::size_t kFileBytes = 60'000'000;
+    const Bytes once = readFile(drive).value_or(Bytes());
+    ASSERT_FALSE(once.empty());
+    Bytes content;
+    while (content.size() < kFileBytes)
+        content.insert(content.end(), once.begin(), once.end());
+    ASSERT_TRUE(writeFile(file("long.dlf"), content));
+    const auto server = servingTelephonyd({"--replay", file("long.dlf"), "--speed", "max"});
+    const auto client = viewer();
+    ASSERT_TRUE(client->waitForText(kRow));
+    EXPECT_LT(peakResidentKilobytes(server->pid()), 25'000);
     server->sendSignal(SIGTERM);
     EXPECT_EQ(server->waitForEnd(), 0);
 }

@@ -43,6 +43,7 @@ public:
         int appendError = 0;
         int synchroniseError = 0;
         bool isOpen = true;
+        bool isBehind = false;
     };
 
     explicit MemoryFile(Content& content) : _content(content) {}
@@ -61,6 +62,7 @@ public:
         ++_content.synchronisations;
         return _content.synchroniseError;
     }
+    [[nodiscard]] bool isBehind() const override { return _content.isBehind; }
 
 private:
     Content& _content;
@@ -160,6 +162,29 @@ TEST_F(LogRecorderTest, WhatCameIsMadeSafeWithinASecondAndNothingElse)
     recorder->messageReceived(joined({{1}, item(kCode, 20)}));
     queue.advance(999ms);
     EXPECT_EQ(file.synchronisations, 2);
+}
+
+TEST_F(LogRecorderTest, WhatWaitsForAPipesReaderIsTriedAgainWithoutFurtherMessages)
+{
+    recorder->messageReceived(joined({{1}, item(kCode, 20)}));
+    file.isBehind = true;
+    queue.advance(2s);
+    EXPECT_GE(file.synchronisations, 3);
+    file.isBehind = false;
+    queue.advance(1s);
+    const int before = file.synchronisations;
+    queue.advance(10s);
+    EXPECT_EQ(file.synchronisations, before);
+}
+
+TEST_F(LogRecorderTest, ADeletedFileEndsTheRecordingAndIsTold)
+{
+    recorder->messageReceived(joined({{1}, item(kCode, 20)}));
+    file.synchroniseError = ENOENT;
+    queue.advance(1s);
+    EXPECT_FALSE(recorder->isRecording());
+    EXPECT_THAT(notices,
+                ElementsAre("Recording to \"drive.dlf\" has ended: the file has been deleted."));
 }
 
 TEST_F(LogRecorderTest, TheEndMakesTheRestSafe)

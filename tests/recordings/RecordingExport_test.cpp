@@ -229,6 +229,19 @@ TEST_F(RecordingExportTest, StopsOnceNobodyReads)
     EXPECT_LT(progress.size(), 20U) << "the rest is not read";
 }
 
+TEST_F(RecordingExportTest, AMissingTemplateIsAFailureAndGivesNoLines)
+{
+    DirectoryResources none(directory.path());
+    Services::current().setResources(&none);
+    request.file = testDataPath("lte-drive.dlf");
+    EXPECT_EQ(runJson(),
+              "the display template of \"lte\" is missing or damaged: install orvane again");
+    EXPECT_EQ(written, "");
+    EXPECT_EQ(runCsv(),
+              "the display template of \"lte\" is missing or damaged: install orvane again");
+    EXPECT_EQ(written, "");
+}
+
 TEST_F(RecordingExportTest, TellsItsProgress)
 {
     request.file = testDataPath("lte-drive.dlf");

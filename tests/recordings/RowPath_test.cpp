@@ -114,9 +114,9 @@ TEST(RowPathTest, PathsAreThoseOfTheTreeThatIsShown)
         PathDictionary paths;
         OrvaneModelNode::makeTreeFromObject(display, paths);
         RowPath("/").forEachRow(display, [&paths](std::string_view path, const PropertyValue& row) {
-            const auto node = paths.find(std::string(path));
-            ASSERT_NE(node, paths.end()) << path;
-            EXPECT_EQ(*node->second->value(), displayText(row));
+            const NodePointer node = paths.at(path);
+            ASSERT_NE(node, nullptr) << path;
+            EXPECT_EQ(*node->value(), displayText(row));
         });
     }
 }

@@ -1,5 +1,8 @@
 #include "recordings/RowTable.h"
 
+#include "support/AllocationMeter.h"
+#include "ui/tree/DisplayWalk.h"
+
 #include "platform/base/PropertyValue.h"
 #include "ui/tree/DisplayWalk.h"
 
@@ -153,6 +156,56 @@ TEST(RowTableTest, NoDisplayHasNoRows)
     EXPECT_THAT(table.rows(), ElementsAre(::testing::Field(&RowTable::Row::lastPeriod, 0U)));
     EXPECT_THAT(shown(table), ElementsAre("-"));
     EXPECT_THAT(RowTable({"/*"}).rows(), IsEmpty());
+}
+
+// A quadratic table would take hours for these.
+TEST(RowTableTest, HundredsOfThousandsOfRowsCostWhatTheyAre)
+{
+    constexpr int kRows = 300'000;
+    const PropertyValue many = PropertyValue::newDictionary();
+    for (int i = 0; i < kRows; ++i)
+        many.asDictionary()->set(std::to_string(i), "value");
+    const AllocationMeter meter;
+    RowTable table({});
+    table.take(many);
+    const std::vector<std::size_t> order = table.order();
+    ASSERT_EQ(order.size(), kRows);
+    EXPECT_EQ(table.rows()[order.front()].path, "/0");
+    EXPECT_EQ(table.rows()[order.back()].path, "/" + std::to_string(kRows - 1));
+    if (AllocationMeter::isAvailable) {
+        EXPECT_LT(meter.peakBytes(), kRows * 400U);
+    }
+}
+
+TEST(RowTableTest, RowsWithALongPathAreCutAndThoseBeyondTheLongestPathPassedOver)
+{
+    const std::string name(50'000, 'n');
+    PropertyValue deep = PropertyValue::dictionaryOf({
+        {"row", "deep"}
+    });
+    for (std::size_t i = 0; i <= RowPath::kLongest / kLongestName; ++i)
+        deep = PropertyValue::dictionaryOf({
+            {name, deep}
+        });
+    RowTable table({});
+    table.take(PropertyValue::dictionaryOf({
+        {name,   "cut"},
+        {"deep", deep }
+    }));
+    EXPECT_THAT(orderedPaths(table), ElementsAre("/" + name.substr(0, kLongestName)));
+}
+
+TEST(RowTableTest, NewRowsOfEachPeriodAreToldAsTheyComeAndGo)
+{
+    RowTable table({});
+    for (int i = 0; i < 3; ++i) {
+        const std::string name = std::to_string(i);
+        table.take(display({
+            {name, "x"}
+        }));
+    }
+    EXPECT_THAT(orderedPaths(table), ElementsAre("/2", "/1", "/0"));
+    EXPECT_THAT(shown(table), ElementsAre("x!", "-!", "-"));
 }
 
 } // namespace

@@ -87,5 +87,26 @@ TEST(SnapshotTreeTest, PathsAreWithinAGroupPartByPart)
     EXPECT_TRUE(isWithin("/", "/"));
 }
 
+// A quadratic tree would take hours for these.
+TEST(SnapshotTreeTest, ManyEntriesOfOneNameAreNumbered)
+{
+    constexpr std::size_t kEntries = 100'000;
+    Snapshot snapshot;
+    snapshot.entries.assign(kEntries, entry("same", ""));
+    const SnapshotTree tree(snapshot);
+    EXPECT_EQ(tree.root()->childNodes()->size(), kEntries + 2);
+    for (const char* path : {"/same", "/same 2", "/same 100000"})
+        EXPECT_NE(tree.nodeAtPath(path), nullptr) << path;
+    EXPECT_EQ(tree.nodeAtPath("/same 100001"), nullptr);
+}
+
+TEST(SnapshotTreeTest, ANumberedNameThatIsTakenIsPassedOver)
+{
+    Snapshot snapshot;
+    snapshot.entries = {entry("a 2", ""), entry("a", ""), entry("a", ""), entry("a", "")};
+    EXPECT_THAT(names(SnapshotTree(snapshot).root()),
+                ElementsAre("Description", "Saved", "a 2", "a", "a 3", "a 4"));
+}
+
 } // namespace
 } // namespace orvane

@@ -66,8 +66,14 @@ protected:
     void replay(std::shared_ptr<const Bytes> file, std::optional<double> speed, bool loops = false,
                 LogSelection selection = {{0xB0C2}, {}})
     {
+        struct Held {
+            explicit Held(std::shared_ptr<const Bytes> bytes) : content(bytes), source(*content) {}
+            std::shared_ptr<const Bytes> content;
+            MemorySource source;
+        };
+        const auto held = std::make_shared<Held>(std::move(file));
         source = std::make_unique<ReplaySource>(
-            queue, [this] { return queue.now(); }, std::move(file),
+            queue, [this] { return queue.now(); }, std::shared_ptr<ByteSource>(held, &held->source),
             ReplaySettings{"a technology", speed, loops});
         source->start(selection, [this](ByteView message) {
             sent.push_back({std::chrono::duration_cast<milliseconds>(queue.now()), message.back()});

@@ -13,4 +13,15 @@ std::string_view nameOfSortedKey(std::string_view key)
     return key.substr(separator + 1);
 }
 
+std::string_view shownName(std::string_view name)
+{
+    if (name.size() <= kLongestName)
+        return name;
+    std::size_t end = kLongestName;
+    // Not within a character of UTF-8, which has at most three continuation bytes.
+    for (int i = 0; i < 3 && (static_cast<unsigned char>(name[end]) & 0xC0) == 0x80; ++i)
+        --end;
+    return name.substr(0, end);
+}
+
 } // namespace orvane

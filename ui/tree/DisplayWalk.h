@@ -31,6 +31,10 @@ inline constexpr const char* kSortedKey = "_sorted";
 // parts is kept whole.
 std::string_view nameOfSortedKey(std::string_view key);
 
+// A name as it is shown: cut after this many bytes, at the end of a character.
+inline constexpr std::size_t kLongestName = 1024;
+std::string_view shownName(std::string_view name);
+
 // Calls visit(std::string_view name, const PropertyValue& child) for each child of a group, in the
 // order in which they are shown. A row has none. The group must not change meanwhile.
 template <typename Visit>
@@ -49,7 +53,7 @@ void forEachDisplayChild(const PropertyValue& group, const Visit& visit)
         return;
     if (!dictionary->contains(kSortedKey)) {
         for (const auto& [key, child] : *dictionary)
-            visit(std::string_view(key), child);
+            visit(shownName(key), child);
         return;
     }
     using Entry = const std::pair<std::string, PropertyValue>*;
@@ -60,7 +64,7 @@ void forEachDisplayChild(const PropertyValue& group, const Visit& visit)
     std::sort(entries.begin(), entries.end(),
               [](Entry left, Entry right) { return left->first < right->first; });
     for (const Entry entry : entries)
-        visit(nameOfSortedKey(entry->first), entry->second);
+        visit(shownName(nameOfSortedKey(entry->first)), entry->second);
 }
 
 } // namespace orvane

@@ -5,7 +5,6 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -15,10 +14,23 @@ namespace orvane
 class OrvaneModelNode;
 
 // Nodes are shared: by their parent, by the path dictionary and by a pane that still shows one
-// after the tree was dropped. They are never changed once made.
+// after the tree was dropped. They never change.
 using NodePointer = std::shared_ptr<const OrvaneModelNode>;
-// Node path ("/Serving Cell Info/Cell Identity"; the root's is "/") to node.
-using PathDictionary = std::unordered_map<std::string, NodePointer>;
+
+// Finds the nodes of a tree by their paths ("/Serving Cell Info/Cell Identity"; the root's is "/").
+// It holds the tree and no path: the paths of all nodes can be far larger than the tree.
+class PathDictionary
+{
+public:
+    // The node under that path; null if there is none. Of several nodes under one path, a parent
+    // comes before its children, and of siblings the later one first.
+    [[nodiscard]] NodePointer at(std::string_view path) const;
+    void clear() { _root = nullptr; }
+
+private:
+    friend class OrvaneModelNode;
+    NodePointer _root;
+};
 
 // A named node of the display tree.
 class OrvaneModelNode
@@ -28,15 +40,15 @@ public:
     virtual ~OrvaneModelNode() = default;
 
     [[nodiscard]] const std::string& displayName() const { return name; }
-    // Null where this is no group: having child nodes and being a group are the same test.
+    // Null for a row: only groups have child nodes, possibly none.
     [[nodiscard]] virtual const std::vector<NodePointer>* childNodes() const { return nullptr; }
     // The shown value; null for a group.
     [[nodiscard]] virtual const std::string* value() const { return nullptr; }
     // The reading that the value shows; absent where it shows none.
     [[nodiscard]] virtual PropertyValue reading() const { return {}; }
 
-    // Turns a display into a tree whose root is named "Orvane", and stores every node in `paths`
-    // under its path. An absent display gives a leaf of the value "(unknown)".
+    // Turns a display into a tree whose root is named "Orvane", the tree of `paths` from then on.
+    // An absent display gives a leaf of the value "(unknown)".
     static NodePointer makeTreeFromObject(const PropertyValue& object, PathDictionary& paths);
 
 private:

@@ -201,5 +201,14 @@ TEST(FileSystemTest, FailedWriteOverAnEarlierFileLeavesNoHalfFile)
     EXPECT_FALSE(fs::exists(path));
 }
 
+TEST(FileSystemTest, ANamedPipeIsNotReadAndNotWaitedFor)
+{
+    const TemporaryDirectory directory;
+    const std::string path = directory.path() + "/pipe";
+    ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+    EXPECT_EQ(readFile(path), std::nullopt);
+    EXPECT_EQ(readFile("/dev/zero", 100), std::nullopt);
+}
+
 } // namespace
 } // namespace orvane

@@ -1,5 +1,8 @@
 #include "ui/tree/OrvaneModelNode.h"
 
+#include "support/AllocationMeter.h"
+#include "ui/tree/DisplayWalk.h"
+
 #include "platform/base/PropertyValue.h"
 
 #include "platform/base/ArrayLock.h"
@@ -17,7 +20,6 @@ namespace
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
-using ::testing::UnorderedElementsAre;
 
 class OrvaneModelNodeTest : public ::testing::Test
 {
@@ -26,13 +28,6 @@ protected:
     {
         paths.clear();
         return OrvaneModelNode::makeTreeFromObject(value, paths);
-    }
-    std::vector<std::string> pathTexts()
-    {
-        std::vector<std::string> texts;
-        for (const auto& [path, node] : paths)
-            texts.push_back(path);
-        return texts;
     }
     static std::vector<std::string> namesOf(const NodePointer& node)
     {
@@ -82,7 +77,10 @@ TEST_F(OrvaneModelNodeTest, SortedKeysAreSortedAndCutAtTheirSeparator)
         {"a;Y",     "3"      }
     }));
     EXPECT_THAT(namesOf(root), ElementsAre("Y", "X", "c"));
-    EXPECT_THAT(pathTexts(), UnorderedElementsAre("/", "/Y", "/X", "/c"));
+    for (const char* path : {"/", "/Y", "/X", "/c"})
+        EXPECT_NE(paths.at(path), nullptr) << path;
+    for (const char* path : {"", "Y", "/b;X", "/b", "/Y/", "//Y", "/Z"})
+        EXPECT_EQ(paths.at(path), nullptr) << path;
 }
 
 TEST_F(OrvaneModelNodeTest, SortingIsByCharactersNotByNumbers)
@@ -164,6 +162,53 @@ TEST_F(OrvaneModelNodeTest, OfSiblingsWithOneNameTheLaterIsFoundByPathAndBothAre
     }));
     EXPECT_THAT(namesOf(root), ElementsAre("X", "X"));
     EXPECT_EQ(*paths.at("/X")->value(), "second");
+}
+
+TEST_F(OrvaneModelNodeTest, ANameMayHoldSlashesAndBeEmpty)
+{
+    const NodePointer root = make(PropertyValue::dictionaryOf({
+        {"a/b", "slash"                                        },
+        {"a",   PropertyValue::dictionaryOf({{"c", "nested"}}) },
+        {"",    PropertyValue::dictionaryOf({{"d", "unnamed"}})},
+        {"/e/", "slashes"                                      }
+    }));
+    EXPECT_EQ(*paths.at("/a/b")->value(), "slash");
+    EXPECT_EQ(*paths.at("/a/c")->value(), "nested");
+    EXPECT_EQ(*paths.at("/d")->value(), "unnamed");
+    EXPECT_EQ(*paths.at("/e")->value(), "slashes");
+    EXPECT_EQ(paths.at("/"), root);
+}
+
+TEST_F(OrvaneModelNodeTest, ALongNameIsCutAtTheEndOfACharacter)
+{
+    const std::string tooLong(kLongestName + 1, 'x');
+    const std::string accented = std::string(kLongestName - 1, 'y') + "\u00E9";
+    const NodePointer root = make(PropertyValue::dictionaryOf({
+        {tooLong,  "1"},
+        {accented, "2"}
+    }));
+    EXPECT_THAT(namesOf(root),
+                ElementsAre(std::string(kLongestName, 'x'), std::string(kLongestName - 1, 'y')));
+    EXPECT_EQ(*paths.at("/" + std::string(kLongestName, 'x'))->value(), "1");
+}
+
+TEST_F(OrvaneModelNodeTest, ALongNameAboveManyRowsCostsNoMoreThanAShortOne)
+{
+    if (!AllocationMeter::isAvailable)
+        GTEST_SKIP() << "the address sanitizer keeps operator new";
+    const auto bytesWith = [this](const std::string& name) {
+        const PropertyValue rows = PropertyValue::newDictionary();
+        for (int i = 0; i < 20'000; ++i)
+            rows.asDictionary()->set(std::to_string(i), "value");
+        const PropertyValue display = PropertyValue::dictionaryOf({
+            {name, rows}
+        });
+        const AllocationMeter meter;
+        make(display);
+        EXPECT_NE(paths.at("/" + std::string(shownName(name)) + "/19999"), nullptr);
+        return meter.peakBytes();
+    };
+    EXPECT_LT(bytesWith(std::string(50'000, 'n')), bytesWith("n") + 100'000);
 }
 
 TEST_F(OrvaneModelNodeTest, ANodeOutlivesItsTree)
