@@ -64,7 +64,10 @@ constexpr AppOption kOptions[] = {
                "$XDG_RUNTIME_DIR/telephony or /tmp/telephony-UID)",
                kLive},
               &AppOptions::ports),
-    AppOption({"root", "DIR", "take the log folder and the install marker below DIR", kLive},
+    AppOption({"root", "DIR",
+               "take the log folder and the install marker below DIR (default / where the marker "
+               "is, else $XDG_STATE_HOME/orvane/root)",
+               kLive},
               &AppOptions::root),
     AppOption({"refresh", "SECONDS", "the refresh period (default 2.0)", kScreens, 0.01, 86400},
               &AppOptions::refreshInterval),

@@ -1,6 +1,7 @@
 #include "app/AppOptions.h"
 #include "app/OrvaneApp.h"
 #include "app/RecordingNotice.h"
+#include "app/SavingRoot.h"
 #include "app/program/Display.h"
 #include "app/program/ExportProgram.h"
 #include "app/program/FrontEnd.h"
@@ -134,7 +135,7 @@ int run(const AppOptions& options, FrontEndKind kind)
     }
     removeStalePorts(*directory, StalePorts::Clients, std::time(nullptr));
     const auto transport = viewerTransport(*directory, options);
-    return watch(options, kind, loop, *transport, options.root.value_or("/"));
+    return watch(options, kind, loop, *transport, options.root ? *options.root : liveRoot());
 }
 
 } // namespace

@@ -80,8 +80,10 @@ std::shared_ptr<View> OrvaneSaveViewController::loadView()
 
 void OrvaneSaveViewController::viewDidLoad()
 {
-    if (_saveDescription)
+    if (_saveDescription) {
         _saveDescription->setDelegate(this);
+        _saveDescription->setText(_shell.unsavedDescription());
+    }
     ViewController::viewDidLoad();
     if (_saveContentTable)
         _saveContentTable->sizeToFit();
@@ -103,13 +105,21 @@ void OrvaneSaveViewController::viewDidUnload() { ViewController::viewDidUnload()
 void OrvaneSaveViewController::savePressed()
 {
     const std::string description = _saveDescription ? _saveDescription->text() : "";
-    if (!writeSnapshotFile(_shell.files(), _saveHistory, _timeStamp, description).isWritten)
-        Screen::main().showAlert(
-            std::make_unique<AlertView>(kFileErrorTitle, kFileErrorMessage, "Close"));
+    const SnapshotResult result =
+        writeSnapshotFile(_shell.files(), _saveHistory, _timeStamp, description);
+    _shell.setUnsavedDescription(result.isWritten ? "" : description);
+    Screen::main().showAlert(
+        result.isWritten
+            ? std::make_unique<AlertView>(kSavedTitle, result.path, "Close")
+            : std::make_unique<AlertView>(kFileErrorTitle, kFileErrorMessage, "Close"));
     closeSoon();
 }
 
-void OrvaneSaveViewController::cancelPressed() { closeSoon(); }
+void OrvaneSaveViewController::cancelPressed()
+{
+    _shell.setUnsavedDescription("");
+    closeSoon();
+}
 
 // After the button's action has returned, in which this is still used.
 void OrvaneSaveViewController::closeSoon()

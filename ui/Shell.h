@@ -3,6 +3,9 @@
 #include "platform/services/FileSystem.h"
 #include "platform/services/MainQueue.h"
 
+#include <string>
+#include <utility>
+
 namespace orvane
 {
 
@@ -19,6 +22,13 @@ public:
 
     [[nodiscard]] virtual MainQueue& mainQueue() = 0;
     [[nodiscard]] virtual const FileSystem& files() const = 0;
+
+    // What the user typed for a save that failed: the save screen begins with it the next time.
+    [[nodiscard]] const std::string& unsavedDescription() const { return _unsavedDescription; }
+    void setUnsavedDescription(std::string text) { _unsavedDescription = std::move(text); }
+
+private:
+    std::string _unsavedDescription;
 };
 
 } // namespace orvane

@@ -5,7 +5,9 @@
 #include "platform/plist/PropertyList.h"
 #include "platform/services/Services.h"
 
+#include <cerrno>
 #include <cstdint>
+#include <system_error>
 
 namespace orvane
 {
@@ -48,11 +50,16 @@ std::optional<Bytes> xmlOf(const PropertyValue& snapshot)
     return xml ? xml : xmlPropertyListBytes(storable(snapshot));
 }
 
-bool write(const std::string& path, const PropertyValue& snapshot)
+// Returns why it cannot.
+std::error_code write(const std::string& path, const PropertyValue& snapshot)
 {
     const std::optional<Bytes> xml = xmlOf(snapshot);
-    // Directly, not through a temporary file. This is meant.
-    return xml && writeFile(path, *xml);
+    if (!xml)
+        return std::make_error_code(std::errc::value_too_large);
+    // Deliberate: directly, not through a temporary file.
+    if (!writeFile(path, *xml))
+        return {errno, std::generic_category()};
+    return {};
 }
 
 } // namespace
@@ -65,15 +72,19 @@ SnapshotResult writeSnapshotFile(const FileSystem& files, const PropertyValue& s
         {"Data",        saveHistory                },
         {"Description", description                }
     });
-    // The time of saving, not `timeStamp`: they differ by as long as the screen was open. This is
-    // meant.
+    // Deliberate: the time of saving, not `timeStamp`. They differ by as long as the screen was
+    // open.
     const auto now = wholeSeconds(Services::current().clock().secondsSince1970());
     const std::string path = files.located(std::string(kLogFolder) + "/OrvaneSnapshot-" +
                                            std::to_string(now) + ".orvane");
-    const bool isWritten = write(path, snapshot);
-    if (!isWritten)
+    std::error_code problem = files.makeOwnFolder(kLogFolder);
+    if (!problem)
+        problem = write(path, snapshot);
+    if (problem) {
         logError("Unable to write snapshot to %s", path.c_str());
-    return {isWritten, path};
+        logError("The snapshot was not saved: %s", problem.message().c_str());
+    }
+    return {!problem, path};
 }
 
 } // namespace orvane

@@ -14,6 +14,8 @@ inline constexpr const char* kLogFolder = "/var/mobile/Library/Logs/DiagDrop";
 // What the alert of a failed save says.
 inline constexpr const char* kFileErrorTitle = "File Error";
 inline constexpr const char* kFileErrorMessage = "Unable to write file to disk";
+// The title of the alert that names a saved file.
+inline constexpr const char* kSavedTitle = "Saved";
 
 struct SnapshotResult {
     bool isWritten;
@@ -22,8 +24,9 @@ struct SnapshotResult {
 
 // Writes a snapshot file "OrvaneSnapshot-SECONDS.orvane" into the system's log folder, SECONDS
 // being the current time since 1970: an XML property list of `timeStamp` (when the save screen was
-// opened, seconds since 1970), the save contents unchanged and the user's description. A failure is
-// logged; no half file is left behind.
+// opened, seconds since 1970), the save contents unchanged and the user's description. Makes the
+// folder where what lies above it belongs to the user. A failure is logged, with its reason; no
+// half file is left behind.
 SnapshotResult writeSnapshotFile(const FileSystem& files, const PropertyValue& saveHistory,
                                  double timeStamp, const std::string& description);
 

@@ -20,8 +20,4 @@ private:
     EventThread _thread;
 };
 
-// Where a simulated phone's files are: kept from one run to the next, with the install marker and
-// the log folder in it, so that saving works. Throws std::runtime_error with a line for the user.
-std::string simulatedPhoneRoot();
-
 } // namespace orvane

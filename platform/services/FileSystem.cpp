@@ -7,6 +7,7 @@
 #include <memory>
 #include <sys/stat.h>
 #include <unistd.h>
+#include <vector>
 
 namespace orvane
 {
@@ -32,6 +33,29 @@ bool FileSystem::exists(std::string_view path) const
 {
     std::error_code error;
     return std::filesystem::exists(located(path), error);
+}
+
+std::error_code FileSystem::makeOwnFolder(std::string_view path) const
+{
+    const auto problem = [] { return std::error_code(errno, std::generic_category()); };
+    std::vector<std::string> missing;
+    struct stat status = {};
+    std::string folder = located(path);
+    while (stat(folder.c_str(), &status) != 0) {
+        const std::size_t slash = folder.rfind('/');
+        if (errno != ENOENT || slash == std::string::npos || slash == 0)
+            return problem();
+        missing.push_back(folder);
+        folder.resize(slash);
+    }
+    if (!S_ISDIR(status.st_mode))
+        return std::make_error_code(std::errc::not_a_directory);
+    if (!missing.empty() && status.st_uid != geteuid())
+        return std::make_error_code(std::errc::no_such_file_or_directory);
+    for (; !missing.empty(); missing.pop_back())
+        if (mkdir(missing.back().c_str(), S_IRWXU) != 0 && errno != EEXIST)
+            return problem();
+    return {};
 }
 
 std::optional<Bytes> readFile(const std::string& path, std::size_t limit)

@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <system_error>
 
 namespace orvane
 {
@@ -20,6 +21,10 @@ public:
     // Where an absolute path of the system really is: "/a/b" below root "/tmp/x" is "/tmp/x/a/b".
     [[nodiscard]] std::string located(std::string_view path) const;
     [[nodiscard]] bool exists(std::string_view path) const;
+    // Makes the folder, for its user alone, and the ones above it that are missing, where the
+    // nearest folder that exists belongs to the user. Does nothing to a folder that exists.
+    // Returns why there is no such folder afterwards.
+    [[nodiscard]] std::error_code makeOwnFolder(std::string_view path) const;
 
 private:
     std::string _root;

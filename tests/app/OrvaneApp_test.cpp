@@ -206,6 +206,7 @@ TEST_F(OrvaneAppTest, SaveOpensTheSaveScreenOnceWithWhatThereIsNow)
 TEST_F(OrvaneAppTest, AFailedSaveClosesTheScreenAndLeavesTheAlert)
 {
     makeMarker();
+    ASSERT_TRUE(writeFile(root.path() + "/var", {})); // so that the log folder cannot be made
     launch();
     app.showSaveView();
     app.saveView()->savePressed();

@@ -232,16 +232,18 @@ TEST_F(ProgramTest, SavingWhereItIsNotOfferedAndUnknownCommandsAreAnswered)
     EXPECT_THAT(viewer->waitForText("error").value_or(""), HasSubstr("unknown command"));
 }
 
-TEST_F(ProgramTest, SavingWithoutAFolderIsAnAlert)
+TEST_F(ProgramTest, SavingWhereTheFolderCannotBeMadeIsAnAlert)
 {
     offerSaving();
     std::filesystem::remove_all(root() + "/var");
+    ASSERT_TRUE(writeFile(root() + "/var", {})); // so that the folder cannot be made
     const auto viewer = orvane({"--ui", "json"});
     ASSERT_TRUE(viewer->waitForText("status"));
     viewer->writeLine("save x");
     EXPECT_EQ(viewer->waitForText("alert"),
               R"({"alert":"File Error","message":"Unable to write file to disk"})");
     EXPECT_TRUE(viewer->waitForError("error: Unable to write snapshot to "));
+    EXPECT_TRUE(viewer->waitForError("error: The snapshot was not saved: Not a directory"));
 }
 
 TEST_F(ProgramTest, TheEndOfInputEndsNothing)
@@ -293,6 +295,19 @@ TEST_F(ProgramTest, TheDemoMarksItsPhoneAsSimulatedAndOffersSaving)
     viewer.writeLine("quit");
     EXPECT_EQ(viewer.waitForEnd(), 0);
     EXPECT_THAT(viewer.errors(), Not(HasSubstr("error")));
+}
+
+TEST_F(ProgramTest, WithoutARootAnOrdinaryMachineSavesInTheUsersStateDirectory)
+{
+    const std::vector<std::string> environment = {"XDG_STATE_HOME=" + directory.path()};
+    ChildProcess viewer({ORVANE_PROGRAM, "--ports", ports(), "--ui", "json", "--log", "none"},
+                        environment);
+    ASSERT_TRUE(viewer.waitForText("status"));
+    viewer.writeLine("save x");
+    EXPECT_THAT(viewer.waitForText("saved").value_or(""),
+                StartsWith("{\"saved\":\"" + directory.path() + "/orvane/root/var/mobile/"));
+    EXPECT_EQ(std::filesystem::status(directory.path() + "/orvane/root").permissions(),
+              std::filesystem::perms::owner_all);
 }
 
 TEST_F(ProgramTest, UnusableArgumentsEndItWithOneLineAndStatusTwo)

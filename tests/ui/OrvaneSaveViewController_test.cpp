@@ -46,6 +46,9 @@ protected:
         static_cast<void>(controller->view());
         controller->viewWillAppear(true);
     }
+    // A file stands where the log folder's parent should be.
+    void forbidSaving() { ASSERT_TRUE(writeFile(root.path() + "/var", {})); }
+    void allowSaving() { std::filesystem::remove(root.path() + "/var"); }
     void makeLogFolder() { std::filesystem::create_directories(folder()); }
     [[nodiscard]] std::string folder() const
     {
@@ -106,7 +109,10 @@ TEST_F(OrvaneSaveViewControllerTest, SaveWritesTheThreeKeysAndCloses)
                                          {"Data",        history                    },
                                          {"Description", "by the river"             }
     }));
-    EXPECT_EQ(screen.alert(), nullptr);
+    ASSERT_NE(screen.alert(), nullptr);
+    EXPECT_EQ(screen.alert()->title(), "Saved");
+    EXPECT_EQ(screen.alert()->message(), folder() + "/OrvaneSnapshot-1795255200.orvane");
+    EXPECT_EQ(screen.alert()->buttonTitle(), "Close");
 }
 
 TEST_F(OrvaneSaveViewControllerTest, TheNameIsBySecondOfThePressAndTheTimestampOfTheOpening)
@@ -140,6 +146,7 @@ TEST_F(OrvaneSaveViewControllerTest, WhatComesLaterIsNotSaved)
 
 TEST_F(OrvaneSaveViewControllerTest, AFailureShowsTheAlertAndCloses)
 {
+    forbidSaving();
     open(PropertyValue::newArray());
     controller->savePressed();
     shell.queue.runPending();
@@ -149,7 +156,35 @@ TEST_F(OrvaneSaveViewControllerTest, AFailureShowsTheAlertAndCloses)
     EXPECT_EQ(screen.alert()->message(), "Unable to write file to disk");
     EXPECT_EQ(screen.alert()->buttonTitle(), "Close");
     EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + folder() +
-                                                   "/OrvaneSnapshot-1795255200.orvane"));
+                                                       "/OrvaneSnapshot-1795255200.orvane",
+                                                   "The snapshot was not saved: Not a directory"));
+}
+
+TEST_F(OrvaneSaveViewControllerTest, ADescriptionThatWasNotSavedIsThereTheNextTime)
+{
+    forbidSaving();
+    open(PropertyValue::newArray());
+    controller->saveDescription()->setText("by the river");
+    controller->savePressed();
+    allowSaving();
+    open(PropertyValue::newArray());
+    EXPECT_EQ(controller->saveDescription()->text(), "by the river");
+    controller->savePressed();
+    EXPECT_EQ(savedAt("1795255200")["Description"], PropertyValue("by the river"));
+    open(PropertyValue::newArray());
+    EXPECT_EQ(controller->saveDescription()->text(), "");
+}
+
+TEST_F(OrvaneSaveViewControllerTest, ADescriptionThatWasCancelledIsGone)
+{
+    forbidSaving();
+    open(PropertyValue::newArray());
+    controller->saveDescription()->setText("by the river");
+    controller->savePressed();
+    open(PropertyValue::newArray());
+    controller->cancelPressed();
+    open(PropertyValue::newArray());
+    EXPECT_EQ(controller->saveDescription()->text(), "");
 }
 
 TEST_F(OrvaneSaveViewControllerTest, TheButtonsOfTheInterfaceSaveAndCancel)

@@ -22,6 +22,7 @@ namespace
 {
 
 using ::testing::ElementsAre;
+using ::testing::IsEmpty;
 
 constexpr const char* kFolder = "/var/mobile/Library/Logs/DiagDrop";
 
@@ -110,12 +111,33 @@ TEST_F(SnapshotFileTest, EmptyContentsAndDescriptionAreSavedAsSuch)
     EXPECT_EQ(saved["Description"], PropertyValue(""));
 }
 
-TEST_F(SnapshotFileTest, AMissingFolderFailsWithALineAndMakesNothing)
+TEST_F(SnapshotFileTest, AMissingFolderIsMadeForTheUserAloneWhereWhatLiesAboveIsTheUsers)
 {
     const SnapshotResult result = writeSnapshotFile(files, PropertyValue::newArray(), 0, "");
+    EXPECT_TRUE(result.isWritten);
+    EXPECT_THAT(services.log.errors(), IsEmpty());
+    EXPECT_EQ(std::filesystem::status(root.path() + kFolder).permissions(),
+              std::filesystem::perms::owner_all);
+}
+
+TEST_F(SnapshotFileTest, AFolderThatCannotBeMadeFailsWithItsReason)
+{
+    std::filesystem::create_directories(root.path() + "/var/mobile/Library");
+    ASSERT_TRUE(writeFile(root.path() + "/var/mobile/Library/Logs", {}));
+    const SnapshotResult result = writeSnapshotFile(files, PropertyValue::newArray(), 0, "");
     EXPECT_FALSE(result.isWritten);
-    EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + result.path));
-    EXPECT_TRUE(std::filesystem::is_empty(root.path()));
+    EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + result.path,
+                                                   "The snapshot was not saved: Not a directory"));
+}
+
+TEST_F(SnapshotFileTest, AFileThatCannotBeWrittenFailsWithItsReason)
+{
+    makeFolder();
+    std::filesystem::create_directory(root.path() + kFolder + "/OrvaneSnapshot-1795255200.orvane");
+    const SnapshotResult result = writeSnapshotFile(files, PropertyValue::newArray(), 0, "");
+    EXPECT_FALSE(result.isWritten);
+    EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + result.path,
+                                                   "The snapshot was not saved: Is a directory"));
 }
 
 TEST_F(SnapshotFileTest, ASecondSaveWithinTheSecondReplacesTheFirst)

@@ -58,6 +58,32 @@ TEST(FileSystemTest, ExistenceIsAskedBelowTheRoot)
     EXPECT_FALSE(FileSystem(directory.path() + "/folder").exists("/marker"));
 }
 
+TEST(FileSystemTest, FoldersAreMadeForTheUserAlone)
+{
+    const TemporaryDirectory directory;
+    const FileSystem files(directory.path());
+    EXPECT_FALSE(files.makeOwnFolder("/a/b/c"));
+    for (const char* folder : {"/a", "/a/b", "/a/b/c"})
+        EXPECT_EQ(fs::status(directory.path() + folder).permissions(), fs::perms::owner_all);
+    EXPECT_FALSE(files.makeOwnFolder("/a/b/c"));
+    ASSERT_TRUE(writeFile(directory.path() + "/file", {}));
+    for (const char* folder : {"/file", "/file/below"})
+        EXPECT_EQ(files.makeOwnFolder(folder), std::errc::not_a_directory) << folder;
+}
+
+TEST(FileSystemTest, NoFolderIsMadeInAnotherUsersFolder)
+{
+    if (geteuid() != 0)
+        GTEST_SKIP() << "only root can give a folder to another user";
+    const TemporaryDirectory directory;
+    const FileSystem files(directory.path());
+    fs::create_directory(directory.path() + "/theirs");
+    ASSERT_EQ(chown((directory.path() + "/theirs").c_str(), 65534, 65534), 0);
+    EXPECT_EQ(files.makeOwnFolder("/theirs/mine"), std::errc::no_such_file_or_directory);
+    EXPECT_TRUE(fs::is_empty(directory.path() + "/theirs"));
+    EXPECT_FALSE(files.makeOwnFolder("/theirs")); // exists
+}
+
 TEST(FileSystemTest, WhatIsWrittenIsRead)
 {
     const TemporaryDirectory directory;

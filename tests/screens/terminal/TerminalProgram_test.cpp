@@ -12,6 +12,7 @@
 #include <algorithm>
 #include <csignal>
 #include <filesystem>
+#include <fstream>
 #include <iterator>
 #include <memory>
 #include <regex>
@@ -304,16 +305,22 @@ TEST_F(TerminalProgramTest, ASnapshotIsSavedWithADescription)
     terminal->send(kEnter);
     ASSERT_TRUE(terminal->waitFor("Enter save"));
     terminal->send(kEnter);
-    ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
+    ASSERT_TRUE(terminal->waitFor("[ Close ]"));
+    expectShown(*terminal, "Saved");
+    expectShown(*terminal, "OrvaneSnapshot-");
+    terminal->send(kEnter);
+    expectGone(*terminal, "[ Close ]");
+    expectShown(*terminal, "Serving Cell Info");
     const fs::directory_iterator files(root() + kSaveFolder);
     ASSERT_NE(files, fs::directory_iterator());
     EXPECT_THAT(files->path().filename().string(), StartsWith("OrvaneSnapshot-"));
     EXPECT_GT(fs::file_size(files->path()), 100U);
 }
 
-TEST_F(TerminalProgramTest, WithoutTheFolderTheAlertIsShown)
+TEST_F(TerminalProgramTest, WhereTheFolderCannotBeMadeTheAlertIsShown)
 {
     offerSaving(false);
+    std::ofstream(root() + "/var") << "not a folder";
     const auto terminal = startDemo();
     ASSERT_TRUE(terminal->waitFor("Serving Cell Info"));
     terminal->send(std::string("s") + kEnter + kEnter);

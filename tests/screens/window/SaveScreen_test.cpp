@@ -115,8 +115,20 @@ TEST_F(SaveScreenTest, SavedFileHoldsTheTypedDescription)
     EXPECT_EQ((*snapshot.asDictionary())["Data"].asArray()->size(), 2U);
 }
 
-TEST_F(SaveScreenTest, WithoutAFolderTheAlertStaysAndTheScreenGoes)
+TEST_F(SaveScreenTest, TheAlertSaysWhereTheSavedFileIs)
 {
+    open();
+    click("saveButton");
+    ASSERT_TRUE(frame().alert().isVisible());
+    ASSERT_TRUE(screen.alert());
+    EXPECT_EQ(screen.alert()->title(), "Saved");
+    ASSERT_EQ(savedFiles().size(), 1U);
+    EXPECT_EQ(screen.alert()->message(), savedFiles().front());
+}
+
+TEST_F(SaveScreenTest, WhereNothingCanBeWrittenTheAlertStaysAndTheScreenGoes)
+{
+    ASSERT_TRUE(writeFile(files().located("/var"), {})); // so that the folder cannot be made
     open();
     click("saveButton");
     EXPECT_FALSE(isOpen());
