@@ -11,22 +11,26 @@ namespace orvane
 namespace
 {
 
-constexpr CommandLineCommand kCommands[] = {
-    {"",       "[OPTION...]",                       R"(
+constexpr std::string_view kLiveAbout = R"(
 Shows what the modem knows about the radio network, from this machine's telephony server or from
-FILE, a recorded diagnostic log (.dlf) or a saved snapshot (.orvane).)",
-     R"(
+FILE, a recorded diagnostic log (.dlf) or a saved snapshot (.orvane); "-" is standard input.)";
+
+constexpr std::string_view kLiveNotes = R"(
 With text and json, lines on standard input are commands: "save DESCRIPTION" saves a snapshot where
-saving is offered, "quit" ends the program.)"                                                   },
-    {"open",   "open FILE [OPTION...]",             "",  ""},
-    {"export", "export FILE [OPTION...] [PATH...]", R"(
+saving is offered, "quit" ends the program.)";
+
+constexpr std::string_view kExportAbout = R"(
 Writes rows of a recording to standard output, one line a refresh period.
 
 FILE is a diagnostic log (.dlf) or a saved snapshot (.orvane), which gives a line for each of its
-entries. A PATH is that of a row, as in "/Serving Cell Info/Cell Identity", or of a group for all
-its rows; * stands for any name, such as the elements of a list. Without a PATH, every row is
-written.)",
-     ""                                                    },
+entries; "-" is standard input. A PATH is that of a row, as in "/Serving Cell Info/Cell Identity",
+or of a group for all its rows; * stands for any name, such as the elements of a list. Without a
+PATH, every row is written.)";
+
+constexpr CommandLineCommand kCommands[] = {
+    {"",       "[FILE] [OPTION...]",                kLiveAbout,   kLiveNotes},
+    {"open",   "open FILE [OPTION...]",             "",           ""        },
+    {"export", "export FILE [OPTION...] [PATH...]", kExportAbout, ""        },
 };
 
 constexpr unsigned bit(AppCommand command) { return 1U << static_cast<unsigned>(command); }
@@ -87,6 +91,16 @@ constexpr AppOption kOptions[] = {
          kExport},
         &AppOptions::isForSpreadsheet),
     AppOption({"list", "", "print the paths that occur", kExport}, &AppOptions::listsPaths),
+    AppOption(
+        {"once", "[SECONDS]",
+         "with text and json: print the first display that has rows, then end; fail if none comes "
+         "within SECONDS (default 10)",
+         kLive, 0.01, 86400},
+        [](AppOptions& options, const GivenOption& given) {
+            options.once = std::chrono::seconds(10);
+            if (!given.value().empty())
+                given.storeIn(*options.once);
+        }),
     AppOption({"technology", "NAME",
                "what FILE is a recording of: {} (default: by the log codes in it)", kRecordings},
               [](AppOptions& options, const GivenOption& given) {
@@ -108,15 +122,23 @@ std::vector<CommandLineOption> describedOptions()
     return {std::begin(kOptions), std::end(kOptions)};
 }
 
-// The command that the first word names; the live view where it names none.
+// Whether a word is the name of a file rather than a command that was misspelt.
+bool isFileName(const std::string& word)
+{
+    return word == "-" || word.find_first_of("./") != std::string::npos;
+}
+
+// The command that the first word names. A file's name stands for "open"; the live view has no
+// word.
 AppCommand commandOf(const std::vector<std::string>& words)
 {
     const auto found =
         words.empty() ? std::end(kCommands)
                       : std::find_if(std::begin(kCommands), std::end(kCommands),
                                      [&](const auto& each) { return each.name == words.front(); });
-    return found == std::end(kCommands) ? AppCommand::Live
-                                        : static_cast<AppCommand>(found - std::begin(kCommands));
+    if (found != std::end(kCommands))
+        return static_cast<AppCommand>(found - std::begin(kCommands));
+    return !words.empty() && isFileName(words.front()) ? AppCommand::Open : AppCommand::Live;
 }
 
 void takeWords(AppOptions& options, std::vector<std::string> words,
@@ -130,9 +152,12 @@ void takeWords(AppOptions& options, std::vector<std::string> words,
             std::find(scenarios.begin(), scenarios.end(), word) != scenarios.end();
         throw UsageError(
             "\"" + word + "\" is not a command: " +
-            (isScenario ? "for the simulated phone write --demo=" + word : "see orvane --help"));
+            (isScenario
+                 ? "for the simulated phone write --demo=" + word
+                 : "see orvane --help; to open a file of that name write orvane open " + word));
     }
-    words.erase(words.begin());
+    if (words.front() == kCommands[static_cast<std::size_t>(options.command)].name)
+        words.erase(words.begin());
     if (words.empty() || words.front().empty() ||
         (options.command == AppCommand::Open && words.size() > 1))
         throw UsageError(options.command == AppCommand::Open
@@ -162,6 +187,11 @@ void parse(AppOptions& options, std::span<const std::string> arguments,
     if (options.demo && line.has("ports"))
         throw UsageError("--ports cannot be used with --demo, which has a private directory of its "
                          "own");
+    if (options.once && !options.frontEnd)
+        options.frontEnd = FrontEndKind::Text;
+    if (options.once &&
+        (options.frontEnd == FrontEndKind::Window || options.frontEnd == FrontEndKind::Terminal))
+        throw UsageError("--once is for --ui text and --ui json");
     if (options.overwritesRecord && !options.record)
         throw UsageError("--force is for --record FILE, which is not given");
     if (options.listsPaths && line.has("format"))

@@ -32,7 +32,9 @@ struct AppOptions {
 
     // Of the live view.
     std::optional<std::string> demo; // the scenario of a simulated phone
-    std::string ports;               // empty where not given
+    // Print the first display that has rows and end; give up after that time.
+    std::optional<std::chrono::nanoseconds> once;
+    std::string ports; // empty where not given
     std::optional<std::string> root;
     std::optional<std::string> record; // the file to record to
     bool overwritesRecord = false;     // even if it already exists

@@ -8,6 +8,7 @@
 #include "app/program/OpenProgram.h"
 #include "app/program/ProgramServices.h"
 #include "app/program/SimulatedPhone.h"
+#include "app/program/StandardInput.h"
 #include "app/program/TerminalFrontEnd.h"
 #include "app/program/WindowFrontEnd.h"
 #include "platform/linux/BoundedCall.h"
@@ -147,7 +148,7 @@ int main(int argc, char** argv)
     prepareStandardDescriptors();
     const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
     const std::vector<std::string> scenarios = scenarioNames();
-    const AppOptions options = parseAppOptions(arguments, scenarios);
+    AppOptions options = parseAppOptions(arguments, scenarios);
     if (options.error) {
         complain(*options.error);
         return kUnusableArguments;
@@ -162,9 +163,20 @@ int main(int argc, char** argv)
     }
 
     const bool isExport = options.command == AppCommand::Export;
+    const bool readsStandardInput = options.file == "-";
+    if (readsStandardInput) {
+        try {
+            options.file = keepStandardInput();
+        } catch (const std::exception& failure) {
+            complain(failure.what());
+            return kFailure;
+        }
+    }
     const FrontEndKind kind =
         isExport ? FrontEndKind::Text
                  : options.frontEnd.value_or(defaultFrontEnd(hasDisplay(), !terminalProblem()));
+    if (readsStandardInput && (kind == FrontEndKind::Text || kind == FrontEndKind::Json))
+        closeStandardInput();
     const auto log = makeLog(options.log, "orvane");
     // Standard output carries data, or the terminal's screen, unless there is a window.
     const ProgramServices services(log.get(), kind == FrontEndKind::Window ? stdout : stderr);

@@ -55,6 +55,19 @@ TEST(AppOptionsTest, TheDemoIsLteUnlessNamed)
     EXPECT_EQ(parsed({"--demo=umts"}).demo, "umts");
 }
 
+TEST(AppOptionsTest, OnceIsForTextAndJsonAndTextUnlessNamed)
+{
+    EXPECT_FALSE(parsed({}).once);
+    EXPECT_EQ(parsed({"--once"}).once, 10s);
+    EXPECT_EQ(parsed({"--once"}).frontEnd, FrontEndKind::Text);
+    EXPECT_EQ(parsed({"--once=0.5", "--ui", "json"}).once, 500ms);
+    EXPECT_EQ(parsed({"--once=0.5", "--ui", "json"}).frontEnd, FrontEndKind::Json);
+    for (const char* ui : {"window", "terminal"})
+        EXPECT_THAT(parsed({"--once", "--ui", ui}).error.value_or(""),
+                    HasSubstr("--once is for --ui text and --ui json"));
+    EXPECT_THAT(parsed({"--once=soon"}).error.value_or(""), HasSubstr("--once \"soon\""));
+}
+
 TEST(AppOptionsTest, EachMistakeIsToldInOneLineThatSaysWhatToDo)
 {
     const struct {

@@ -43,6 +43,20 @@ TEST(OpenOptionsTest, OptionsMayStandAnywhere)
     }
 }
 
+TEST(OpenOptionsTest, AFileNameAloneIsOpened)
+{
+    for (const char* file : {"drive.dlf", "./drive", "/tmp/a", "-"}) {
+        const AppOptions options = parsed({"--ui", "json", file});
+        EXPECT_FALSE(options.error) << file;
+        EXPECT_EQ(options.command, AppCommand::Open) << file;
+        EXPECT_EQ(options.file, file);
+    }
+    EXPECT_THAT(parsed({"drive"}).error.value_or(""),
+                HasSubstr("to open a file of that name write orvane open drive"));
+    EXPECT_THAT(parsed({"a.dlf", "b.dlf"}).error.value_or(""), HasSubstr("one recording"));
+    EXPECT_EQ(parsed({"open", "-"}).file, "-");
+}
+
 TEST(OpenOptionsTest, AFileMayHaveAnyName)
 {
     EXPECT_EQ(parsed({"open", "open"}).file, "open");

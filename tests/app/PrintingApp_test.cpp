@@ -149,6 +149,29 @@ TEST_F(PrintingAppTest, WhileNotConnectedAReloadLeavesTheTimeOfTheLastUpdate)
     EXPECT_THAT(takeLines(), ElementsAre("Updated 2026-11-21 at 10:00:00, 10"));
 }
 
+TEST_F(PrintingAppTest, OncePrintsTheFirstTreeWithRowsAndNothingElse)
+{
+    int ends = 0;
+    PrintingApp once{
+        {queue, ports, client, 2s, [] { return std::optional<std::string>("ONCE"); }},
+        files,
+        preferences,
+        printer,
+        [&ends] { ++ends; }
+    };
+    once.applicationDidFinishLaunching();
+    queue.advance(10s);
+    EXPECT_THAT(takeLines(), IsEmpty());
+    EXPECT_EQ(ends, 0);
+    for (const std::uint32_t cell : {9U, 10U}) {
+        sendServingCell(cell);
+        queue.advance(2s);
+    }
+    EXPECT_THAT(takeLines(), ElementsAre("Updated 2026-11-21 at 10:00:00, 9"));
+    EXPECT_EQ(ends, 1);
+    once.applicationWillTerminate();
+}
+
 TEST_F(PrintingAppTest, BeforeTheLaunchAndAfterTheEndNothingIsPrinted)
 {
     app.updateViewControllerFromModel();

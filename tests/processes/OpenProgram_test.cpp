@@ -20,6 +20,7 @@ namespace
 
 using namespace std::chrono_literals;
 using testing::AllOf;
+using testing::ElementsAre;
 using testing::EndsWith;
 using testing::HasSubstr;
 using testing::IsEmpty;
@@ -104,6 +105,37 @@ TEST(OpenProgramTest, ADamagedLogShowsWhatCanBePlacedAndTellsTheRest)
     EXPECT_THAT(program->errors(),
                 EndsWith("lte-drive-damaged.dlf: 198 bytes could not be placed: 67 at byte 35165, "
                          "131 at byte 70228\n"));
+}
+
+// Runs a shell command with $orvane as the program and $log as a recording.
+ChildProcess shell(const std::string& command)
+{
+    return ChildProcess({"/bin/sh", "-c", command}, {std::string("orvane=") + ORVANE_PROGRAM,
+                                                     "log=" + recording("lte-drive.dlf")});
+}
+
+TEST(OpenProgramTest, AFileNameAloneIsOpened)
+{
+    ChildProcess program = shell("\"$orvane\" --log none --ui json \"$log\" | wc -l");
+    EXPECT_EQ(program.waitForEnd(), 0);
+    EXPECT_THAT(program.lines(), ElementsAre("150"));
+}
+
+TEST(OpenProgramTest, ARecordingComesFromStandardInputToo)
+{
+    for (const char* command : {"open - --ui json", "- --ui json", "export -"}) {
+        ChildProcess program =
+            shell("cat \"$log\" | \"$orvane\" --log none " + std::string(command) + " | wc -l");
+        EXPECT_EQ(program.waitForEnd(), 0) << command;
+        EXPECT_THAT(program.lines(), ElementsAre("150")) << command;
+    }
+}
+
+TEST(OpenProgramTest, AnEmptyStandardInputIsOneClearLine)
+{
+    ChildProcess program = shell("\"$orvane\" --log none export - </dev/null");
+    EXPECT_EQ(program.waitForEnd(), 1);
+    EXPECT_THAT(program.errors(), StartsWith("orvane: "));
 }
 
 TEST(OpenProgramTest, WhatCannotBeOpenedIsOneClearLine)

@@ -310,6 +310,25 @@ TEST_F(ProgramTest, WithoutARootAnOrdinaryMachineSavesInTheUsersStateDirectory)
               std::filesystem::perms::owner_all);
 }
 
+TEST_F(ProgramTest, OncePrintsTheFirstDisplayWithRowsAndEnds)
+{
+    const auto server = telephonyd({"--demo=lte"});
+    const auto viewer = orvane({"--ui", "json", "--once"});
+    EXPECT_EQ(viewer->waitForEnd(), 0);
+    ASSERT_EQ(viewer->lines().size(), 1U);
+    EXPECT_THAT(viewer->lines()[0], StartsWith("{\"status\":\"Updated "));
+    EXPECT_THAT(viewer->lines()[0], HasSubstr("\"value\":"));
+}
+
+TEST_F(ProgramTest, OnceFailsWithOneLineWhereNoDisplayComes)
+{
+    const auto viewer = orvane({"--once=0.2", "--log", "none"});
+    EXPECT_EQ(viewer->waitForEnd(), 1);
+    EXPECT_THAT(viewer->lines(), IsEmpty());
+    EXPECT_EQ(viewer->errors(), "orvane: no display with rows came in time: start telephonyd, or "
+                                "give --once=SECONDS more time\n");
+}
+
 TEST_F(ProgramTest, UnusableArgumentsEndItWithOneLineAndStatusTwo)
 {
     const std::vector<std::vector<std::string>> kArguments = {
