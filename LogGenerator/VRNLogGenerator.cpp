@@ -64,9 +64,11 @@ void VRNLogGenerator::recordSnapshot(PropertyDictionary& state)
 
 std::optional<Bytes> VRNLogGenerator::generateDlfFromState(const PropertyDictionary& state)
 {
-    std::optional<Bytes> dlf = makeVersionReport();
+    std::optional<Bytes> dlf(std::in_place, kDlfVersionReportBytes);
+    if (!writeVersionReport(*dlf))
+        return std::nullopt;
     const PropertyArray* history = state[kHistoryKey].asArray();
-    if (!dlf || !history)
+    if (!history)
         return dlf;
     for (const PropertyValue& snapshot : *history) {
         const PropertyValue& messages = snapshot[kDisplayStateKey];

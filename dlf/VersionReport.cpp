@@ -73,23 +73,20 @@ int VRTDLFAddVersionReport(std::uint8_t* buffer, std::uint32_t size, std::uint32
     return 0;
 }
 
-std::optional<Bytes> makeVersionReport()
+bool writeVersionReport(std::span<std::uint8_t> buffer)
 {
-    Bytes report(kDlfVersionReportBytes, 0);
     const Clock& clock = Services::current().clock();
     const double now = clock.secondsSince1970();
     const TimeZone zone = clock.timeZoneAt(now);
     std::uint32_t written = 0;
     const int result = VRTDLFAddVersionReport(
-        report.data(), static_cast<std::uint32_t>(report.size()), &written, 1, 1,
+        buffer.data(), static_cast<std::uint32_t>(buffer.size()), &written, 1, 1,
         versionText().c_str(), kProgramName, kBuildDate,
         static_cast<std::uint32_t>(static_cast<std::int64_t>(now)),
         static_cast<std::int16_t>(zone.secondsFromGmt / 60), zone.isDaylightSaving ? 1 : 0);
-    if (result != 0) {
+    if (result != 0)
         logError("Could not write DLF header (result=%d)", result);
-        return std::nullopt;
-    }
-    return report;
+    return result == 0;
 }
 
 } // namespace orvane

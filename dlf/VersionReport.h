@@ -1,9 +1,7 @@
 #pragma once
 
-#include "platform/base/Bytes.h"
-
 #include <cstdint>
-#include <optional>
+#include <span>
 
 namespace orvane
 {
@@ -27,8 +25,9 @@ int VRTDLFAddVersionReport(std::uint8_t* buffer, std::uint32_t size, std::uint32
                            const char* buildDateText, std::uint32_t time, std::int16_t zoneMinutes,
                            std::uint8_t isDaylightSaving);
 
-// The version report with which this program's DLF files begin: program version, clock time and
-// local time zone. nullopt, with an error line in the log, if it cannot be made.
-std::optional<Bytes> makeVersionReport();
+// Writes the version report with which this program's DLF files begin at the start of the buffer:
+// program version, clock time and local time zone. Returns false, with an error line in the log,
+// where it does not fit.
+bool writeVersionReport(std::span<std::uint8_t> buffer);
 
 } // namespace orvane

@@ -29,8 +29,8 @@ std::unique_ptr<LogRecorder> LogRecorder::create(MainQueue& queue, const std::st
     auto file = DiskBlockFile::create(path, existing, error);
     if (!file)
         return nullptr;
-    const auto report = makeVersionReport();
-    const int failure = report ? file->append(*report) : EIO;
+    Bytes report(kDlfVersionReportBytes);
+    const int failure = writeVersionReport(report) ? file->append(report) : EIO;
     if (failure == 0)
         return std::make_unique<LogRecorder>(queue, std::move(file), path, std::move(notify));
     error = "\"" + path + "\" cannot be written (" + std::strerror(failure) +

@@ -1,6 +1,8 @@
 #include "dlf/VersionReport.h"
 
-#include <gtest/gtest.h>
+#include "support/Recording.h"
+
+#include <gmock/gmock.h>
 
 #include <algorithm>
 #include <string>
@@ -49,6 +51,19 @@ std::string field(const std::string& text, std::size_t width)
     std::string padded = text;
     padded.resize(width, '\0');
     return padded;
+}
+
+TEST_F(VersionReportTest, ABufferThatIsTooSmallForTheHeaderIsLoggedAndLeft)
+{
+    const TestServices services;
+    bytes.assign(kDlfVersionReportBytes - 1, 0xAA);
+    EXPECT_FALSE(writeVersionReport(bytes));
+    EXPECT_THAT(services.log.errors(),
+                testing::ElementsAre("Could not write DLF header (result=3)"));
+    EXPECT_THAT(bytes, testing::Each(0xAA));
+    bytes.push_back(0xAA);
+    EXPECT_TRUE(writeVersionReport(bytes));
+    EXPECT_EQ(services.log.errors().size(), 1U);
 }
 
 TEST_F(VersionReportTest, EveryByteOfTheReportIsInItsPlace)

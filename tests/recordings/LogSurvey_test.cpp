@@ -17,6 +17,13 @@ namespace
 
 using testing::HasSubstr;
 
+Bytes versionReport()
+{
+    Bytes report(kDlfVersionReportBytes);
+    EXPECT_TRUE(writeVersionReport(report));
+    return report;
+}
+
 class LogSurveyTest : public ::testing::Test
 {
 protected:
@@ -130,7 +137,7 @@ TEST_F(LogSurveyTest, ALogMayHaveNoTimestampsAndSomeThatAreWild)
 
 TEST_F(LogSurveyTest, ALogOfNothingButItsReportIsEmpty)
 {
-    const LogSurvey survey = read(sourceOf(makeVersionReport().value_or(Bytes())));
+    const LogSurvey survey = read(sourceOf(versionReport()));
     EXPECT_FALSE(survey.technology());
     EXPECT_EQ(survey.complaint("a.dlf"), "\"a.dlf\": the log is empty, nothing follows its version "
                                          "report: name another file");
@@ -139,7 +146,7 @@ TEST_F(LogSurveyTest, ALogOfNothingButItsReportIsEmpty)
 TEST_F(LogSurveyTest, ADamagedLogThatBeginsWithAReportIsALog)
 {
     LogBuilder builder;
-    builder.bytes = makeVersionReport().value_or(Bytes());
+    builder.bytes = versionReport();
     builder.servingCell(kLogStart, 1);
     builder.servingCell(kLogStart, 1);
     builder.servingCell(kLogStart, 1);
@@ -150,7 +157,7 @@ TEST_F(LogSurveyTest, ADamagedLogThatBeginsWithAReportIsALog)
 TEST_F(LogSurveyTest, ALogOfUnknownCodesAsksForItsTechnology)
 {
     LogBuilder builder;
-    builder.bytes = makeVersionReport().value_or(Bytes());
+    builder.bytes = versionReport();
     builder.item(0x1234, kLogStart, Bytes(10, 1));
     const LogSurvey survey = read(builder.source());
     EXPECT_FALSE(survey.technology());

@@ -52,6 +52,8 @@ TEST_F(OrvaneCellTest, AValueCellHasBothInTheStrip)
     EXPECT_EQ(cell->strip()->superview(), &cell->contentView());
     EXPECT_EQ(cell->key()->font(), Font::boldSystem(15));
     EXPECT_EQ(cell->value()->font(), Font::system(15));
+    EXPECT_EQ(cell->key()->alignment(), TextAlignment::Left);
+    EXPECT_EQ(cell->value()->alignment(), TextAlignment::Left);
 }
 
 TEST_F(OrvaneCellTest, AKeyStandsTenPointsInAndInTheMiddleOfTheRow)

@@ -129,6 +129,25 @@ TEST_F(OrvanePaneControllerTest, AGroupsCellReusedForAValueShowsNoValue)
     EXPECT_EQ(cell(0)->accessory(), CellAccessory::None);
 }
 
+// The accessory takes room from the content, so the layout must already know it.
+TEST_F(OrvanePaneControllerTest, AValueInACellThatWasAGroupsIsFlushAgainstTheEdgeWithoutAccessory)
+{
+    const PropertyValue value = group({
+        {"a", "value"}
+    });
+    show(value);
+    const auto valueCell = cell(0);
+    const Rect alone = valueCell->value()->frame();
+    show(group({
+        {"a", group({})}
+    }));
+    ASSERT_EQ(cell(0), valueCell);
+    ASSERT_EQ(cell(0)->accessory(), CellAccessory::DisclosureIndicator);
+    show(value);
+    ASSERT_EQ(cell(0), valueCell);
+    EXPECT_EQ(cell(0)->value()->frame(), alone);
+}
+
 TEST_F(OrvanePaneControllerTest, AValuesCellReusedForAGroupShowsTheKeyAlone)
 {
     show(group({

@@ -93,6 +93,16 @@ TEST_F(OrvaneModelNodeTest, SortingIsByCharactersNotByNumbers)
     EXPECT_THAT(namesOf(root), ElementsAre("Y", "X"));
 }
 
+TEST_F(OrvaneModelNodeTest, SortingTellsCapitalsFromSmallLetters)
+{
+    const NodePointer root = make(PropertyValue::dictionaryOf({
+        {"a;Y",     ""},
+        {"B;X",     ""},
+        {"_sorted", ""}
+    }));
+    EXPECT_THAT(namesOf(root), ElementsAre("X", "Y"));
+}
+
 TEST_F(OrvaneModelNodeTest, AnyValueUnderSortedSorts)
 {
     const NodePointer root = make(PropertyValue::dictionaryOf({
