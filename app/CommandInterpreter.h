@@ -13,7 +13,7 @@ namespace orvane
 class CommandInterpreter
 {
 public:
-    // All are referred to and must outlive this.
+    // All must outlive this object.
     CommandInterpreter(LiveApp& app, Printer& output, std::function<void()> quit)
         : _app(app), _output(output), _quit(std::move(quit))
     {

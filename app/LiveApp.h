@@ -23,7 +23,7 @@ inline constexpr const char* kInstallMarker =
 class LiveApp : public ModelObserver
 {
 public:
-    // All are referred to and must outlive the application.
+    // All must outlive the application.
     LiveApp(ModelEnvironment environment, const FileSystem& files, PreferencesStore& preferences);
     LiveApp(const LiveApp&) = delete;
     LiveApp& operator=(const LiveApp&) = delete;

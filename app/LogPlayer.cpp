@@ -17,7 +17,7 @@ using std::chrono::nanoseconds;
 
 constexpr int kSpeeds[] = {1, 2, 5, 10, 20, 50, 100, 200, 500, 1000};
 
-// What a person sees of a display that changes more often.
+// The shortest time between two displays that a person can tell apart.
 constexpr nanoseconds kShortestTurn = std::chrono::milliseconds(50);
 
 double secondsOf(LogTime time) { return std::chrono::duration<double>(time).count(); }
@@ -114,7 +114,7 @@ void LogPlayer::startTimer()
     _timer = _queue.repeatingTimer(turn, [this] { goOn(); });
 }
 
-// As many whole refresh periods as have passed at this speed since the last time.
+// Moves by the whole refresh periods that have passed at this speed since the last call.
 void LogPlayer::goOn()
 {
     const nanoseconds perPeriod = _settings.refreshPeriod / kSpeeds[_speed];

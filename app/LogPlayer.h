@@ -38,7 +38,7 @@ public:
 
     // The display at the position, as a live view's: null before the log has been read.
     NodePointer topLevelNodes();
-    // The node under that path or null.
+    // The node at that path, or null.
     NodePointer nodeAtPath(const std::string& path);
 
     [[nodiscard]] double progress() const override { return _log.progress(); }

@@ -8,7 +8,7 @@ namespace orvane
 
 OrvaneApp::~OrvaneApp()
 {
-    // Others may own the stack as well.
+    // The stack may have other owners, and must not call this object any more.
     if (_navController)
         _navController->setDelegate(nullptr);
 }
@@ -39,8 +39,8 @@ void OrvaneApp::showSaveView()
         return;
     const auto saveView =
         OrvaneSaveViewController::withSaveHistory(model()->getSaveContents(), *this);
-    // Without its interface file there would be nothing to see and no way back; the front end has
-    // told so.
+    // Without its interface file the screen would be empty and could not be left. The front end has
+    // logged the error.
     if (!saveView->view())
         return;
     saveViewController = saveView;

@@ -68,7 +68,7 @@ void OrvaneModel::refresh()
         model->_isViewUpdateQueued = false;
         if (!model->_observer)
             return;
-        // The display is generated in here, from a template that may be bad.
+        // This generates the display from a template, which may be bad.
         try {
             model->_observer->updateViewControllerFromModel();
         } catch (const std::exception& failure) {
@@ -83,8 +83,8 @@ PropertyValue OrvaneModel::getSaveContents()
                          : LogGenerator::historyOf(*_state);
 }
 
-// The tree on the screen stays until a new generator has taken a message. Where a refresh has just
-// dropped it for a view update that is still to come, this is the last chance to make it again.
+// The tree on the screen stays until a new generator has taken a message. A refresh may have
+// dropped it for a view update that has not run yet; then it must be made again now.
 void OrvaneModel::keepTreeForQueuedUpdate()
 {
     if (!_isViewUpdateQueued)
@@ -97,7 +97,8 @@ void OrvaneModel::keepTreeForQueuedUpdate()
 }
 
 // A display belongs to one generator: a new one starts with a state of its own, or its sections
-// would have nothing to write into. Only the history goes over, to a generator of the same class.
+// would have nothing to write into. Only the history is kept, and only for a generator of the same
+// class.
 void OrvaneModel::adoptGenerator(std::unique_ptr<LogGenerator> generator)
 {
     keepTreeForQueuedUpdate();

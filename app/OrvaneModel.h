@@ -32,7 +32,7 @@ public:
     virtual void modemPresenceChanged() = 0;
 };
 
-// What a model is made of. Referred to, not owned; all must outlive the model.
+// What a model uses. Nothing is owned; all must outlive the model.
 struct ModelEnvironment {
     MainQueue& queue;
     MessagePorts& ports;
@@ -58,9 +58,9 @@ public:
     OrvaneModel(const OrvaneModel&) = delete;
     OrvaneModel& operator=(const OrvaneModel&) = delete;
 
-    // The root of the display tree, made when there is none; null without a generator.
+    // The root of the display tree, made if there is none yet. Null without a generator.
     NodePointer topLevelNodes();
-    // The node under that path or null.
+    // The node at that path, or null.
     NodePointer nodeAtPath(const std::string& path);
 
     // Hands one message to the generator.
@@ -68,9 +68,9 @@ public:
     // The timer's action: checks the connection and, if data came since the last time, drops the
     // tree and has the view updated.
     void refresh();
-    // The same for whoever calls back with an argument, which is ignored.
+    // The same, with an argument that is ignored.
     void refresh(const void*) { refresh(); }
-    // The generator's save contents; without a generator what the history still holds.
+    // The generator's save contents. Without a generator, the entries that the history still holds.
     PropertyValue getSaveContents();
 
     // Returns whether both ports exist. What it made stays until destroyPorts().
@@ -102,7 +102,7 @@ private:
     ModelObserver* _observer;
     std::shared_ptr<PropertyDictionary> _state;
     std::unique_ptr<LogGenerator> _logGenerator;
-    // The class of the generator that the state's history is of.
+    // The class of the generator that made the state's history.
     std::optional<std::type_index> _historyClass;
     bool _updated = false;
     bool _isModemMissing = false;

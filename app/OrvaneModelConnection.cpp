@@ -212,7 +212,7 @@ std::optional<Bytes> OrvaneModel::messageReceived(std::int32_t messageId, ByteVi
 {
     if (messageId != kChannelMessage || !context)
         return std::nullopt;
-    // What is thrown ends this message only; the next one is decoded.
+    // An exception ends this message only. The next one is decoded.
     try {
         context->updateWithData(data);
     } catch (const std::exception& failure) {

@@ -29,7 +29,7 @@ RecordingApp::RecordingApp(Environment environment, OpenedRecording recording,
 RecordingApp::~RecordingApp()
 {
     stopLog();
-    // Others may own the stack as well.
+    // The stack may have other owners, and must not call this object any more.
     if (_navigation)
         _navigation->setDelegate(nullptr);
 }
@@ -80,7 +80,7 @@ void RecordingApp::willShowViewController(NavigationController&, ViewController&
     auto* pane = dynamic_cast<OrvanePaneController*>(&controller);
     if (!pane)
         return;
-    // Of a snapshot's log: played as long as one is inside of it.
+    // A snapshot's log is played while one of its panes is shown.
     if (_snapshot) {
         const SnapshotTree::Group* group = _snapshot->groupOf(pane->path());
         const bool isLog = group && group->log;
@@ -139,14 +139,14 @@ NodePointer RecordingApp::nodeAtPath(const std::string& path)
     return _snapshot ? _snapshot->nodeAtPath(path) : nullptr;
 }
 
-// What the player shows, where its root stands at the player's path.
+// The player's tree, with its root at the player's path.
 NodePointer RecordingApp::logNode(const std::string& path)
 {
     if (_playerPath == kRootPath)
         return path == kRootPath ? _player->topLevelNodes() : _player->nodeAtPath(path);
     if (path != _playerPath)
         return _player->nodeAtPath(path.substr(_playerPath.size()));
-    // Under the entry's own name, and a group also while there is nothing yet.
+    // Named like the entry, and a group even while it is empty.
     const NodePointer root = _player->topLevelNodes();
     const auto* children = root ? root->childNodes() : nullptr;
     return std::make_shared<OrvaneModelTreeNode>(_snapshot->nodeAtPath(path)->displayName(),

@@ -16,10 +16,10 @@
 namespace orvane
 {
 
-// The application object for a recording: shows the panes of a log that is played, or of a snapshot
-// whose entries lead to the displays as they were and whose log is played while one is inside of
-// it. The status line has the time of the recording; the screen's playback controls go with the
-// panes of a log.
+// The application object for a recording. It shows the panes of a log and plays it, or the panes of
+// a snapshot: its entries lead to the displays that were saved, and its log is played while one of
+// the log's panes is shown. The status line shows the time of the recording. Playback controls are
+// shown with the panes of a log.
 class RecordingApp final : public Shell, public NavigationControllerDelegate
 {
 public:
@@ -32,7 +32,8 @@ public:
         std::function<void(const std::string& text)> onFailure;
     };
 
-    // What is referred to must outlive the application. The recording is one without an error.
+    // Everything passed by reference must outlive the application. The recording must have no
+    // error.
     RecordingApp(Environment environment, OpenedRecording recording, RecordingSettings settings);
     ~RecordingApp() override;
 
@@ -41,7 +42,7 @@ public:
     // Takes the window off the screen.
     void applicationWillTerminate();
 
-    // The player of the log that is shown; null where none is.
+    // The player of the log that is shown, otherwise null.
     [[nodiscard]] LogPlayer* player() const { return _player.get(); }
 
     // A recording cannot be saved again.

@@ -5,7 +5,7 @@
 namespace orvane
 {
 
-// Tells the user one line about a recording, on the console and, where there is one, on the screen.
+// Shows one line about a recording on the console and, if there is one, on the screen.
 void showRecordingNotice(const std::string& line);
 
 } // namespace orvane

@@ -20,7 +20,7 @@ LogChannel::LogChannel(std::string name, std::unique_ptr<FrameListener> listener
       _events(std::move(events)), _source(std::move(source))
 {
     _listener->setConnectionCallback([this](auto connection) { accept(std::move(connection)); });
-    // A client has nothing to say here, but a connection must be read for its end to be seen.
+    // The client sends nothing here, but the connection must be read to see its end.
     _toClient->setFrameCallback([](const FrameReader::View&) {});
     _toClient->setClosedCallback([this] { end(); });
     _toClient->setDrainedCallback([this] { drained(); });
@@ -29,7 +29,7 @@ LogChannel::LogChannel(std::string name, std::unique_ptr<FrameListener> listener
 void LogChannel::accept(std::unique_ptr<FrameConnection> connection)
 {
     if (_fromClient) {
-        logError("%s has its client already; closing another connection to it", _name.c_str());
+        logError("%s already has its client; closing another connection to it", _name.c_str());
         return;
     }
     _fromClient = std::move(connection);
@@ -51,7 +51,7 @@ std::optional<Bytes> LogChannel::obey(const FrameReader::View& frame)
 {
     const PropertyListResult command = readPropertyList(frame.data);
     if (!command.value) {
-        logError("%s: a command is no property list: %s", _name.c_str(), command.error.c_str());
+        logError("%s: a command is not a property list: %s", _name.c_str(), command.error.c_str());
         return std::nullopt;
     }
     if (command.value[kGetTechnologyKey]) {
@@ -106,7 +106,8 @@ bool LogChannel::send(ByteView message)
     return !_isBehind;
 }
 
-// Half of what it takes to be behind, so that a source does not stop and go with every message.
+// Half of the limit for being behind, so that a source does not pause and resume with every
+// message.
 void LogChannel::drained()
 {
     if (_hasEnded || !_isBehind || _toClient->queuedBytes() > kBehindBytes / 2)

@@ -16,9 +16,9 @@ namespace orvane
 // One log channel of the server: the port that takes a client's commands, the connection on which
 // its log messages go out, and the source that they come from.
 //
-// The first connection to the port is the client's, others are closed. The channel ends when that
-// connection or the one to the client closes, or when the client leaves too much unread: then both
-// are closed and the port's name is free; whoever owns the channel destroys it soon after.
+// The first connection to the port is the client's. Further ones are closed. The channel ends when
+// that connection or the one to the client closes, or when the client leaves too much unread. Then
+// both are closed, the port's name is free, and the owner destroys the channel soon after.
 class LogChannel
 {
 public:
@@ -31,7 +31,7 @@ public:
         std::function<void()> ended;        // must not destroy the channel from within
     };
 
-    // `name` is that of the port on which `listener` listens.
+    // `name` is the name of the port on which `listener` listens.
     LogChannel(std::string name, std::unique_ptr<FrameListener> listener,
                std::unique_ptr<FrameConnection> toClient, std::unique_ptr<LogSource> source,
                Events events);
@@ -47,7 +47,7 @@ public:
 private:
     void accept(std::unique_ptr<FrameConnection> connection);
     void take(const FrameReader::View& frame);
-    // What answers the command, if anything.
+    // The reply to the command, if it has one.
     std::optional<Bytes> obey(const FrameReader::View& frame);
     void start(const PropertyValue& command);
     bool send(ByteView message);

@@ -22,7 +22,8 @@ using namespace std::chrono_literals;
 
 constexpr auto kNotificationDelay = 100ms;
 
-// A client's port has a usable name, which is none of the server's own: messages would go round.
+// A client's port must have a usable name, and not the name of a port of the server: messages would
+// come back to the server.
 bool isClientPort(const std::string& name)
 {
     return isUsablePortName(name) && !name.starts_with(kTelephonyServerPort);
@@ -63,7 +64,7 @@ void LogServer::accept(std::unique_ptr<FrameConnection> connection)
     FrameConnection& accepted = *(_clients[client].connection = std::move(connection));
     accepted.setFrameCallback(
         [this, client](const FrameReader::View& frame) { take(client, frame); });
-    // By value: the callback goes with its connection, and what it captured.
+    // By value: the callback and its captures are destroyed with the connection.
     accepted.setClosedCallback([this, client] { _clients.erase(ClientId(client)); });
     if (!_clientCheck)
         _clientCheck = _queue.repeatingTimer(kClientCheckInterval, [this] { checkClients(); });
@@ -105,7 +106,7 @@ Bytes LogServer::replyToRequest(ClientId client, ByteView request)
     std::string port;
     std::int32_t error = kBadRequest;
     if (!parsed.value)
-        logError("A request for a log channel is no property list: %s", parsed.error.c_str());
+        logError("A request for a log channel is not a property list: %s", parsed.error.c_str());
     else if (!clientPort || !isClientPort(*clientPort))
         logError("A request for a log channel names no port to send to");
     else
@@ -124,7 +125,7 @@ std::int32_t LogServer::openChannel(ClientId client, const std::string& clientPo
                                     std::string& port)
 {
     if (_channels.size() >= kMostChannels) {
-        logError("No log channel for %s: there are %zu already", clientPort.c_str(),
+        logError("No log channel for %s: there are already %zu", clientPort.c_str(),
                  _channels.size());
         return kNoChannel;
     }
@@ -154,7 +155,7 @@ std::int32_t LogServer::openChannel(ClientId client, const std::string& clientPo
     return 0;
 }
 
-// Afterwards, since the channel, and maybe its source, is still at work.
+// Later, because the channel or its source may still be running.
 void LogServer::channelEnded(ChannelNumber number)
 {
     _queue.async(_lifetime.whileAlive([this, number] {
@@ -166,7 +167,7 @@ void LogServer::channelEnded(ChannelNumber number)
     }));
 }
 
-// Once the first messages are on their way the client may as well show them.
+// The client need not wait for its timer to show the first messages.
 void LogServer::channelStarted(ClientId client)
 {
     _queue.after(kNotificationDelay, _lifetime.whileAlive([this, client] {
@@ -177,7 +178,8 @@ void LogServer::channelStarted(ClientId client)
 void LogServer::technologyChanged()
 {
     _channels.clear();
-    // Clients are to see the end of their channels before the notification, which makes them look.
+    // Clients must see the end of their channels before the notification, because it makes them
+    // check.
     _queue.after(kNotificationDelay,
                  _lifetime.whileAlive([this] { notifyAll(kTechnologyChangedNotification); }));
 }

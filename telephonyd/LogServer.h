@@ -23,24 +23,24 @@ class LogChannel;
 class LogServer
 {
 public:
-    // Errors of a request for a channel, beside 0.
+    // Errors of a request for a channel; 0 is success.
     static constexpr std::int32_t kBadRequest = 1;
     static constexpr std::int32_t kClientUnreachable = 2;
     static constexpr std::int32_t kNoChannel = 3; // too many, or none can be made
 
     static constexpr std::size_t kMostChannels = 100;
 
-    // Neither is owned; both must outlive the server. A source that the factory does not make is
-    // no channel.
+    // Neither is owned; both must outlive the server. There is no channel if the factory makes no
+    // source.
     LogServer(FrameTransport& transport, MainQueue& queue, LogSourceFactory makeSource);
     // stop().
     ~LogServer();
     LogServer(const LogServer&) = delete;
     LogServer& operator=(const LogServer&) = delete;
 
-    // Listens as the telephony server. Returns what is wrong where that cannot be.
+    // Listens as the telephony server. Returns what is wrong if it cannot.
     std::optional<std::string> start();
-    // Closes all channels and connections. Not to be called from within a source's call.
+    // Closes all channels and connections. Must not be called from within a source's call.
     void stop();
 
     // Closes all channels, whose clients then ask for the technology anew, and notifies all

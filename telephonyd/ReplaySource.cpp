@@ -14,7 +14,7 @@ namespace
 
 using std::chrono::nanoseconds;
 
-// What one turn of the queue takes at most, so that other channels get theirs.
+// The most that one turn of the queue sends, so that other channels get their turn.
 constexpr int kItemsATurn = 1000;
 
 } // namespace
@@ -85,7 +85,7 @@ bool ReplaySource::startOver()
     return true;
 }
 
-// Time of the recording goes on with every item, sent or not, and never back.
+// The time of the recording advances with every item, sent or not, and never goes back.
 void ReplaySource::goOnTo(std::uint64_t timestamp)
 {
     if (!_reached) {

@@ -17,15 +17,15 @@ namespace orvane
 
 struct ReplaySettings {
     std::string technology; // the constant
-    // Seconds of the recording a second; nothing = as fast as the client takes it.
+    // Seconds of the recording for each second; nullopt = as fast as the client takes it.
     std::optional<double> speed = 1.0;
     bool loops = false;
 };
 
-// Sends a recording (.dlf) again, from its start for each channel: of its items the ones that were
-// asked for, in file order, at the pace of their timestamps. An item of an earlier time than those
-// before follows at once. A jump of more than kLongestGap ahead counts as a clock that was set, and
-// takes no time either. Items without a timestamp are not sent.
+// Sends a recording (.dlf) again, from its start for each channel: the items that were asked for,
+// in file order, at the pace of their timestamps. An item with an earlier time than the one before
+// it follows at once. A jump ahead of more than kLongestGap counts as a clock that was set, and
+// takes no time. Items without a timestamp are not sent.
 //
 // Waits while the client is behind, and then makes up the time. After the end it is silent; a loop
 // starts over kLoopPause of the recording later, or at once without a speed, as long as the

@@ -31,7 +31,7 @@ std::set<std::uint32_t> codesUnder(const PropertyValue& command, const char* key
         logError("%s of a start command is of type %s; no codes are taken from it", key,
                  value.typeName());
     else if (unusable > 0)
-        logError("%s of a start command holds %zu entries that are no codes", key, unusable);
+        logError("%s of a start command holds %zu entries that are not codes", key, unusable);
     return codes;
 }
 

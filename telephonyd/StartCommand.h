@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-// What a start command asks for. Entries that are no 16-bit codes are left out, with one line a
-// list.
+// What a start command asks for. Entries that are not 16-bit codes are left out, with one log line
+// for each list.
 LogSelection selectionOfStartCommand(const PropertyValue& command);
 
 } // namespace orvane

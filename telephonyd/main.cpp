@@ -45,7 +45,7 @@ constexpr auto kCleaningInterval = std::chrono::minutes(1);
 
 void complain(const std::string& text) { printComplaint("telephonyd", text); }
 
-// Null, with a complaint, when the recording cannot be served.
+// Null, after printing why, if the recording cannot be served.
 LogSourceFactory replayFactory(const DaemonOptions& options, MainQueue& queue)
 {
     std::string reason;
@@ -208,7 +208,8 @@ int serve(const DaemonOptions& options)
         complain(*failure);
         return kFailure;
     }
-    // Begun after the server, so that a wrong line does not hide why there is none.
+    // Starts after the server, so that an error in a line does not hide why the server cannot
+    // start.
     if (messages)
         reader = std::make_unique<LineReader>(
             STDIN_FILENO, [&messages](std::string_view line, bool wasCut) {
@@ -217,7 +218,7 @@ int serve(const DaemonOptions& options)
                 else
                     messages->take(line);
             });
-    // What killed viewers leave does not wait for the next start.
+    // Removes what killed viewers leave without waiting for the next start.
     const auto removeLeftovers = [&directory] {
         removeStalePorts(*directory, StalePorts::All, std::time(nullptr));
         PrivatePortsDirectory::removeAbandoned(std::time(nullptr));
@@ -265,7 +266,7 @@ int main(int argc, char** argv)
         std::puts("telephonyd " ORVANE_VERSION);
         return 0;
     }
-    // Some generators, who are asked for their log codes, come with their templates only.
+    // Some generators, which are asked for their log codes, need their templates.
     DirectoryResources resources(resourceDirectory(ORVANE_SHARE, ORVANE_SOURCE_RESOURCES));
     Services& services = Services::current();
     const auto log = makeLog(options.log, "telephonyd");

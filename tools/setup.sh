@@ -12,7 +12,7 @@ check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-de
 
 say() { printf '%s\n' "$*" >&2; }
 
-# The command that a package is wanted for, or nothing for a library: CMake looks for those.
+# Prints the command that a package is needed for. Prints nothing for a library: CMake finds those.
 command_of() {
     case $1 in
     g++) echo c++ ;;
@@ -23,7 +23,7 @@ command_of() {
     esac
 }
 
-# What a package is, for a person on a system that names its packages otherwise.
+# Describes a package for a user whose system has other package names.
 purpose_of() {
     case $1 in
     g++) echo "a C++20 compiler: g++ 12 or newer" ;;
@@ -71,8 +71,8 @@ missing_commands() {
     done
 }
 
-# Sets as_root to what runs a command as root: nothing, a sudo that asks nothing, or one that asks
-# where somebody is there to answer. Status 1 when there is no way.
+# Sets as_root to the words that run a command as root: none, sudo without a password, or sudo that
+# asks for one if there is a terminal. Returns 1 if there is no way.
 find_root() {
     if [ "$(id -u)" = 0 ]; then
         as_root=()
@@ -91,7 +91,7 @@ tell_to_install() {
     say "Orvane needs packages that are not on this machine, and $reason."
     say "On Debian 12 or newer, as root:"
     say "  apt-get install --no-install-recommends $*"
-    say "On other systems install what these are:"
+    say "On other systems, install:"
     for package in "$@"; do
         say "$(printf '  %-18s %s' "$package" "$(purpose_of "$package")")"
     done
@@ -101,13 +101,13 @@ install_packages() {
     say "Installing: $*"
     local apt=("${as_root[@]}" env DEBIAN_FRONTEND=noninteractive
         apt-get -q -o DPkg::Lock::Timeout=300)
-    # A failed update is no reason to stop: the lists that are here may do.
-    "${apt[@]}" update </dev/null >&2 || say "apt-get update failed; going on with the lists here."
+    # Continues after a failed update, because the lists on this machine may be enough.
+    "${apt[@]}" update </dev/null >&2 || say "apt-get update failed; using the lists on this machine."
     "${apt[@]}" install -y --no-install-recommends "$@" </dev/null >&2
 }
 
-# Sees to it that the named packages are there, and installs those that are not. Where that is
-# impossible but every command is there by other means, goes on. Status 1 after a word on what to do.
+# Installs those of the named packages that are missing. If it cannot, but every command that they
+# provide exists, continues. Otherwise says what to do and returns 1.
 ensure_packages() {
     local missing as_root reason
     if command -v dpkg-query >/dev/null && command -v apt-get >/dev/null; then
@@ -120,25 +120,25 @@ ensure_packages() {
         fi
     else
         missing=("$@")
-        reason="only Debian's apt-get is known here for installing them"
+        reason="Orvane can install them with apt-get only"
     fi
     [ -n "$(missing_commands "$@")" ] || return 0
     tell_to_install "$reason" "${missing[@]}"
     return 1
 }
 
-# Says so when CMake is too old, as it is on Debian 11. Other tools are left to CMake's own checks.
+# Returns 1 with a message if CMake is too old, as on Debian 11. CMake itself checks the other tools.
 require_cmake() {
     local version oldest=3.25
     version=$(cmake --version | sed -n 's/^cmake version \([0-9.]*\).*/\1/p')
     if [ "$(printf '%s\n' "$oldest" "$version" | sort -V | head -n 1)" != "$oldest" ]; then
         say "Orvane needs CMake $oldest or newer and this one is $version."
-        say "Debian 12 has it; on an older system upgrade it first."
+        say "Debian 12 has it. On an older system, install a newer CMake first."
         return 1
     fi
 }
 
-# Configures a preset of the source tree given first, with CMake's output on standard error.
+# Configures a preset of the given source tree, with CMake's output on standard error.
 configure_preset() {
     local root=$1 preset=$2
     shift 2
@@ -149,8 +149,8 @@ configure_preset() {
         export CCACHE_SLOPPINESS=${CCACHE_SLOPPINESS:-pch_defines,time_macros}
     fi
     if ! (cd "$root" && cmake --preset "$preset" "$@") </dev/null >&2; then
-        say "Configuring failed: the lines above say what is missing. A library whose Debian package is"
-        say "one of ${build_packages[*]} may have another name here."
+        say "Configuring failed. The lines above say what is missing. These Debian packages may have other"
+        say "names on this system: ${build_packages[*]}"
         return 1
     fi
 }

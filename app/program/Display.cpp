@@ -21,7 +21,7 @@ std::string environment(const char* name)
     return value ? value : "";
 }
 
-// A path that begins with NUL is one of Linux's sockets without a file.
+// A path that begins with NUL names an abstract socket.
 bool isAnswering(const std::string& path)
 {
     sockaddr_un address{};
@@ -53,7 +53,7 @@ bool hasXDisplay()
 {
     const std::string name = environment("DISPLAY");
     if (name.empty() || name[0] != ':')
-        // On another host, or through a tunnel: taken at its word.
+        // On another host or through a tunnel. Assumed to exist.
         return !name.empty();
     const std::string path = "/tmp/.X11-unix/X" + name.substr(1, name.find('.') - 1);
     return isAnswering(path) || isAnswering(std::string(1, '\0') + path);

@@ -3,8 +3,8 @@
 namespace orvane
 {
 
-// Whether a display answers: the one that the environment names (WAYLAND_DISPLAY, DISPLAY), or what
-// QT_QPA_PLATFORM asks for instead.
+// Whether a display accepts connections: the one named by WAYLAND_DISPLAY or DISPLAY, or the
+// platform that QT_QPA_PLATFORM names instead.
 bool hasDisplay();
 
 } // namespace orvane

@@ -34,7 +34,7 @@ void endOnSignals()
         sigaction(signal, &action, nullptr);
 }
 
-// Standard output, written to in large pieces.
+// Writes to standard output in large pieces.
 class Output
 {
 public:
@@ -50,7 +50,7 @@ public:
         _pending.clear();
         return state == OutputDescriptor::State::Open;
     }
-    // Returns the exit status; tells what is wrong.
+    // Returns the exit status. Prints what is wrong.
     [[nodiscard]] int end()
     {
         flush();

@@ -10,13 +10,13 @@ namespace orvane
 
 class QtEventLoop;
 
-// A way to show the application to a person or a script, and to take what they do.
+// Shows the application to a user or a script, and takes their input.
 class FrontEnd
 {
 public:
     virtual ~FrontEnd() = default;
-    // Makes the live view that this front end shows: one with panes unless overridden. What is
-    // passed is referred to and must outlive it.
+    // Makes the live view that this front end shows: one with panes unless overridden. Everything
+    // passed must outlive it.
     [[nodiscard]] virtual std::unique_ptr<LiveApp>
     makeApp(ModelEnvironment environment, const FileSystem& files, PreferencesStore& preferences)
     {
@@ -26,12 +26,12 @@ public:
     virtual void begin(LiveApp&) {}
     // The event loop has ended: gives the screen back, before the application's last work.
     virtual void end() {}
-    // What the program ends with; what is wrong has been told then.
+    // The exit status of the program, after printing what is wrong.
     [[nodiscard]] virtual int exitStatus() { return 0; }
 };
 
-// Everything is referred to and must outlive the front end. Throws std::runtime_error with a line
-// for the user where it cannot work here.
+// Everything passed must outlive the front end. Throws std::runtime_error with a line for the user
+// if it cannot work here.
 std::unique_ptr<FrontEnd> makeOutputFrontEnd(FrontEndKind kind, const AppOptions& options,
                                              QtEventLoop& loop);
 
@@ -39,7 +39,7 @@ std::unique_ptr<FrontEnd> makeOutputFrontEnd(FrontEndKind kind, const AppOptions
 inline constexpr int kFailure = 1;
 inline constexpr int kUnusableArguments = 2;
 
-// Prints one line on standard error as this program's.
+// Prints one line on standard error, with the program's name before it.
 void complain(const std::string& text);
 
 } // namespace orvane

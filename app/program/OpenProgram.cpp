@@ -32,7 +32,7 @@ RecordingSettings settingsOf(const AppOptions& options)
     return {options.file, options.technology, options.refreshInterval};
 }
 
-// Commands of a front end that prints: there is nothing to save.
+// Takes a command of a front end that prints. There is nothing to save.
 void takeLine(std::string_view line, Printer& output, QtEventLoop& loop)
 {
     if (line.ends_with('\r'))
@@ -93,7 +93,7 @@ int browseRecording(const AppOptions& options, std::unique_ptr<FrontEnd> frontEn
     loop.run();
     app.applicationWillTerminate();
     const int status = frontEnd->exitStatus();
-    // A terminal's screen must go before anything is told.
+    // The terminal's screen must be gone before anything is printed.
     frontEnd.reset();
     if (failure)
         complain(*failure);

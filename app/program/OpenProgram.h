@@ -11,7 +11,7 @@ namespace orvane
 // status. The options are those of a recording.
 int printRecording(const AppOptions& options, FrontEndKind kind, QtEventLoop& loop);
 
-// The same in the front ends that a person browses in, until they leave.
+// The same in the window and the terminal, until the user leaves.
 int browseRecording(const AppOptions& options, std::unique_ptr<FrontEnd> frontEnd,
                     QtEventLoop& loop);
 

@@ -11,19 +11,19 @@ namespace orvane
 
 class QtEventLoop;
 
-// What a program ends with that has written to this output; tells what is wrong.
+// The exit status of a program that has written to this output. Prints what is wrong.
 int exitStatusOf(const OutputDescriptor& output);
 
-// Standard output, printed on as text or JSON, waiting while its reader is behind. Where nobody
-// reads any more, or nothing can be written, the loop ends.
+// Prints text or JSON on standard output and waits while the reader is behind. Ends the loop when
+// nobody reads any more or nothing can be written.
 class PrintedOutput
 {
 public:
-    // The loop is referred to and must outlive it.
+    // The loop must outlive it.
     PrintedOutput(FrontEndKind kind, const AppOptions& options, QtEventLoop& loop);
 
     [[nodiscard]] Printer& printer() { return *_printer; }
-    // What the program ends with; tells what is wrong.
+    // The exit status of the program. Prints what is wrong.
     [[nodiscard]] int exitStatus() const { return exitStatusOf(_output); }
 
 private:

@@ -11,11 +11,11 @@ namespace orvane
 
 class SystemLog;
 
-// The process-wide services of the program, for as long as it lives.
+// Sets the process-wide services of the program while the object exists.
 class ProgramServices
 {
 public:
-    // The log may be null. Lines for a person at the console go to that stream.
+    // The log may be null. `console` takes the lines for the user at the console.
     ProgramServices(SystemLog* log, std::FILE* console);
     ~ProgramServices();
     // One line that says that the resources are missing, and where they were looked for.

@@ -8,8 +8,8 @@
 namespace orvane
 {
 
-// The simulated phone's telephony server, on a thread of its own: it meets the viewer at the ports
-// only. Ends with the object.
+// The simulated phone's telephony server, on a thread of its own. It shares only the ports with the
+// viewer, and ends with the object.
 class SimulatedPhone
 {
 public:

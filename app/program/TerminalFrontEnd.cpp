@@ -22,7 +22,7 @@ using namespace std::chrono_literals;
 
 constexpr auto kReturnInterval = 200ms;
 
-// Tells the terminal's screen what the event loop hears.
+// Passes events of the loop on to the terminal's screen.
 class TerminalFrontEnd final : public FrontEnd
 {
 public:
@@ -53,8 +53,8 @@ private:
         followJob();
     }
 
-    // In the background what is typed is for others. Coming from there to the foreground is no
-    // signal if the process was running.
+    // In the background, typed keys belong to other programs. A process that was running gets no
+    // signal when it comes to the foreground.
     void followJob()
     {
         const bool isInFront = _device.hasTerminal();

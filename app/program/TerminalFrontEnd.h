@@ -7,8 +7,8 @@
 namespace orvane
 {
 
-// The screen of the terminal at standard input and output. The loop is referred to and must outlive
-// it. Throws std::runtime_error with a line for the user where there is no such terminal.
+// The screen in the terminal of standard input and output. The loop must outlive it. Throws
+// std::runtime_error with a line for the user if there is no such terminal.
 std::unique_ptr<FrontEnd> makeTerminalFrontEnd(const AppOptions& options, QtEventLoop& loop);
 
 } // namespace orvane

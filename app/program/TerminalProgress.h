@@ -8,8 +8,8 @@
 namespace orvane
 {
 
-// A progress line on standard error, where that is a terminal that standard output does not write
-// on as well; null else.
+// A progress line on standard error. Null unless standard error is a terminal and standard output
+// is not the same one.
 std::unique_ptr<ProgressLine> progressOnTerminal(const std::string& task);
 
 } // namespace orvane

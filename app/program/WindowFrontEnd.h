@@ -7,8 +7,8 @@
 namespace orvane
 {
 
-// Shows the panes in a window, which takes what a person does. Needs a QtWindowApplication; the
-// loop is referred to and must outlive the front end.
+// Shows the panes in a window and takes the user's input. Needs a QtWindowApplication. The loop
+// must outlive the front end.
 std::unique_ptr<FrontEnd> makeWindowFrontEnd(const AppOptions& options, QtEventLoop& loop);
 
 } // namespace orvane

@@ -7,7 +7,7 @@
 namespace orvane
 {
 
-// Messages of procedures that take their time, kept until they fall due.
+// Messages of procedures that take time, kept until they are due.
 class Agenda
 {
 public:
@@ -16,8 +16,8 @@ public:
         _messages.emplace(at, std::move(message));
     }
     void clear() { _messages.clear(); }
-    // Moves what is due at `now` to the end of the messages, by time; of one time in the order in
-    // which it was added.
+    // Moves the messages that are due at `now` to the end of `messages`, ordered by time and then
+    // by when they were added.
     void takeDue(std::chrono::milliseconds now, std::vector<PhoneMessage>& messages)
     {
         const auto end = _messages.upper_bound(now);

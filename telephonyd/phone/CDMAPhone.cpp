@@ -81,7 +81,7 @@ void CDMAPhone::advance(milliseconds now, std::uint8_t colourCode)
 void CDMAPhone::endCall(milliseconds now)
 {
     _outOfCallSince = now;
-    // What the call cut off begins again when EV-DO is back.
+    // A negotiation that the call interrupted starts again when EV-DO is back.
     if (_session != EvdoSession::Open)
         _subnetSince = now + kEvdoSearchTakes;
 }

@@ -7,7 +7,7 @@
 namespace orvane
 {
 
-// A pilot as it is received, in dB.
+// A pilot and its strength as received, in dB.
 struct CDMAPilot {
     std::uint16_t pilotOffset;
     double strength;

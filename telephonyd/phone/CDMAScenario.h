@@ -10,7 +10,7 @@ namespace orvane
 {
 
 // A phone on CDMA 1x and EV-DO that is driven through a town. It makes calls on 1x, moves data over
-// EV-DO in between, and in a connection hears several cells at a time.
+// EV-DO between calls, and receives several cells at a time while connected.
 class CDMAScenario final : public DrivenScenario
 {
 public:

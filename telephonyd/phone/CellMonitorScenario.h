@@ -7,8 +7,8 @@
 namespace orvane
 {
 
-// A phone on GSM that is driven through a town, as its telephony server lists the cells itself:
-// once a second, and when something has changed, a property list of dictionaries, arrays and texts.
+// A phone on GSM that is driven through a town. Its telephony server lists the cells itself, once a
+// second and whenever something changes, as a property list of dictionaries, arrays and texts.
 class CellMonitorScenario final : public DrivenScenario
 {
 public:

@@ -19,7 +19,7 @@ constexpr double kMetresPerSecond = 13;
 constexpr double kDecibelsPerDecade = 36;
 constexpr double kNearestMetres = 40; // nobody drives up the mast
 
-// A cell comes into hearing at the one level and goes out of it at the other, in dBm.
+// A cell is heard from the first level on, and until it falls below the second, in dBm.
 constexpr double kHeardFrom = -114;
 constexpr double kHeardTo = -117;
 

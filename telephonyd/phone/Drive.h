@@ -24,8 +24,8 @@ struct RoadPoint {
     double northMetres;
 };
 
-// A phone carried along a road round and round: how well it hears each cell, and which one it is
-// on. Everything follows from the cells, the road, the seed and the steps taken.
+// A phone that is driven along a circular road: how well it receives each cell, and which cell
+// serves it. All of it follows from the cells, the road, the seed and the number of steps.
 class Drive
 {
 public:
@@ -34,11 +34,11 @@ public:
     static constexpr double kWeakest = -120;
     static constexpr double kStrongest = -75;
 
-    // The cells and the road must outlive it, and there must be at least one and two of them.
+    // The cells and the road must outlive it. There must be at least one cell and two road points.
     Drive(std::span<const DriveCell> cells, std::span<const RoadPoint> road, std::uint64_t seed);
 
-    // Drives on for kStep. A busy phone (in a call or moving data) changes cells sooner. Returns
-    // whether it has changed to another.
+    // Drives for kStep. A busy phone (in a call or moving data) changes cells sooner. Returns
+    // whether it changed to another cell.
     bool step(bool isBusy);
 
     [[nodiscard]] std::size_t serving() const { return _serving; }
@@ -51,7 +51,8 @@ public:
     [[nodiscard]] std::vector<std::size_t> neighboursOn(std::uint32_t channel) const;
 
 private:
-    // A swing around the level that distance gives: hills, houses, lorries.
+    // A variation of the level around the one that distance gives, as from hills, houses and
+    // lorries.
     struct Fading {
         double decibels;
         double secondsPerCycle;

@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-// What the scenarios share: a phone that is driven through a town and lives on in steps of
-// Drive::kStep. A scenario says which messages fall due.
+// What all scenarios share: a phone that is driven through a town and advances in steps of
+// Drive::kStep. A scenario adds the messages that are due.
 class DrivenScenario : public Scenario
 {
 public:
@@ -21,9 +21,9 @@ protected:
     {
     }
 
-    // Adds one message of everything; the time is 0.
+    // Adds one message of each kind. The time is 0.
     virtual void first() = 0;
-    // Adds what falls due at now(), one step after the last.
+    // Adds the messages that are due at now(), one step after the last call.
     virtual void next() = 0;
 
     void add(PhoneMessage message) { _messages.push_back(std::move(message)); }

@@ -6,7 +6,7 @@
 namespace orvane
 {
 
-// An array of what the function makes of each site of a town.
+// Calls the function for each site of a town and returns an array of its results.
 template <typename Site, std::size_t count, typename Function>
 constexpr auto ofEach(const Site (&sites)[count], Function function)
 {

@@ -18,8 +18,8 @@ public:
 
     explicit EvdoForwardTraffic(std::uint64_t seed) : _random(seed) {}
 
-    // Goes on for Drive::kStep with the sector's carrier over its interference in dB. The phone
-    // gets that share of the sector's time.
+    // Advances by Drive::kStep. `carrierToInterference` is in dB; the phone gets `share` of the
+    // sector's time.
     void step(double carrierToInterference, double share);
     [[nodiscard]] const std::array<std::uint32_t, kCounters>& counters() const { return _counters; }
 
@@ -30,7 +30,7 @@ private:
 };
 
 // The data packets that a phone has sent over EV-DO. They go out in turn on three interlaces, each
-// in up to four parts: as soon as the sector has understood it the rest is saved.
+// in up to four parts: the remaining parts are not sent once the sector has understood the packet.
 class EvdoReverseTraffic
 {
 public:
@@ -43,7 +43,7 @@ public:
 
     explicit EvdoReverseTraffic(std::uint64_t seed) : _random(seed) {}
 
-    // Goes on for Drive::kStep with that much transmit power to spare, in dB.
+    // Advances by Drive::kStep. `headroom` is the transmit power to spare, in dB.
     void step(double headroom);
     [[nodiscard]] const Counters& counters(std::size_t interlace, std::size_t mode,
                                            std::size_t size) const

@@ -19,7 +19,7 @@ std::uint32_t count(std::size_t records) { return static_cast<std::uint32_t>(rec
 // Powers are reported without their sign.
 std::uint32_t magnitude(double power) { return rawValue(-power, 0, 1, 8); }
 
-// How far above the least power it is: negative ones wrap.
+// The power above the least one at which a cell may be used. Negative values wrap.
 std::uint32_t pathLossCriterion(double power)
 {
     return static_cast<std::uint32_t>(std::lround(power - kLeastPower));

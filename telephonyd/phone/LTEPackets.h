@@ -32,7 +32,7 @@ struct LTELevels {
 int leastPower(const LTECell& cell);
 int selectionLevel(const LTECell& cell, double averagePower);
 
-// A cell of any technology that the phone thinks of changing to.
+// A cell of any technology that is a candidate for reselection.
 struct LTEReselectionCandidate {
     std::uint16_t priority;
     std::uint16_t technology; // 0 LTE, 1 UTRAN, 2 GERAN, 3 CDMA 1x, 4 CDMA HRPD
@@ -45,8 +45,8 @@ LTEReselectionCandidate otherCandidate(unsigned turn);
 PhoneMessage lteServingCell(const LTECell& cell);
 PhoneMessage lteMasterInformation(const LTECell& cell, std::uint16_t systemFrame);
 PhoneMessage lteServingMeasurement(const LTELevels& serving, bool rulesUpdated);
-// In a connection: of what the phone hears on the serving channel the strongest are measured, the
-// rest detected only.
+// While connected: the strongest cells on the serving channel are measured, the others only
+// detected.
 PhoneMessage lteConnectedMeasurement(const LTELevels& serving, std::span<const LTELevels> others,
                                      std::uint16_t subframe);
 // At rest: the cells, at least 1 and at most 32, that are heard on a channel.

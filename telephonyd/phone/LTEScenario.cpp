@@ -32,8 +32,7 @@ constexpr double kWorstQuality = -17;
 
 double milliwatts(double decibelMilliwatts) { return std::pow(10, decibelMilliwatts / 10); }
 
-// How much of a channel is in use besides its pilots: a share that swells and ebbs with the
-// traffic.
+// The share of a channel that is in use besides its pilots. It rises and falls with the traffic.
 double shareInUse(std::uint16_t earfcn, milliseconds now)
 {
     constexpr double kMean = 0.45;

@@ -8,8 +8,8 @@
 namespace orvane
 {
 
-// A phone on LTE that is driven through a town. It goes from cell to cell, is now idle and now in a
-// connection, and has a data connection that comes up and goes.
+// A phone on LTE that is driven through a town. It changes cells, is idle and connected by turns,
+// and has a data connection that comes and goes.
 class LTEScenario final : public DrivenScenario
 {
 public:

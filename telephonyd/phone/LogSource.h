@@ -19,14 +19,14 @@ struct LogSelection {
     std::set<std::uint32_t> extraCodes;
 };
 
-// Where the messages of one log channel come from: a simulated phone or a recording. Made anew for
-// each channel, in the thread of the server's queue.
+// The source of the messages of one log channel: a simulated phone, a recording or a modem. Each
+// channel gets a new one, in the thread of the server's queue.
 class LogSource
 {
 public:
-    // Takes one log message as it goes over the wire and returns whether more is wanted right now:
-    // false means that the client is behind. A source that can wait then does until resume(); one
-    // that cannot (a live phone) goes on and leaves it to the channel to end.
+    // Takes one log message in its wire format. Returns whether the client can take more now. If
+    // not, a source that can wait stops until resume(). One that cannot, such as a live phone,
+    // continues, and the channel ends if too much is unread.
     using Send = std::function<bool(ByteView message)>;
 
     virtual ~LogSource() = default;

@@ -15,7 +15,7 @@ std::uint32_t number(Enumeration value)
     return static_cast<std::uint32_t>(value);
 }
 
-// How far the place is known to the network.
+// Whether the network knows the location.
 std::uint32_t updateStatus(bool isUpdated) { return isUpdated ? 0 : 1; }
 
 } // namespace
@@ -56,9 +56,9 @@ PhoneMessage systemInformation(const UMTSTownCell& cell, ServiceType service)
     return modemItem(kSystemInformationCode, writer);
 }
 
-// Each network takes three bytes but is read from six, country digits and network digits by turns:
-// the next one's bytes are also the rest of this one's. Such digits were chosen that 001 100, 001
-// 102 and the like come out.
+// Each network takes three bytes but is read from six, with country digits and network digits by
+// turns, so that the bytes of the next network are also the rest of this one. The digits are chosen
+// so that 001 100, 001 102 and the like are read.
 PhoneMessage equivalentNetworks(std::uint16_t locationArea)
 {
     PacketWriter writer;

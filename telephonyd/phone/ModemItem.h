@@ -6,7 +6,7 @@
 namespace orvane
 {
 
-// What the writer has put together, as the payload of a log item of the modem.
+// A log item of the modem with the writer's bytes as its payload.
 inline PhoneMessage modemItem(std::uint16_t code, PacketWriter& writer)
 {
     return {PhoneMessage::Kind::Modem, code, writer.take()};

@@ -51,7 +51,8 @@ PacketWriter radioBody(const CDMARadio& radio)
     return body;
 }
 
-// Energies are those of the searcher: they scale with how long it adds up and hold the noise too.
+// Energies are those of the searcher. They scale with the time over which it adds up, and include
+// the noise.
 PacketWriter activeSetBody(std::span<const CDMAPilot> pilots, std::uint16_t referencePilot)
 {
     constexpr std::uint32_t kChips = 64;

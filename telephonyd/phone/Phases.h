@@ -7,7 +7,7 @@
 namespace orvane
 {
 
-// Something that is on for a while and off for a while, by turns of random length.
+// A state that is on and off by turns, for random times.
 class Phases
 {
 public:
@@ -16,7 +16,7 @@ public:
         double mostSeconds;
     };
 
-    // Begins on or off with a phase of at most that kind's length.
+    // Begins on or off, with a first phase of a random length like all others.
     Phases(Range on, Range off, bool beginsOn, std::uint64_t seed)
         : _on(on), _off(off), _isOn(beginsOn), _random(seed)
     {
@@ -24,7 +24,7 @@ public:
     }
 
     [[nodiscard]] bool isOn() const { return _isOn; }
-    // Goes on to `now`, which never goes back. Returns whether it went on or off on the way.
+    // Advances to `now`, which never goes back. Returns whether the state changed on the way.
     bool advance(std::chrono::milliseconds now)
     {
         const bool before = _isOn;

@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-// Random numbers of the simulated phone: the same for a seed with every compiler, which the
-// library's distributions do not promise.
+// Random numbers of the simulated phone. A seed gives the same numbers with every compiler, which
+// the distributions of the standard library do not guarantee.
 class PhoneRandom
 {
 public:

@@ -8,22 +8,22 @@
 namespace orvane
 {
 
-// The cells that a phone on CDMA receives at the same time: its active set, the first to come in
-// first. Idle it is the serving cell alone; in a connection others come in when their pilot is
-// strong, and go out when it has been weak for a while.
+// The active set: the cells that a phone on CDMA receives at the same time, in the order in which
+// they were added. An idle phone has the serving cell alone. While it is connected, other cells are
+// added when their pilot is strong and removed when it has been weak for a while.
 class PilotSet
 {
 public:
     using Strength = double (CDMAAir::*)(std::size_t cell) const;
     static constexpr std::size_t kMostCells = 6;
 
-    // Strengths in dB at which cells come in and below which they go out.
+    // Pilot strengths in dB: cells are added from `comesInAt` on, and removed below `goesOutBelow`.
     PilotSet(Strength strength, double comesInAt, double goesOutBelow)
         : _strength(strength), _comesInAt(comesInAt), _goesOutBelow(goesOutBelow)
     {
     }
 
-    // Goes on for Drive::kStep. Returns whether cells came or went.
+    // Advances by Drive::kStep. Returns whether cells were added or removed.
     bool step(const CDMAAir& air, std::size_t serving, bool isConnected);
     [[nodiscard]] const std::vector<std::size_t>& cells() const { return _cells; }
 

@@ -18,7 +18,8 @@ enum class RadioState : std::uint8_t {
     UraPch = 5,   // connected but asleep; the network knows the registration area
 };
 
-// A connection that is made, used, let go to sleep or not, and released, again and again.
+// A connection that is made, used and released again and again. Some connections sleep before they
+// are released.
 class RadioConnection
 {
 public:
@@ -28,11 +29,13 @@ public:
     [[nodiscard]] RadioState state() const;
     // How often a connection has got channels of its own.
     [[nodiscard]] unsigned transfers() const { return _transfers; }
-    // Goes on to `now`, which never goes back, by one state at most. Returns whether it did.
+    // Advances to `now`, which never goes back, by at most one state. Returns whether the state
+    // changed.
     bool advance(std::chrono::milliseconds now);
-    // An idle connection is wanted now: the next advance() makes it.
+    // Asks for a connection: the next advance() begins one if there is none.
     void connect(std::chrono::milliseconds now);
-    // Becomes idle (the phone has left the network or been sent away) and stays so for a while.
+    // Becomes idle, because the phone left the network or was sent away, and stays idle for a
+    // while.
     void release(std::chrono::milliseconds now);
 
 private:

@@ -22,16 +22,16 @@ struct PhoneMessage {
     Bytes payload;
 };
 
-// A simulated phone of one radio technology. What it does depends on its seed and on the times at
-// which it is asked alone.
+// A simulated phone of one radio technology. Its messages depend only on its seed and on the times
+// at which step() is called.
 class Scenario
 {
 public:
     virtual ~Scenario() = default;
     // The technology constant.
     [[nodiscard]] virtual std::string technology() const = 0;
-    // Lets the phone live on to `now`, counted from its start, and returns what fell due on the
-    // way. The first call, which returns one item of everything, is at 0; time never goes back.
+    // Advances the phone to `now`, counted from its start, and returns the messages that became
+    // due. The first call is at 0 and returns one message of each kind. Time never goes back.
     virtual std::vector<PhoneMessage> step(std::chrono::milliseconds now) = 0;
 };
 

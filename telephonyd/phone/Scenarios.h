@@ -17,8 +17,8 @@ std::vector<std::string> scenarioNames();
 // Null when there is none of that name.
 std::unique_ptr<Scenario> makeScenario(std::string_view name, std::uint64_t seed);
 
-// Gives each log channel a phone of its own, all alike. The queue must outlive the sources. Where
-// there is no scenario of that name it makes none.
+// Gives each log channel a phone of its own, all with the same seed. The queue must outlive the
+// sources. Makes no source if there is no scenario of that name.
 LogSourceFactory phoneSourceFactory(std::string scenario, MainQueue& queue);
 
 } // namespace orvane

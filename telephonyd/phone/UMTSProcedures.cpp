@@ -17,8 +17,8 @@ constexpr milliseconds kRoutingUpdateTakes{1200};
 
 } // namespace
 
-// Both areas, one after the other, when the phone is in another location area; the routing area
-// alone when only that is another; nothing during a connection.
+// Registers in both areas, one after the other, where the location area is new, and in the routing
+// area alone where only that one is new. Does nothing during a connection.
 void UMTSScenario::registerWherePhoneIs()
 {
     const UMTSTownCell& cell = serving();
@@ -103,7 +103,7 @@ void UMTSScenario::changeCell(bool wasUmts)
 {
     const bool isUmts = serving().isUmts;
     if (isUmts != wasUmts) {
-        // What was under way in the other network is not finished in it.
+        // Procedures that began in the other network are not finished.
         _agenda.clear();
         _use = Use::None;
         _registeredAt = now();
@@ -142,7 +142,8 @@ void UMTSScenario::enterGSM()
     add(gsmRadioState(GSMRadioState::Idle, false));
 }
 
-// The cell's own data at once, what it tells about packet service as its system information comes.
+// The cell's own data come at once. Its packet service is reported later, as system information
+// arrives.
 void UMTSScenario::addGSMCell()
 {
     add(gsmServingCell(serving()));
@@ -155,8 +156,8 @@ void UMTSScenario::addGSMCell()
         _agenda.add(at += milliseconds(200), std::move(each));
 }
 
-// A connection on channels of its own is a call or a data transfer by turns, unless it was made to
-// register: then data go over it.
+// A connection on channels of its own is a call or a data transfer by turns. One that was made for
+// registration carries data.
 void UMTSScenario::changeUMTSConnection()
 {
     const RadioState state = _umts.state();

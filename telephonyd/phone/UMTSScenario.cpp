@@ -44,7 +44,7 @@ UMTSScenario::UMTSScenario(std::uint64_t seed)
 {
 }
 
-// Switched on, the phone has listened to both networks and known nothing of either before.
+// The phone was just switched on and has listened to both networks.
 void UMTSScenario::first()
 {
     const UMTSTownCell& umts = kUMTSTown[bestOf(true)];
@@ -105,9 +105,9 @@ void UMTSScenario::next()
 
 const UMTSTownCell& UMTSScenario::serving() const { return kUMTSTown[_drive.serving()]; }
 
-// The ranking and the server's list of cells both tell the UMTS neighbours, the list and the GSM
-// measurement both the GSM ones. What comes last stays visible: the GSM measurement in GSM; in UMTS
-// the ranking while there is one, which a connection on channels of its own does without.
+// The ranking and the server's list of cells both report the UMTS neighbours. The list and the GSM
+// measurement both report the GSM ones. The last report stays visible, so the GSM measurement comes
+// last in GSM, and the ranking in UMTS. A connection on channels of its own has no ranking.
 void UMTSScenario::addMeasurements()
 {
     if (!serving().isUmts) {

@@ -20,7 +20,7 @@ struct UMTSTownCell {
 constexpr std::size_t kUMTSTownCells = 14;
 
 // A small town with GSM in the west and UMTS in the east, where the cells stand (same order), and a
-// road that leads from the one into the other and back.
+// road from one into the other and back.
 extern const std::array<UMTSTownCell, kUMTSTownCells> kUMTSTown;
 extern const std::array<DriveCell, kUMTSTownCells> kUMTSTownMasts;
 extern const std::array<RoadPoint, 6> kUMTSTownRoad;

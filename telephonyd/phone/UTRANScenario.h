@@ -8,9 +8,9 @@
 namespace orvane
 {
 
-// A phone on UTRAN that is driven through a town. It goes from cell to cell, registers where the
-// location area changes, is now idle and now in a connection of one state or another, and has a
-// data connection that comes up and goes.
+// A phone on UTRAN that is driven through a town. It changes cells, registers where the location
+// area changes, is idle or connected in various states, and has a data connection that comes and
+// goes.
 class UTRANScenario final : public DrivenScenario
 {
 public:

@@ -2,7 +2,7 @@
 # tools/check-format names the files that clang-format would change, and --fix changes them.
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 if ! clang-format --version 2>/dev/null | grep -q 'version 14\.'; then
-    echo "clang-format 14 is not here"
+    echo "clang-format 14 is not installed"
     exit 77
 fi
 cd "$scratch" || exit 1
@@ -15,8 +15,8 @@ put build/Bad.cpp <<<'int  bad( ){return 1;}'
 case_named "files that differ are named, others not"
 output=$("$tree/tools/check-format" . 2>&1) && status=0 || status=$?
 expect_equal "$status" 1
-expect_contains "$output" "app/Bad.cpp:1: differs"
-expect_contains "$output" "ui/Bad.h:2: differs"
+expect_contains "$output" "app/Bad.cpp:1: not formatted"
+expect_contains "$output" "ui/Bad.h:2: not formatted"
 expect_lacks "$output" "Good"
 expect_lacks "$output" "build/"
 expect_equal "$(cat app/Bad.cpp)" 'int  bad( ){return 1;}'
@@ -32,7 +32,7 @@ END
 output=$(PATH=$scratch/dying:$PATH "$tree/tools/check-format" . 2>/dev/null) && status=0 || status=$?
 expect_equal "$status" 1
 expect_contains "$output" "app/Good.cpp: clang-format-14 crashes on it"
-expect_contains "$output" "app/Bad.cpp:1: differs"
+expect_contains "$output" "app/Bad.cpp:1: not formatted"
 
 case_named "--fix changes them"
 "$tree/tools/check-format" --fix .

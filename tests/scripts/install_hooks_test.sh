@@ -2,11 +2,11 @@
 # tools/install-hooks installs a hook that refuses commits of badly formatted or forbidden sources.
 source "$(dirname -- "${BASH_SOURCE[0]}")/harness.sh"
 if ! clang-format --version 2>/dev/null | grep -q 'version 14\.'; then
-    echo "clang-format 14 is not here"
+    echo "clang-format 14 is not installed"
     exit 77
 fi
 if ! command -v git >/dev/null; then
-    echo "git is not here"
+    echo "git is not installed"
     exit 77
 fi
 # Not the repository and the settings of the user who runs the tests.
@@ -45,7 +45,7 @@ put app/Bad.cpp <<<'int  bad( ){return 1;}'
 git add -A
 commit "Add a bad file"
 expect_equal "$status|$(commits)" "1|1"
-expect_contains "$output" "app/Bad.cpp:1: differs"
+expect_contains "$output" "app/Bad.cpp:1: not formatted"
 expect_contains "$output" "Nothing was committed."
 
 case_named "the index counts, not the work tree"

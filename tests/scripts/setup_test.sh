@@ -121,7 +121,7 @@ machine 0
 rm "$bin/dpkg-query" "$bin/apt-get"
 ensure g++ cmake libexpat1-dev
 expect_equal "$status" 1
-expect_contains "$errors" "only Debian's apt-get is known here"
+expect_contains "$errors" "Orvane can install them with apt-get only"
 expect_contains "$errors" "cmake              CMake 3.25 or newer"
 expect_contains "$errors" "libexpat1-dev      Expat with its headers"
 

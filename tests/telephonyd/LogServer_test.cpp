@@ -85,17 +85,17 @@ TEST_F(LogServerTest, AnUnusableRequestIsAnsweredWithAnErrorAndLogged)
         std::int32_t error;
         const char* line;
     } cases[] = {
-        {bytesOf("garbage"),                    LogServer::kBadRequest,        "no property list"},
-        {{},                                    LogServer::kBadRequest,        "no property list"},
-        {xmlOf(PropertyValue::newDictionary()), LogServer::kBadRequest,        "names no port"   },
-        {xmlOf("client"),                       LogServer::kBadRequest,        "names no port"   },
-        {naming(PropertyValue::integer(1)),     LogServer::kBadRequest,        "names no port"   },
-        {naming(""),                            LogServer::kBadRequest,        "names no port"   },
-        {naming("../client"),                   LogServer::kBadRequest,        "names no port"   },
-        {naming("TelephonyServer"),             LogServer::kBadRequest,        "names no port"   },
-        {naming("TelephonyServer.Channel.1"),   LogServer::kBadRequest,        "names no port"   },
+        {bytesOf("garbage"),                    LogServer::kBadRequest,        "not a property list"},
+        {{},                                    LogServer::kBadRequest,        "not a property list"},
+        {xmlOf(PropertyValue::newDictionary()), LogServer::kBadRequest,        "names no port"      },
+        {xmlOf("client"),                       LogServer::kBadRequest,        "names no port"      },
+        {naming(PropertyValue::integer(1)),     LogServer::kBadRequest,        "names no port"      },
+        {naming(""),                            LogServer::kBadRequest,        "names no port"      },
+        {naming("../client"),                   LogServer::kBadRequest,        "names no port"      },
+        {naming("TelephonyServer"),             LogServer::kBadRequest,        "names no port"      },
+        {naming("TelephonyServer.Channel.1"),   LogServer::kBadRequest,        "names no port"      },
         {naming("nobody"),                      LogServer::kClientUnreachable,
-         "No log channel for nobody: nothing accepts"                                            },
+         "No log channel for nobody: nothing accepts"                                               },
     };
     for (const auto& each : cases) {
         services.log.lines.clear();
@@ -213,12 +213,12 @@ TEST_F(LogServerTest, AnUnusableCommandIsLoggedAndAnsweredWithoutData)
         Bytes data;
         const char* line;
     } cases[] = {
-        {bytesOf("garbage"),                                                            "is no property list"},
-        {xmlOf(PropertyValue::newArray()),                                              "unknown command"    },
-        {xmlOf(PropertyValue::newDictionary()),                                         "unknown command"    },
-        {xmlOf(PropertyValue::dictionaryOf({{"SetState", "Stopped"}})),                 "unknown command"    },
+        {bytesOf("garbage"),                                                            "is not a property list"},
+        {xmlOf(PropertyValue::newArray()),                                              "unknown command"       },
+        {xmlOf(PropertyValue::newDictionary()),                                         "unknown command"       },
+        {xmlOf(PropertyValue::dictionaryOf({{"SetState", "Stopped"}})),                 "unknown command"       },
         {xmlOf(PropertyValue::dictionaryOf({{"SetState", PropertyValue::integer(1)}})),
-         "unknown command"                                                                                   },
+         "unknown command"                                                                                      },
     };
     const auto client = connectedClient("client");
     for (const auto& each : cases) {

@@ -41,7 +41,7 @@ TEST(StartCommandTest, WhatIsNoCodeIsLeftOutWithOneLineAList)
     EXPECT_THAT(selection.extraCodes, IsEmpty());
     EXPECT_THAT(
         services.log.errors(),
-        ElementsAre("SetVarnelLogCodes of a start command holds 5 entries that are no codes",
+        ElementsAre("SetVarnelLogCodes of a start command holds 5 entries that are not codes",
                     "SetTsExtraCodes of a start command is of type number; no codes are taken "
                     "from it"));
 }
