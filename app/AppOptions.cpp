@@ -20,11 +20,11 @@ With text and json, lines on standard input are commands: "save DESCRIPTION" sav
 saving is offered, "quit" ends the program.)";
 
 constexpr std::string_view kExportAbout = R"(
-Writes rows of a recording to standard output, one line a refresh period.
+Writes rows of a recording to standard output, one line for each refresh period.
 
 FILE is a diagnostic log (.dlf) or a saved snapshot (.orvane), which gives a line for each of its
 entries; "-" is standard input. A PATH is that of a row, as in "/Serving Cell Info/Cell Identity",
-or of a group for all its rows; * stands for any name, such as the elements of a list. Without a
+or of a group for all its rows; * stands for any name, such as that of a list element. Without a
 PATH, every row is written.)";
 
 constexpr CommandLineCommand kCommands[] = {
@@ -64,8 +64,8 @@ constexpr AppOption kOptions[] = {
         {"details", "", "with json: print the numbers, units and times of rows too", kScreens},
         &AppOptions::printsDetails),
     AppOption({"ports", "DIR",
-               "where the telephony server's ports are (default $ORVANE_PORTS, "
-               "$XDG_RUNTIME_DIR/telephony or /tmp/telephony-UID)",
+               "where the telephony server's ports are (default $ORVANE_PORTS, else the first of "
+               "$XDG_RUNTIME_DIR/telephony and /run/telephonyd in which a server accepts)",
                kLive},
               &AppOptions::ports),
     AppOption({"root", "DIR",
@@ -77,8 +77,8 @@ constexpr AppOption kOptions[] = {
               &AppOptions::refreshInterval),
     AppOption(
         {"format", "csv|jsonl",
-         "a header and a column a row, or a JSON object a line (default csv with a PATH, else "
-         "jsonl)",
+         "csv with a header and a column for each row, or one JSON object on each line (default "
+         "csv with a PATH, else jsonl)",
          kExport},
         [](AppOptions& options, const GivenOption& given) {
             options.format = static_cast<ExportFormat>(given.choice());
@@ -87,13 +87,13 @@ constexpr AppOption kOptions[] = {
               &AppOptions::refreshInterval),
     AppOption(
         {"spreadsheet", "",
-         "with csv: begin cells with an apostrophe that a spreadsheet would take for formulas",
+         "with csv: put an apostrophe before cells that a spreadsheet would take for formulas",
          kExport},
         &AppOptions::isForSpreadsheet),
     AppOption({"list", "", "print the paths that occur", kExport}, &AppOptions::listsPaths),
     AppOption(
         {"once", "[SECONDS]",
-         "with text and json: print the first display that has rows, then end; fail if none comes "
+         "with text and json: print the first display that has rows and end, or fail if none comes "
          "within SECONDS (default 10)",
          kLive, 0.01, 86400},
         [](AppOptions& options, const GivenOption& given) {

@@ -75,8 +75,8 @@ constexpr DaemonOption kOptions[] = {
             options.technology = technologyNamed(given.text());
         }),
     DaemonOption({"speed", "N|max",
-                  "seconds of the recording a second, 0.001 to 1000, or as fast as clients take it "
-                  "(default 1)",
+                  "how many seconds of the recording to send in a second, 0.001 to 1000, or max "
+                  "for as fast as clients take it (default 1)",
                   kRecordings, 0.001, 1000},
                  [](DaemonOptions& options, const GivenOption& given) {
                      options.speed = given.value() == "max" ? std::nullopt

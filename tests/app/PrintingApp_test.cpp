@@ -152,13 +152,9 @@ TEST_F(PrintingAppTest, WhileNotConnectedAReloadLeavesTheTimeOfTheLastUpdate)
 TEST_F(PrintingAppTest, OncePrintsTheFirstTreeWithRowsAndNothingElse)
 {
     int ends = 0;
-    PrintingApp once{
-        {queue, ports, client, 2s, [] { return std::optional<std::string>("ONCE"); }},
-        files,
-        preferences,
-        printer,
-        [&ends] { ++ends; }
-    };
+    const auto name = [] { return std::optional<std::string>("ONCE"); };
+    const ModelEnvironment environment{queue, ports, client, 2s, name};
+    PrintingApp once(environment, files, preferences, printer, [&ends] { ++ends; });
     once.applicationDidFinishLaunching();
     queue.advance(10s);
     EXPECT_THAT(takeLines(), IsEmpty());
