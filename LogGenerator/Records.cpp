@@ -106,6 +106,20 @@ void ListElements::add(PacketView record, std::span<const Field> fields,
     add(std::move(element));
 }
 
+PropertyDictionary& ListElements::addRows(const RowDescription& first, std::size_t entries)
+{
+    PropertyDictionary* rows = reusable();
+    if (rows && rows->size() == entries && readingOf(&first, *rows, 0)) {
+        ++_count;
+        return *rows;
+    }
+    PropertyValue element = PropertyValue::newDictionary();
+    PropertyDictionary& added = *element.asDictionary();
+    added.reserve(entries);
+    add(std::move(element));
+    return added;
+}
+
 void ListElements::add(PropertyValue element)
 {
     if (_count < _elements.size())

@@ -71,6 +71,10 @@ public:
     void add(std::span<const Reading> readings);
     // A dictionary of the fields' rows in a record, those of `fields`, then of `others`.
     void add(PacketView record, std::span<const Field> fields, std::span<const Field> others = {});
+    // The rows of an element that the caller writes: those of an earlier one where it has as many
+    // entries and the first is a reading of `first`, else none. For elements that always have the
+    // same entries.
+    PropertyDictionary& addRows(const RowDescription& first, std::size_t entries);
     // Any other value.
     void add(PropertyValue element);
     // One dictionary a whole record.

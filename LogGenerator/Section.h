@@ -96,6 +96,7 @@ public:
     void updateWithData(ByteView data, std::uint32_t logCode) final;
     [[nodiscard]] std::string getSectionName() const final { return _layout->name; }
     [[nodiscard]] std::vector<std::uint32_t> getLogCodeArray() const final;
+    [[nodiscard]] const SectionLayout& layout() const { return *_layout; }
 
 protected:
     // The layout is static data of the subclass and outlives the section.

@@ -45,11 +45,10 @@ CCTRCHSIRMeasurement::CCTRCHSIRMeasurement() : ListSection(kLayout) {}
 void CCTRCHSIRMeasurement::fill(ListElements& elements, PacketView packet, const PacketLayout&)
 {
     forEachWholeRecord(kChannels.in(packet), kChannelBytes, [&](PacketView record) {
-        PropertyValue channel = PropertyValue::newDictionary();
-        writeRows(channel.asDictionary(), record, kChannelFields);
-        rewriteListRow(channel.asDictionary(), "SIR",
-                       [&](ListElements& ratios) { addRatios(ratios, record); });
-        elements.add(std::move(channel));
+        PropertyDictionary& channel =
+            elements.addRows(kChannelFields[0], std::size(kChannelFields) + 1);
+        writeRows(&channel, record, kChannelFields);
+        rewriteListRow(&channel, "SIR", [&](ListElements& ratios) { addRatios(ratios, record); });
     });
 }
 

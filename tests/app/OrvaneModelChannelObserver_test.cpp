@@ -76,6 +76,22 @@ TEST_F(ChannelObserverTest, SeesEveryMessageAsItCameEvenWhereItsDecoderFails)
     EXPECT_THAT(observer.messages, ElementsAre(wrapped, item));
 }
 
+TEST_F(ChannelObserverTest, ReadingsCarryTheTimeAtWhichTheirMessageArrived)
+{
+    start();
+    services.clock.now = 1795255200.25;
+    const Bytes item = PacketBuilder(0xB0C2, 38);
+    server.sendLogMessage(item);
+    queue.runPending();
+    services.clock.now += 1;
+    ASSERT_TRUE(model->topLevelNodes());
+    const NodePointer row = model->nodeAtPath("/Serving Cell Info/Physical Cell ID");
+    ASSERT_TRUE(row);
+    const PropertyValue reading = row->reading();
+    ASSERT_TRUE(reading.asReading());
+    EXPECT_EQ(reading.asReading()->time, 1795255200250);
+}
+
 TEST_F(ChannelObserverTest, IsToldTheTechnologyOfEachChannel)
 {
     start();

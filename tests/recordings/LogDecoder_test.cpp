@@ -7,6 +7,7 @@
 
 #include <gmock/gmock.h>
 
+#include <set>
 #include <stdexcept>
 
 namespace orvane
@@ -74,6 +75,42 @@ TEST_F(LogDecoderTest, TimeCountsFromTheFirstItemAndNeverGoesBack)
     }
     EXPECT_THAT(times, ElementsAre(0s, 0s, 3s, 3s, 3s, 3s, 4s));
     EXPECT_EQ(play.clock().isoText(play.time()), "2017-07-11T04:34:12.000Z");
+}
+
+// The times of all readings of a display, each once.
+std::set<std::int64_t> readingTimes(const PropertyValue& display)
+{
+    std::set<std::int64_t> times;
+    if (const Reading* reading = display.asReading())
+        times.insert(reading->time);
+    if (const PropertyDictionary* rows = display.asDictionary())
+        for (const auto& [key, row] : *rows)
+            times.merge(readingTimes(row));
+    if (const PropertyArray* elements = display.asArray())
+        for (const PropertyValue& element : *elements)
+            times.merge(readingTimes(element));
+    return times;
+}
+
+TEST_F(LogDecoderTest, ReadingsCarryTheTimeOfTheLastItemThatHadOne)
+{
+    constexpr std::int64_t kStart = 1499747648000; // 2017-07-11 04:34:08
+    LogDecoder play(LogBuilder()
+                        .measurement(0, 1)
+                        .measurement(kLogStart, 2)
+                        .measurement(0, 3)
+                        .measurement(kLogStart + 3 * kLogSecond, 4)
+                        .source(),
+                    kLte);
+    std::vector<std::set<std::int64_t>> times;
+    play.lookAhead();
+    while (play.hasNext()) {
+        play.takeNext();
+        times.push_back(readingTimes(play.display()));
+    }
+    using Times = std::set<std::int64_t>;
+    EXPECT_THAT(times, ElementsAre(Times{kNoReadingTime}, Times{kStart}, Times{kStart},
+                                   Times{kStart + 3000}));
 }
 
 TEST_F(LogDecoderTest, AnItemOfAnImpossibleTimeHasThatOfTheOneBefore)
