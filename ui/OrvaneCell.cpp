@@ -11,7 +11,7 @@ namespace
 constexpr double kFontSize = 15.0;
 constexpr double kLeftMargin = 10;
 constexpr double kGap = 50;
-// Whatever the height of the row. This is meant.
+// Deliberate: the strip has this height whatever the height of the row.
 constexpr double kStripHeight = 50;
 
 std::shared_ptr<Label> makeLabel(const Font& font)
@@ -22,7 +22,7 @@ std::shared_ptr<Label> makeLabel(const Font& font)
     return label;
 }
 
-// In the bold font for values too, which are drawn in the regular one. This is meant.
+// Deliberate: values are measured in the bold font too, although they are drawn in the regular one.
 Size measured(const std::shared_ptr<Label>& label)
 {
     return Screen::main().sizeWithFont(label ? label->text() : "", Font::boldSystem(kFontSize));
@@ -78,7 +78,7 @@ void OrvaneCell::setLayout()
     const double keyWidth = measured(_key).width;
     const Size value = measured(_value);
     const double needed = keyWidth + kLeftMargin + kGap + value.width;
-    // One that fits exactly stands after the key as well. This is meant.
+    // Deliberate: a value that fits exactly also stands after the key.
     const double x = needed < bounds.width ? bounds.width - value.width
                                            : bounds.x + kLeftMargin + keyWidth + kGap;
     place(_value, x, bounds, value);

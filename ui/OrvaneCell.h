@@ -10,12 +10,12 @@
 namespace orvane
 {
 
-// A row of a pane: a bold key at the left and, for value rows, the value at the right edge or,
-// where the row is too narrow for that, after the key in a strip that scrolls sideways.
+// A row of a pane: a bold key at the left and, in value rows, the value at the right edge. If the
+// row is too narrow for both, the value follows the key in a strip that scrolls sideways.
 class OrvaneCell final : public TableViewCell
 {
 public:
-    // A cell for a key alone: without a value label and without a strip.
+    // A cell for a key alone. It has no value label and no strip.
     static std::shared_ptr<OrvaneCell> withStyleKey(CellStyle style, std::string reuseIdentifier);
     // A cell for a key and a value, both in the strip.
     static std::shared_ptr<OrvaneCell> withStyle(CellStyle style, std::string reuseIdentifier);
@@ -27,10 +27,10 @@ public:
     void setValue(std::shared_ptr<Label> value) { _value = std::move(value); }
     [[nodiscard]] const std::shared_ptr<ScrollView>& strip() const { return view; }
 
-    // The texts of the labels that there are.
+    // Sets the texts of those labels that the cell has.
     void setTexts(const std::string& keyText, const std::string& valueText);
 
-    // Put the labels where they belong, as a row of a key alone and as one of key and value.
+    // Place the labels: setLayoutKey() for a key alone, setLayout() for key and value.
     void setLayoutKey();
     void setLayout();
 

@@ -13,8 +13,8 @@ namespace
 {
 
 constexpr const char* kNoNodeTitle = "Orvane";
-// One for both kinds of row, so that a cell made for a group, which has no value label, may come
-// back for a value and then shows none. This is meant.
+// Deliberate: both kinds of row share one identifier. A cell made for a group, which has no value
+// label, may be reused for a value, which it then does not show.
 constexpr const char* kCellIdentifier = "OrvanePaneControllerCell";
 constexpr double kStatusFontSize = 14.0;
 

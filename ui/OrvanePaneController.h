@@ -10,25 +10,25 @@
 namespace orvane
 {
 
-// Shows one node of the display tree as a table, a row a child: groups lead to a further pane,
-// values show key and value. Its toolbar has the status with a busy indicator and, where saving is
-// offered, a Save button.
+// Shows one node of the display tree as a table with a row for each child. A group opens another
+// pane; a value shows its key and value. The toolbar has the status with a busy indicator and, if
+// saving is offered, a Save button.
 class OrvanePaneController : public TableViewController
 {
 public:
-    // Busy, with an empty status. The node may be null. The shell must outlive the pane.
+    // Starts busy, with an empty status. The node may be null. The shell must outlive the pane.
     OrvanePaneController(NodePointer node, std::string path, Shell& shell);
 
     // The path of the node in the display tree; "/" for the root.
     [[nodiscard]] const std::string& path() const { return _keyPath; }
     // Shows another node; null for none.
     virtual void reloadWithNode(NodePointer node);
-    // No status is an empty one.
+    // nullopt sets an empty status.
     virtual void setStatus(std::optional<std::string> text, bool isBusy);
     [[nodiscard]] const std::string& statusText() const { return status; }
     [[nodiscard]] bool isBusy() const { return isLoading; }
 
-    // Builds the toolbar anew.
+    // Builds the toolbar again.
     void createToolbarItems();
 
     void viewWillAppear(bool animated) override;

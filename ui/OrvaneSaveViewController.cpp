@@ -45,7 +45,7 @@ OrvaneSaveViewController::withSaveHistory(const PropertyValue& saveHistory, Shel
 
 OrvaneSaveViewController::~OrvaneSaveViewController()
 {
-    // A front end may still have these.
+    // The front end may outlive this screen and still have these.
     if (_saveContentTable) {
         _saveContentTable->setDataSource(nullptr);
         _saveContentTable->setDelegate(nullptr);
@@ -121,7 +121,7 @@ void OrvaneSaveViewController::cancelPressed()
     closeSoon();
 }
 
-// After the button's action has returned, in which this is still used.
+// Closes later: the action of the button, which runs now, still uses this object.
 void OrvaneSaveViewController::closeSoon()
 {
     _shell.mainQueue().async([&shell = _shell] { shell.closeSaveView(); });

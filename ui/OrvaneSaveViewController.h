@@ -12,12 +12,12 @@
 namespace orvane
 {
 
-// The modal screen on which the user saves a snapshot: lists what will be saved, takes a
+// The modal screen on which the user saves a snapshot. It lists what will be saved, takes a
 // description and writes the file.
 //
-// Its view comes from the interface file of its name, with the parts "saveContentTable"
+// Its view comes from the interface file of the same name, with the parts "saveContentTable"
 // (TableView), "saveDescription" (TextField), "saveButton", "cancelButton" (Button) and
-// "background" (Control: touches beside everything else).
+// "background" (Control: receives presses outside of the other parts).
 class OrvaneSaveViewController final : public ViewController,
                                        public TableViewDataSource,
                                        public TableViewDelegate,
@@ -31,7 +31,7 @@ public:
     withSaveHistory(const PropertyValue& saveHistory, Shell& shell);
     ~OrvaneSaveViewController() override;
 
-    // Null where the interface file lacks them.
+    // Null if the interface file lacks them.
     [[nodiscard]] TableView* saveContentTable() const { return _saveContentTable.get(); }
     [[nodiscard]] TextField* saveDescription() const { return _saveDescription.get(); }
 

@@ -9,14 +9,14 @@
 namespace orvane
 {
 
-// What panes and the save screen ask of the application that they are part of.
+// The parts of the application that panes and the save screen use.
 class Shell
 {
 public:
     virtual ~Shell() = default;
     // Whether saving is offered.
     [[nodiscard]] virtual bool allowSaveButton() const = 0;
-    // Opens the save screen: nothing while it is open. Closes it: nothing while it is not.
+    // Open and close the save screen. Do nothing if it is open, or closed, already.
     virtual void showSaveView() = 0;
     virtual void closeSaveView() = 0;
 

@@ -11,7 +11,7 @@ namespace orvane
 // The system's folder of diagnostic files, below the file system's root.
 inline constexpr const char* kLogFolder = "/var/mobile/Library/Logs/DiagDrop";
 
-// What the alert of a failed save says.
+// The texts of the alert for a failed save.
 inline constexpr const char* kFileErrorTitle = "File Error";
 inline constexpr const char* kFileErrorMessage = "Unable to write file to disk";
 // The title of the alert that names a saved file.
@@ -19,7 +19,7 @@ inline constexpr const char* kSavedTitle = "Saved";
 
 struct SnapshotResult {
     bool isWritten;
-    std::string path; // as written to, root included
+    std::string path; // of the file, root included
 };
 
 // Writes a snapshot file "OrvaneSnapshot-SECONDS.orvane" into the system's log folder, SECONDS

@@ -11,12 +11,12 @@
 namespace orvane
 {
 
-// The characters that stand for things: beautiful ones, or those of any terminal.
+// The characters used as signs: good-looking ones, or ASCII for any terminal.
 struct Marks {
     static Marks of(bool isBeautiful);
 
     std::string disclosure;
-    std::string cut; // more text than fits
+    std::string cut; // where a text is cut
     std::string check;
     std::string leftArrow;
     std::string rightArrow;
@@ -28,21 +28,21 @@ struct Marks {
     std::vector<std::string> indicator; // turns through these
 };
 
-// Neighbouring lines of the screen.
+// Lines of the screen that follow each other.
 struct Lines {
     int first = 0;
     int count = 0;
     [[nodiscard]] int end() const { return first + count; }
 };
 
-// A key that works now, as told at the foot of the screen.
+// A key that works now, as shown at the foot of the screen.
 struct Hint {
     std::string key;
     std::string what;
-    Key press; // the same by a click
+    Key press; // what a click on the hint presses
 };
 
-// One picture of the screen while it is drawn, and what clicks on it do.
+// A picture of the screen while it is drawn, and the effect of clicks on it.
 struct Canvas {
     struct Zone {
         Lines lines;

@@ -28,7 +28,7 @@ struct Style {
     friend bool operator==(const Style&, const Style&) = default;
 };
 
-// The screen as characters: what is drawn is put here, and a terminal shows it.
+// The screen as a grid of characters. Pages draw onto it, and a terminal shows it.
 class CellGrid
 {
 public:
@@ -49,20 +49,20 @@ public:
     [[nodiscard]] int lines() const { return _lines; }
     [[nodiscard]] int columns() const { return _columns; }
     [[nodiscard]] Span wholeLine() const { return {0, _columns}; }
-    // A blank beyond the edges.
+    // A blank for a place outside of the grid.
     [[nodiscard]] const Cell& at(int line, int column) const;
-    // The line's text, blanks at its end left out.
+    // The text of the line, without blanks at its end.
     [[nodiscard]] std::string text(int line) const;
 
-    // Draws what falls into the span and onto the grid, and returns the column after the text. Of a
-    // wide character that falls half outside, a blank is drawn.
+    // Draws the part of the text that is within the span and the grid. Returns the column after the
+    // text. A wide character that is half outside is drawn as a blank.
     int put(int line, int column, std::string_view text, Style style, Span within);
     int put(int line, int column, std::string_view text, Style style)
     {
         return put(line, column, text, style, wholeLine());
     }
     void fill(int line, Span span, Style style);
-    // Blanks, in the plain style.
+    // Fills the lines with blanks in the plain style.
     void clear(int firstLine, int lineCount);
 
     friend bool operator==(const CellGrid&, const CellGrid&) = default;

@@ -100,7 +100,7 @@ void drawMessage(Canvas& canvas, Lines area, const std::vector<std::string>& par
             lines.emplace_back(std::move(text), style);
     }
     const int count = std::min(static_cast<int>(lines.size()), area.count);
-    // A little above the middle looks like the middle.
+    // A little above the middle.
     int line = area.first + (area.count - count) * 2 / 5;
     for (int i = 0; i < count; ++i, ++line) {
         const auto& [text, style] = lines[static_cast<std::size_t>(i)];

@@ -11,21 +11,21 @@ namespace orvane
 
 // The parts of the screen around the rows.
 
-// One step of the way to what is shown.
+// One step of the path to the pane that is shown.
 struct Crumb {
     std::string title;
-    std::function<void()> open; // by a click; null for none
+    std::function<void()> open; // called by a click; null if a click does nothing
 };
 
-// The path, shortened from the left where it does not fit, and what is said at the right.
+// Draws the path, shortened from the left if it does not fit, and the remark at the right.
 void drawTitle(Canvas& canvas, int line, const std::vector<Crumb>& crumbs,
                const std::string& remark);
 
-// As many of the hints as fit, the last two always if possible; `press` is told of clicks.
+// Draws as many hints as fit, the last two first. Clicks on them call `press`.
 void drawHints(Canvas& canvas, int line, const std::vector<Hint>& hints,
                const std::function<void(const Key&)>& press);
 
-// Paragraphs in the middle of empty lines, the first of them more important than the others.
+// Draws paragraphs in the middle of empty lines. The first one is the most important.
 void drawMessage(Canvas& canvas, Lines area, const std::vector<std::string>& paragraphs);
 
 } // namespace orvane

@@ -23,7 +23,7 @@ namespace orvane
 namespace
 {
 
-// ncurses handles these in ways that are not safe; whoever runs the event loop does it.
+// Keeps the handlers of signals that ncurses would handle in an unsafe way.
 class SignalsKept
 {
 public:
@@ -58,9 +58,9 @@ SCREEN* startCurses()
     return screen;
 }
 
-// Ctrl-S must not stop the program for good, and no other key has a meaning of the terminal's own,
-// apart from those that end programs. Ctrl-Z is none of them: while ncurses writes it drops that
-// signal, which on a slow line would be most of the time.
+// The terminal itself handles only the keys that end programs. Ctrl-S must not stop the output for
+// good. Ctrl-Z arrives as a key: ncurses drops the signal while it writes, which on a slow line is
+// most of the time.
 void takeModes()
 {
     cbreak();
@@ -78,7 +78,7 @@ void takeModes()
     def_prog_mode();
 }
 
-// Whether the terminal is with another job of the shell's.
+// Whether another job of the shell has the terminal.
 bool isInBackground()
 {
     const pid_t group = ::tcgetpgrp(STDIN_FILENO);
@@ -93,7 +93,7 @@ struct CursesDevice::State {
     TerminalKind kind;
     CursesKeys keys;
     CursesStyle style;
-    CellGrid shown; // of no size while unknown
+    CellGrid shown; // empty while unknown
     CursorPlace cursor;
     std::vector<cchar_t> line;
     bool isTaken = false;
@@ -146,7 +146,7 @@ void CursesDevice::State::putLine(const CellGrid& grid, int number)
         if (!kind.hasUtf8 && (text.empty() || text.front() > 0x7E))
             text = text.empty() ? U" " : U"?";
         if (text.empty())
-            continue; // part of the one before
+            continue; // the second column of a wide character
         if (!kind.hasUtf8)
             text.resize(1);
         std::array<wchar_t, CCHARW_MAX + 1> characters{};
@@ -231,7 +231,7 @@ void CursesDevice::suspend()
 void CursesDevice::retake()
 {
     if (isInBackground()) {
-        // To touch its modes would stop the process, before it has heard other signals.
+        // Changing the modes would stop the process before it has handled other signals.
         _state->isTaken = false;
         _state->guard.disarm();
         return;

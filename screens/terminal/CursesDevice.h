@@ -8,14 +8,14 @@
 namespace orvane
 {
 
-// The terminal at standard input and output, by means of ncurses, with the kind that TERM names.
-// Colours unless NO_COLOR is set. While it lives, lines that go to standard error on that same
-// terminal wait (HeldErrors), and every end of the process gives the terminal back (RestoreGuard).
-// One at a time.
+// The terminal at standard input and output, drawn with ncurses for the kind that TERM names. Uses
+// colours unless NO_COLOR is set. While it exists, lines to standard error on the same terminal are
+// held back (HeldErrors), and every end of the process restores the terminal (RestoreGuard). One
+// object at a time.
 class CursesDevice final : public TerminalDevice
 {
 public:
-    // Throws std::runtime_error where there is a terminalProblem().
+    // Throws std::runtime_error if there is a terminalProblem().
     CursesDevice();
     ~CursesDevice() override;
 

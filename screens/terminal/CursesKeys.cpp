@@ -17,12 +17,12 @@ constexpr int kPasteBegins = KEY_MAX + 1;
 constexpr int kPasteEnds = KEY_MAX + 2;
 constexpr int kEscapeDelayMs = 25;
 
-// A paste whose end was lost on the way ends with a pause.
+// If the mark at the end of a paste is lost, a pause ends the paste.
 constexpr std::chrono::seconds kPastePause{1};
 constexpr int kBell = 7;
 constexpr int kLongestString = 4096;
 
-// What the usual terminals send, whatever TERM says of the one that is there.
+// The codes of common terminals, which are recognised whatever TERM says.
 struct Code {
     const char* sent;
     int key;
@@ -70,7 +70,7 @@ Key mouseKey()
 
 } // namespace
 
-// Reading from a pad draws nothing by the way.
+// Unlike reading from a window, reading from a pad does not draw.
 struct CursesKeys::Pad {
     Pad() : window(newpad(1, 1)) {}
     ~Pad() { delwin(window); }
@@ -172,8 +172,7 @@ Key CursesKeys::keyOfCharacter(char32_t character)
     }
 }
 
-// Escape alone, or with what follows at once a key that has no name here, such as Ctrl with an
-// arrow.
+// Escape alone, or the start of a code for a key without a name here, such as Ctrl with an arrow.
 Key CursesKeys::readAfterEscape()
 {
     std::wint_t character = 0;
@@ -197,10 +196,10 @@ Key CursesKeys::readAfterEscape()
     return {};
 }
 
-// An answer of the terminal's, or somebody's attempt at one: up to BEL or Escape and a backslash.
+// Skips an answer of the terminal, or a forged one, up to BEL or Escape and a backslash.
 void CursesKeys::skipString()
 {
-    wtimeout(_pad->window, kEscapeDelayMs); // may arrive in parts
+    wtimeout(_pad->window, kEscapeDelayMs); // the answer may arrive in parts
     std::wint_t character = 0;
     for (int i = 0; i < kLongestString; ++i) {
         const int result = wget_wch(_pad->window, &character);

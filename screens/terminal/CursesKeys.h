@@ -9,7 +9,7 @@
 namespace orvane
 {
 
-// Reads keys by means of ncurses, which must have been started.
+// Reads keys with ncurses, which must have been started.
 class CursesKeys
 {
 public:
@@ -18,11 +18,11 @@ public:
     CursesKeys(const CursesKeys&) = delete;
     CursesKeys& operator=(const CursesKeys&) = delete;
 
-    // The next key that is there already.
+    // The next key that has arrived; nullopt if none has.
     std::optional<Key> read();
-    // What is being pasted has ended, whatever comes.
+    // Treats the next characters as typed, not as pasted.
     void endPaste() { _isPasting = false; }
-    // Whether the terminal tells of clicks.
+    // Whether the terminal reports clicks.
     [[nodiscard]] bool hasMouse() const { return _hasMouse; }
 
 private:

@@ -83,7 +83,7 @@ void HeldErrors::release()
 void HeldErrors::writeHeld()
 {
     if (_isIncomplete) {
-        // From the first whole line on.
+        // Starts with the first whole line.
         while (_size > 0 && _held[_start] != '\n') {
             _start = (_start + 1) % kMost;
             --_size;

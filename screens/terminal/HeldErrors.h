@@ -6,9 +6,9 @@
 namespace orvane
 {
 
-// Keeps what the process writes to standard error (log lines, messages of libraries) from the
-// screen of that same terminal, and lets it out when the screen is gone. Keeps the latest 64 KiB.
-// One at a time.
+// Holds back what the process writes to standard error (log lines, messages of libraries) while the
+// screen is on the same terminal, and writes it when the screen is gone. Keeps the latest 64 KiB.
+// One object at a time.
 class HeldErrors
 {
 public:
@@ -17,13 +17,12 @@ public:
     HeldErrors(const HeldErrors&) = delete;
     HeldErrors& operator=(const HeldErrors&) = delete;
 
-    // From here on nothing reaches the terminal; nothing happens where standard error is elsewhere,
-    // or when the system has no more descriptors. Writers never wait.
+    // Holds standard error back from now on. Does nothing if standard error is not that terminal,
+    // or if the system has no more descriptors. Writers never wait.
     void hold(int terminal);
-    // Makes room for more. To be called now and then.
+    // Takes over what was written, which makes room for more. To be called regularly.
     void collect();
-    // Writes what was held to standard error, which is the terminal again. Safe in a signal's
-    // handler, whatever the thread was doing.
+    // Makes standard error the terminal again and writes what was held. Safe in a signal handler.
     void release();
 
 private:

@@ -14,11 +14,11 @@ namespace
 {
 
 constexpr char32_t kReplacement = 0xFFFD;
-// As many as ncurses keeps with one character.
+// The number that ncurses keeps with one character.
 constexpr std::size_t kMostCombining = 4;
 
-// The C library knows the widths of all characters only in a locale with UTF-8, whatever the user's
-// is.
+// The C library knows the widths of all characters only in a locale with UTF-8. The user's locale
+// may be another one.
 class Utf8Locale
 {
 public:
@@ -165,7 +165,7 @@ std::vector<std::string> wrapped(std::string_view text, int columns)
             endWord();
             continue;
         }
-        // A word that is too long for any line is broken where it meets the edge.
+        // A word that is longer than a line is broken at the edge.
         if (wordColumns > 0 && wordColumns + glyph.columns > columns)
             endWord();
         word += glyph.text;

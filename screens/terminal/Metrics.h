@@ -7,8 +7,8 @@
 namespace orvane
 {
 
-// The toolkit's points on a terminal: a column is 10 of them, a line of text 20, and a table's row
-// one line.
+// Points of the toolkit on a terminal: a column is 10 points wide, a text 20 points high, and a row
+// of a table, which takes one line, 44 points high.
 inline constexpr double kPointsOfColumn = 10;
 inline constexpr double kPointsOfText = 20;
 inline constexpr double kPointsOfRow = 44;

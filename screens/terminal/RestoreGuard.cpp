@@ -30,7 +30,7 @@ RestoreGuard::RestoreGuard(int terminal) : _terminal(terminal), _handlerStack(kH
         stack = {_handlerStack.data(), 0, _handlerStack.size()};
         ::sigaltstack(&stack, nullptr);
     } else {
-        _handlerStack.clear(); // a sanitizer's is there
+        _handlerStack.clear(); // there is one already, for example of a sanitizer
     }
     for (const int signal : kSignals) {
         Earlier earlier{signal, {}};
@@ -77,7 +77,7 @@ void RestoreGuard::disarm()
 
 void RestoreGuard::rememberModes() { ::tcgetattr(_terminal, &_modes); }
 
-// Only what is safe in a signal's handler.
+// Uses only functions that are safe in a signal handler.
 void RestoreGuard::restore()
 {
     if (!_isArmed)
@@ -93,7 +93,7 @@ void RestoreGuard::handleSignal(int signal)
     if (!current)
         return;
     current->restore();
-    // What was set before has its turn: as a rule the process ends.
+    // The earlier action follows: as a rule the process ends.
     for (const Earlier& earlier : current->_earlier)
         if (earlier.signal == signal)
             ::sigaction(signal, &earlier.action, nullptr);

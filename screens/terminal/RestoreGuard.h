@@ -11,25 +11,24 @@
 namespace orvane
 {
 
-// Sees to it that the terminal is given back also when the process crashes, aborts or exits
-// somewhere deep: on every signal that would end the process and that nobody handles, writes what
-// restores the terminal, sets its modes, lets the held error lines out, and lets the signal go on.
-// One at a time.
+// Restores the terminal also when the process crashes, aborts or exits anywhere. On every signal
+// that would end the process and has no handler, it sends the restoring codes, sets the modes,
+// releases the held error lines, and raises the signal again. One object at a time.
 class RestoreGuard
 {
 public:
-    // Remembers the modes that the terminal has now.
+    // Remembers the current modes of the terminal.
     explicit RestoreGuard(int terminal);
     ~RestoreGuard();
     RestoreGuard(const RestoreGuard&) = delete;
     RestoreGuard& operator=(const RestoreGuard&) = delete;
 
-    // From here on the screen is the terminal's: `restoring` is what makes it plain again, cut
-    // after 512 bytes.
+    // The screen is up from now on. `restoring` are the codes that restore the terminal, of which
+    // the first 512 bytes are used.
     void arm(std::string_view restoring);
-    // The terminal has been given back; the held lines come out.
+    // The terminal has been restored. Releases the held lines.
     void disarm();
-    // Remembers the modes anew.
+    // Remembers the modes again.
     void rememberModes();
     [[nodiscard]] HeldErrors& heldErrors() { return _heldErrors; }
 
@@ -50,7 +49,7 @@ private:
     volatile std::sig_atomic_t _isArmed = 0;
     HeldErrors _heldErrors;
     std::vector<Earlier> _earlier;
-    std::vector<char> _handlerStack; // also for a stack that has run over
+    std::vector<char> _handlerStack; // for handlers after a stack overflow
 };
 
 } // namespace orvane

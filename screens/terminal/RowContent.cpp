@@ -18,8 +18,8 @@ constexpr std::size_t kMostCells = 1024;
 struct PlacedLabel {
     const Label& label;
     double x;
-    const ScrollView* strip; // that it is in; null for none
-    double left;             // what shows it
+    const ScrollView* strip; // the strip that holds the label; null for none
+    double left;             // the visible range
     double right;
 };
 
@@ -114,7 +114,7 @@ void drawRow(Canvas& canvas, int line, int columns, const TableViewCell& cell, c
 
 std::shared_ptr<TableViewCell> cellOfRow(TableView& table, std::size_t row)
 {
-    // All rows of a table of the usual kind, so that each keeps its cell.
+    // Usual tables have fewer rows, all of which keep their cells.
     table.setVisibleRows(row / kMostCells * kMostCells, kMostCells);
     auto cell = table.cellForRow(row);
     if (cell)

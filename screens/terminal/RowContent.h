@@ -10,9 +10,9 @@
 namespace orvane
 {
 
-// What a row of a table says, and how wide it is.
+// The texts of a row, and their width.
 struct RowContent {
-    // Of no cell: nothing at all.
+    // Empty for null.
     static RowContent of(const TableViewCell* cell);
 
     // How far it can be scrolled sideways, in columns.
@@ -21,24 +21,24 @@ struct RowContent {
     std::string name;  // the first text
     std::string value; // the others
     bool isGroup = false;
-    bool isStrip = false; // has something that scrolls sideways
-    int extent = 0;       // columns that its texts take
-    int width = 0;        // columns that there are for them
+    bool isStrip = false; // whether it can scroll sideways
+    int extent = 0;       // columns that the texts need
+    int width = 0;        // columns that they have
 };
 
 // How a row is drawn.
 struct RowLook {
     bool isSelected = false;
     bool isChanged = false;
-    int sideways = 0; // columns that have left at the left
+    int sideways = 0; // columns scrolled out at the left
 };
 
-// Draws the labels of the cell where their frames say, and its accessory at the right of the first
-// `columns` columns.
+// Draws the labels of the cell at the places of their frames, and the accessory at the right of the
+// first `columns` columns.
 void drawRow(Canvas& canvas, int line, int columns, const TableViewCell& cell, const RowLook& look);
 
-// The row's cell, laid out; null for a row that is not there. The table has a thousand cells at
-// most: others go back to its pool.
+// The cell of the row, laid out; null if the row does not exist. The table keeps at most about a
+// thousand cells; others go back to its pool.
 std::shared_ptr<TableViewCell> cellOfRow(TableView& table, std::size_t row);
 
 } // namespace orvane

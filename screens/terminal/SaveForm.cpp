@@ -11,7 +11,7 @@ namespace orvane
 namespace
 {
 
-// From this height on there is room for lines that only part the others.
+// From this height on there is room for empty lines between the parts.
 constexpr int kRoomy = 12;
 constexpr int kWidestField = 70;
 
@@ -45,7 +45,7 @@ void SaveForm::draw(Canvas& canvas, Lines area)
 {
     canvas.grid.clear(area.first, area.count);
     canvas.onClick(area, canvas.grid.wholeLine(), [this](int) { _background->press(); });
-    // The keyboard may have been taken from the field.
+    // The field may have lost the keyboard.
     if (isTyping() && !_description->isFirstResponder())
         _focus = Focus::Save;
 
@@ -83,7 +83,7 @@ void SaveForm::drawContents(Canvas& canvas, Lines area)
         const std::size_t place = _rows.top() + static_cast<std::size_t>(i);
         if (place >= _rows.count())
             return;
-        // Nothing in the list can be chosen.
+        // The list has no selection.
         if (const auto cell = cellOfRow(*_contents, _rows.rowAt(place)))
             drawRow(canvas, area.first + i, _rows.columns(), *cell, {});
     }

@@ -14,7 +14,7 @@
 namespace orvane
 {
 
-// The save screen: a description to type, the list of what will be saved, Save and Cancel.
+// The save screen: a field for the description, the list of what will be saved, Save and Cancel.
 class SaveForm final : public Page
 {
 public:

@@ -73,7 +73,7 @@ void StackPage::draw(Canvas& canvas, Lines area)
     const Lines body{area.first, std::max(area.count - 1 - controls, 0)};
     updateTables(canvas.columns(), body.count);
     if (!top() || !sameOwner(_lastTop, top()->weak_from_this()))
-        _filterEditor.reset(); // what is typed is for another table
+        _filterEditor.reset(); // the filter was typed for another table
     _lastTop = top() ? top()->weak_from_this() : TableKey();
     _isBusy = top() && orvane::isBusy(*top());
     drawRows(canvas, body);
@@ -81,7 +81,7 @@ void StackPage::draw(Canvas& canvas, Lines area)
     drawStatus(canvas, area.end() - 1);
 }
 
-// All tables of the stack, so that in each the values changed by the latest refresh are known.
+// Updates all tables of the stack, so that each knows the values that the latest refresh changed.
 void StackPage::updateTables(int columns, int lines)
 {
     std::erase_if(_rows, [](const auto& entry) { return entry.first.expired(); });

@@ -19,15 +19,15 @@ namespace orvane
 class Playback;
 class TableViewController;
 
-// The navigation stack: the rows of its top controller's table, the controls of a recording, and
+// The navigation stack: the rows of the top controller's table, the controls of a recording, and
 // the toolbar as a status line.
 class StackPage final : public Page
 {
 public:
-    // What to do while a table is empty and something is being waited for.
+    // `waitingHint` says what the user can do while the program waits for data.
     explicit StackPage(std::string waitingHint) : _waitingHint(std::move(waitingHint)) {}
 
-    // What is shown from now on; neither is owned, both may be null.
+    // Shows these from now on. Neither is owned; both may be null.
     void show(NavigationController* stack, Playback* playback);
 
     void draw(Canvas& canvas, Lines area) override;
@@ -38,11 +38,11 @@ public:
     // The keys that do something in the pane in front as it is now.
     [[nodiscard]] std::vector<KeyHelp> keys() const;
     [[nodiscard]] std::vector<Crumb> crumbs() const;
-    // The columns that rows take: not more than is easy to read, unless a value needs them.
+    // The width of the rows: at most TableRows::kReadableColumns unless a value needs more.
     [[nodiscard]] int rowColumns(int columns) const;
-    // Whether a busy indicator turns in what was drawn last.
+    // Whether a busy indicator was drawn last.
     [[nodiscard]] bool isBusy() const { return _isBusy; }
-    // How often refreshes have changed values that are marked since, until they are forgotten.
+    // The number of refreshes that changed values. These stay marked until forgetChanges().
     [[nodiscard]] std::size_t changeCount() const;
     void forgetChanges();
 
@@ -73,7 +73,7 @@ private:
     PlaybackLine _playbackLine;
     std::map<TableKey, TableRows, std::owner_less<TableKey>> _rows;
     TableKey _lastTop;
-    std::optional<TextEditor> _filterEditor; // while one types
+    std::optional<TextEditor> _filterEditor; // while the filter is typed
     bool _isBusy = false;
 };
 

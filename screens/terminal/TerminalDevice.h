@@ -45,30 +45,30 @@ struct CursorPlace {
     friend bool operator==(const CursorPlace&, const CursorPlace&) = default;
 };
 
-// The terminal as a screen of it needs it.
+// A terminal, as the screen uses it.
 class TerminalDevice
 {
 public:
     virtual ~TerminalDevice() = default;
     [[nodiscard]] virtual int lines() const = 0;
     [[nodiscard]] virtual int columns() const = 0;
-    // Whether it shows characters beyond ASCII, and among them marks such as ⠋ and ›.
+    // Whether it shows characters beyond ASCII, such as ⠋ and ›.
     [[nodiscard]] virtual bool hasMarks() const = 0;
 
-    // Sends what is different from what was shown before.
+    // Sends the differences to the grid shown before.
     virtual void show(const CellGrid& grid, CursorPlace cursor) = 0;
-    // The next key that is there already.
+    // The next key that has arrived; nullopt if none has.
     virtual std::optional<Key> readKey() = 0;
-    // Whether nobody is at the other end any more.
+    // Whether the other end has hung up.
     [[nodiscard]] virtual bool isGone() const = 0;
 
-    // Takes over the size that the terminal has now.
+    // Reads the current size of the terminal.
     virtual void updateSize() = 0;
-    // Gives the terminal back, stops the process as Ctrl-Z does, and retakes the terminal when the
-    // process goes on.
+    // Gives the terminal back, stops the process as Ctrl-Z does, and takes the terminal again when
+    // the process continues.
     virtual void suspend() = 0;
-    // Takes the terminal again, whatever others have done to it: everything is sent anew. Leaves it
-    // to others while the process is in the background; then nothing is shown and no key read.
+    // Takes the terminal again, whatever others have done to it, and sends everything again. Does
+    // not take it while the process is in the background: then nothing is shown and no key is read.
     virtual void retake() = 0;
 };
 

@@ -19,7 +19,7 @@ namespace
 using namespace std::chrono_literals;
 
 constexpr auto kIndicatorInterval = 150ms;
-// Longer than between two refreshes, as a rule.
+// As a rule longer than a refresh period.
 constexpr auto kMarkTime = 5s;
 constexpr const char* kSimulated = "simulated phone";
 constexpr const char* kShortSimulated = "simulated"; // leaves more room for the path
@@ -45,7 +45,7 @@ TerminalScreen::TerminalScreen(TerminalDevice& device, MainQueue& queue, Setting
 
 TerminalScreen::~TerminalScreen() = default;
 
-// As wide as rows are: new cells are laid out in it.
+// As wide as the rows, because new cells are laid out in it.
 Rect TerminalScreen::bounds() const
 {
     return rectOfCells(_stack.rowColumns(_device.columns()), _device.lines());
@@ -60,7 +60,7 @@ std::unique_ptr<Interface> TerminalScreen::loadInterface(const std::string& name
 {
     if (name != SaveForm::kInterfaceName)
         return nullptr;
-    _canvas.zones.clear(); // they may be of the form before
+    _canvas.zones.clear(); // they may refer to the form before
     _form = std::make_unique<SaveForm>();
     return _form->interface();
 }
@@ -84,7 +84,7 @@ void TerminalScreen::update()
 
 void TerminalScreen::draw()
 {
-    // What the toolkit's objects are fitted to is drawn at once.
+    // Drawing adapts the toolkit's objects to the screen. That needs no further update.
     _isUpdating = true;
     _canvas.grid = CellGrid(_device.lines(), _device.columns());
     _canvas.marks = Marks::of(_device.hasMarks());
@@ -155,7 +155,7 @@ SaveForm* TerminalScreen::shownForm() const
     return modal && _form && modal->view().get() == _form->view() ? _form.get() : nullptr;
 }
 
-// Changed values stay marked until the next refresh, but not for ever if there is none.
+// Changed values stay marked until the next refresh, or for a while if there is none.
 void TerminalScreen::markForAMoment()
 {
     const std::size_t changes = _stack.changeCount();
@@ -191,7 +191,7 @@ void TerminalScreen::inputIsReady()
             click(*key);
         else
             take(*key);
-        // The next key is meant for what this one has brought.
+        // The next key belongs to the state that this one has led to.
         draw();
     }
     if (hasRead)

@@ -15,15 +15,15 @@
 namespace orvane
 {
 
-// The front end for a terminal: draws the navigation stack, the save screen and the alerts as text,
-// and feeds them what is typed and clicked. Whoever runs the event loop tells it what happens to
-// the terminal. Is the main screen as long as it lives.
+// The front end for a terminal. Draws the navigation stack, the save screen and the alerts as text,
+// and passes them keys and clicks. The owner of the event loop reports events of the terminal. It
+// is the main screen for as long as it exists.
 class TerminalScreen final : public Screen
 {
 public:
     struct Settings {
         bool isSimulated = false;
-        // What a person can do while the telephony server is being waited for.
+        // What the user can do while the program waits for the telephony server.
         std::string waitingHint;
         std::function<void()> onQuit;
     };
@@ -32,13 +32,13 @@ public:
     TerminalScreen(TerminalDevice& device, MainQueue& queue, Settings settings);
     ~TerminalScreen() override;
 
-    // Something can be read.
+    // Input has arrived.
     void inputIsReady();
-    // It has another size.
+    // The terminal has another size.
     void sizeHasChanged();
-    // The process is to stop, as by Ctrl-Z; returns when it goes on.
+    // Stops the process as Ctrl-Z does. Returns when it continues.
     void suspend();
-    // The process goes on after it was stopped by somebody else.
+    // The process continues after another process stopped it.
     void wasContinued();
 
     [[nodiscard]] Rect bounds() const override;
@@ -48,7 +48,7 @@ public:
 
 private:
     void update();
-    // The picture of what is shown now, and what keys mean in it.
+    // Makes the picture of the current state, and decides what keys do in it.
     void draw();
     void show();
     void drawPages();
@@ -57,9 +57,9 @@ private:
     void take(const Key& key);
     void takeCommand(const Key& key);
     void click(const Key& key);
-    // The one that has the keys.
+    // The page that gets the keys.
     Page& front();
-    // Null while the save screen is not there.
+    // Null while there is no save screen.
     [[nodiscard]] SaveForm* shownForm() const;
 
     TerminalDevice& _device;

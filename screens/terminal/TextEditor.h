@@ -8,23 +8,24 @@
 namespace orvane
 {
 
-// One line of text as it is typed. The cursor stands between characters, never between one and what
-// combines with it.
+// A line of text that is being typed. The cursor is never between a character and one that combines
+// with it.
 class TextEditor
 {
 public:
-    // As many characters as one may type.
+    // The most characters that can be typed.
     static constexpr std::size_t kLongest = 1000;
 
     [[nodiscard]] std::string text() const;
-    // With the cursor at its end. Nothing changes for the text that is there already.
+    // Puts the cursor at the end. Does nothing if the text is the same.
     void setText(const std::string& text);
 
-    // Characters and pasted ones, Backspace, Delete, Left, Right, Home, End, and with Ctrl: A and E
-    // (to the ends), U and K (erase to them), W (erase a word). False for any other key.
+    // Takes typed and pasted characters, Backspace, Delete, Left, Right, Home, End, and with Ctrl:
+    // A and E (to the ends), U and K (erase to the ends), W (erase a word). False for any other
+    // key.
     bool take(const Key& key);
 
-    // Draws as much as fits, always with the cursor, which becomes the screen's.
+    // Draws the part around the cursor that fits, and places the screen's cursor.
     void draw(Canvas& canvas, int line, CellGrid::Span span, Style style);
 
 private:

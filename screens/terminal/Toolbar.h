@@ -6,13 +6,13 @@
 namespace orvane
 {
 
-// A controller's toolbar as a line of text.
+// The toolbar of a controller as a line of text.
 
-// Draws its views from the left on and returns the column after them.
+// Draws its views from the left. Returns the column after them.
 int drawToolbar(Canvas& canvas, int line, const ViewController& controller);
-// Whether a busy indicator among them turns.
+// Whether it has a busy indicator that turns.
 bool isBusy(const ViewController& controller);
-// Its standard Save button; null for none.
+// Its Save button; null if there is none.
 const BarButtonItem* saveItem(const ViewController& controller);
 
 } // namespace orvane

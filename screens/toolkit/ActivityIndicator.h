@@ -5,7 +5,7 @@
 namespace orvane
 {
 
-// What turns while something is being waited for, in the small grey style.
+// A small grey indicator that turns while the program waits for something.
 class ActivityIndicator : public View
 {
 public:

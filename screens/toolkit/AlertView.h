@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-// A message over everything else that stays until its one button is pressed, whatever goes on
-// beneath.
+// A message in front of everything else. It stays until its one button is pressed, whatever happens
+// behind it.
 class AlertView
 {
 public:

@@ -9,8 +9,8 @@
 namespace orvane
 {
 
-// One item of a toolbar: a view, a space that takes what is left, or a standard button. Never
-// changed once made.
+// One item of a toolbar: a view, a space that takes the remaining width, or a standard button. An
+// item is never changed after it was made.
 class BarButtonItem
 {
 public:
@@ -29,7 +29,7 @@ public:
     [[nodiscard]] Kind kind() const { return _kind; }
     // Null unless the item is a view.
     [[nodiscard]] const std::shared_ptr<View>& customView() const { return _customView; }
-    // The user has pressed it. Nothing without an action.
+    // The user has pressed it. Does nothing without an action.
     void press() const
     {
         if (const Action action = _action)

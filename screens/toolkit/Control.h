@@ -9,14 +9,14 @@
 namespace orvane
 {
 
-// A view that does something when it is pressed.
+// A view with an action for a press.
 class Control : public View
 {
 public:
     using Action = std::function<void()>;
 
     void setAction(Action action) { _action = std::move(action); }
-    // The user has pressed it. Nothing without an action. The action may destroy the control.
+    // The user has pressed it. Does nothing without an action. The action may destroy the control.
     void press() const
     {
         if (const Action action = _action)

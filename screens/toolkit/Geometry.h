@@ -3,8 +3,8 @@
 namespace orvane
 {
 
-// Lengths and positions are points: a front end says how many pixels, or how much of a character
-// cell, one is. The y axis points down.
+// Lengths and positions are in points. Each front end decides how many pixels, or which part of a
+// character cell, a point is. The y axis points down.
 struct Point {
     double x = 0;
     double y = 0;

@@ -10,7 +10,7 @@
 namespace orvane
 {
 
-// What a front end made of an interface file: a view, and the parts of it that have names.
+// The contents of an interface file as a front end loaded it: a view, and its named parts.
 class Interface
 {
 public:
@@ -21,7 +21,7 @@ public:
     {
         _outlets[name] = std::move(view);
     }
-    // Null where there is none of that name and kind.
+    // Null if there is no part of that name and kind.
     template <typename Kind>
     [[nodiscard]] std::shared_ptr<Kind> outlet(const std::string& name) const
     {

@@ -10,7 +10,7 @@ namespace orvane
 namespace
 {
 
-// Whether the value was another one before.
+// Assigns the value. Returns whether it differs from the one before.
 template <typename Value>
 bool replace(Value& old, Value value)
 {

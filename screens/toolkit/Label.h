@@ -19,7 +19,7 @@ class Label : public View
 {
 public:
     [[nodiscard]] const std::string& text() const { return _text; }
-    // No text is an empty one.
+    // nullopt sets an empty text.
     void setText(std::optional<std::string> text);
     [[nodiscard]] const Font& font() const { return _font; }
     void setFont(Font font);
@@ -30,7 +30,7 @@ public:
     [[nodiscard]] Colour backgroundColour() const { return _backgroundColour; }
     void setBackgroundColour(Colour colour);
 
-    // Makes the frame as large as the text, at its place.
+    // Makes the frame as large as the text. Its place stays.
     void sizeToFit();
 
 private:

@@ -47,7 +47,7 @@ void NavigationController::popToViewController(const ViewController& controller,
                                     [&](const auto& other) { return other.get() == &controller; });
     if (found == _controllers.end() || *found == _controllers.back())
         return;
-    // Kept until this has been told of: the caller may be one of them.
+    // Kept alive until the change was announced: the caller may be one of them.
     const std::vector popped(std::next(found), _controllers.end());
     popped.back()->viewWillDisappear(animated);
     _controllers.erase(std::next(found), _controllers.end());

@@ -17,8 +17,8 @@ public:
                                         ViewController& controller, bool animated) = 0;
 };
 
-// A stack of view controllers, of which the top one is seen, with a title bar that leads back and a
-// toolbar below. It never loses its root.
+// A stack of view controllers. The top one is shown, between a title bar with a way back and a
+// toolbar. The root is never removed.
 class NavigationController : public ViewController
 {
 public:
@@ -33,25 +33,25 @@ public:
     {
         return _controllers;
     }
-    // Null for a stack that was made without a root.
+    // Null if the stack was made without a root.
     [[nodiscard]] ViewController* topViewController() const
     {
         return _controllers.empty() ? nullptr : _controllers.back().get();
     }
 
-    // None at all, or one that is on the stack already, is not pushed.
+    // Does nothing for null and for a controller that is on the stack already.
     void pushViewController(std::shared_ptr<ViewController> controller, bool animated);
-    // Nothing at the root.
+    // Does nothing if only the root is left.
     void popViewController(bool animated);
-    // Takes all that are above it off the stack. Nothing for one that is not on it.
+    // Removes all controllers above this one. Does nothing if it is not on the stack.
     void popToViewController(const ViewController& controller, bool animated);
-    // Whether the last push or pop is to be seen as a movement.
+    // Whether the last push or pop is to be animated.
     [[nodiscard]] bool isLastChangeAnimated() const { return _isLastChangeAnimated; }
 
     [[nodiscard]] bool isToolbarHidden() const { return _isToolbarHidden; }
     void setToolbarHidden(bool isHidden);
 
-    // Pass on to the top controller.
+    // Passed on to the top controller.
     void viewWillAppear(bool animated) override;
     void viewWillDisappear(bool animated) override;
 

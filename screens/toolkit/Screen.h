@@ -17,8 +17,8 @@ namespace orvane
 class Playback;
 class Window;
 
-// The main screen: what is shown, and what the toolkit asks of the front end that shows it. A front
-// end is a subclass; one is the main screen at a time. Main thread only.
+// The main screen: holds what is shown, and declares what the toolkit needs from a front end. Each
+// front end is a subclass. There is one main screen at a time. Main thread only.
 class Screen
 {
 public:
@@ -27,25 +27,25 @@ public:
     Screen(const Screen&) = delete;
     Screen& operator=(const Screen&) = delete;
 
-    // Where there is no front end, a screen of no size that shows nothing.
+    // Without a front end: a screen of size 0 that shows nothing.
     static Screen& main();
     // Not owned; null for none.
     static void setMain(Screen* screen);
 
-    // What a front end supplies.
+    // Supplied by the front end.
 
     [[nodiscard]] virtual Rect bounds() const = 0;
-    // Without the parts that the system keeps for itself, such as a status bar.
+    // Without parts that the system keeps for itself, such as a status bar.
     [[nodiscard]] virtual Rect applicationFrame() const { return bounds(); }
-    // The text as one line.
+    // The size of the text on one line.
     [[nodiscard]] virtual Size sizeWithFont(std::string_view text, const Font& font) const = 0;
-    // The view that an interface file describes; null, with an error line, where that fails.
+    // Loads an interface file. On failure logs an error and returns null.
     [[nodiscard]] virtual std::unique_ptr<Interface> loadInterface(const std::string& name) = 0;
-    // Something that is shown has changed: draw it soon, once for all changes until then. Must not
-    // read anything yet.
+    // Something shown has changed. The front end draws later, once for all changes until then. It
+    // must not read any object during this call.
     virtual void setNeedsUpdate() = 0;
 
-    // What is shown.
+    // The contents of the screen.
 
     // Null for none. Not owned.
     [[nodiscard]] Window* keyWindow() const { return _keyWindow; }
@@ -53,9 +53,9 @@ public:
 
     // The alert in front; null for none.
     [[nodiscard]] const AlertView* alert() const;
-    // After the alerts that are up already.
+    // Shown after the alerts that are up already.
     void showAlert(std::unique_ptr<AlertView> alert);
-    // Its button was pressed.
+    // The button of the alert in front was pressed.
     void dismissAlert();
 
     // The recording whose controls are shown; null for none. Not owned.

@@ -5,8 +5,8 @@
 namespace orvane
 {
 
-// A window onto content that may be wider than itself. How far the user has scrolled it is the
-// front end's own.
+// Shows a part of content that may be wider than the view. The front end keeps how far the user has
+// scrolled.
 class ScrollView : public View
 {
 public:

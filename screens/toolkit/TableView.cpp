@@ -9,7 +9,7 @@ namespace orvane
 namespace
 {
 
-// What is kept of a table that is scrolled through from end to end.
+// The most cells that are kept for reuse while a long table is scrolled.
 constexpr std::size_t kLargestPool = 1024;
 
 } // namespace

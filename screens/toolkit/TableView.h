@@ -35,16 +35,17 @@ class TableViewDelegate
 {
 public:
     virtual ~TableViewDelegate() = default;
-    // Nothing for no row at all.
+    // nullopt if no row is selected.
     virtual void didSelectRowAtIndexPath(TableView& table,
                                          const std::optional<IndexPath>& indexPath) = 0;
 };
 
-// A plain table of one section. Cells are made for the rows that the front end says are visible;
-// cells of rows that left go to a pool for reuse.
+// A plain table with one section. It has cells for the rows that the front end reports as visible.
+// Cells of other rows go to a pool for reuse.
 //
-// The pool hands back the cell that the same row had, if it is there, else the cell last put in of
-// those whose row is gone: in an unchanged table every row keeps its cell, however it is scrolled.
+// From the pool a row gets its own earlier cell if that is there, else the latest cell of a row
+// that no longer exists. So every row of an unchanged table keeps its cell while the table is
+// scrolled.
 class TableView : public View
 {
 public:
@@ -52,30 +53,30 @@ public:
     void setDataSource(TableViewDataSource* dataSource) { _dataSource = dataSource; }
     void setDelegate(TableViewDelegate* delegate) { _delegate = delegate; }
 
-    // Puts all cells into the pool, forgets the selection and asks the data source anew.
+    // Puts all cells into the pool, clears the selection and asks the data source again.
     void reloadData();
-    // How often that was, so that a front end sees whether there is something new.
+    // The number of reloads so far, by which a front end notices a new one.
     [[nodiscard]] std::size_t reloadCount() const { return _reloadCount; }
-    // As of the last reload.
+    // At the last reload.
     [[nodiscard]] std::size_t numberOfRows() const { return _rowCount; }
     [[nodiscard]] double rowHeight() const { return TableViewCell::kDefaultHeight; }
-    // Of another width, reloads.
+    // Reloads if the width changes.
     void setFrame(const Rect& frame) override;
     // As high as all its rows.
     void sizeToFit();
 
-    // The rows that a front end shows, which have cells from now on. Rows that are not there count
-    // for nothing.
+    // The rows that the front end shows: these have cells from now on. Rows that do not exist are
+    // ignored.
     void setVisibleRows(std::size_t first, std::size_t count);
-    // The cell of a visible row, else null.
+    // The cell of a visible row; null for any other row.
     [[nodiscard]] std::shared_ptr<TableViewCell> cellForRow(std::size_t row) const;
 
-    // A cell of that identifier from the pool, else null; for the data source, while it makes the
+    // A cell with that identifier from the pool, or null. For the data source, while it makes the
     // cell of a row.
     std::shared_ptr<TableViewCell> dequeueReusableCell(const std::string& identifier);
 
-    // The user has pressed that row: it is selected, and the delegate told. The delegate may
-    // destroy the table.
+    // The user has pressed that row. Selects it and tells the delegate, which may destroy the
+    // table.
     void selectRow(std::size_t row);
     void deselectRow(const IndexPath& indexPath, bool animated);
     [[nodiscard]] std::optional<std::size_t> selectedRow() const { return _selectedRow; }

@@ -16,11 +16,11 @@ class TableViewCell : public View
 {
 public:
     static constexpr double kDefaultHeight = 44;
-    // What is kept free at the right of the content: a margin, or room for the accessory.
+    // The width kept free at the right of the content: a margin, or room for the accessory.
     static constexpr double kMargin = 10;
     static constexpr double kAccessoryWidth = 33;
 
-    // As wide as the screen at first; a table gives it the table's width.
+    // As wide as the screen. A table gives it the table's width later.
     TableViewCell(CellStyle style, std::string reuseIdentifier);
 
     [[nodiscard]] CellStyle style() const { return _style; }
@@ -29,11 +29,11 @@ public:
     void setAccessory(CellAccessory accessory);
     [[nodiscard]] View& contentView() const { return *_contentView; }
 
-    // The plain text of a default cell; made, and put into the content view, when first asked for.
+    // The plain text of a default cell. Made and added to the content view at the first call.
     [[nodiscard]] Label& textLabel();
     [[nodiscard]] const Label* plainText() const { return _textLabel.get(); }
 
-    // Lays out the content view beside the accessory, and the plain text in it.
+    // Places the content view beside the accessory, and the plain text in it.
     void layoutSubviews() override;
 
 private:

@@ -9,7 +9,7 @@ namespace orvane
 
 TableViewController::~TableViewController()
 {
-    // Whoever still has the table must not ask us any more.
+    // The table may outlive this controller and must not call it then.
     if (_table) {
         _table->setDataSource(nullptr);
         _table->setDelegate(nullptr);

@@ -6,7 +6,7 @@
 namespace orvane
 {
 
-// A view controller whose view is one table, which it fills and whose selection it hears of.
+// A view controller whose view is a table. It fills the table and is told of selections.
 class TableViewController : public ViewController,
                             public TableViewDataSource,
                             public TableViewDelegate
@@ -16,7 +16,7 @@ public:
 
     [[nodiscard]] TableView& tableView();
 
-    // The first time, fills the table; later, deselects the row that led to what was in front.
+    // The first time, fills the table. Later, clears the selection of the row that was opened.
     void viewWillAppear(bool animated) override;
 
 protected:

@@ -13,12 +13,12 @@ class TextFieldDelegate
 {
 public:
     virtual ~TextFieldDelegate() = default;
-    // Return was pressed. True for the field's usual behaviour.
+    // Return was pressed. True if the field is to behave as usual.
     virtual bool textFieldShouldReturn(TextField& field) = 0;
 };
 
-// One line of text that the user edits. Front ends edit by means of their own and put the result in
-// with setText() as it changes.
+// One line of text that the user edits. The front end does the editing and calls setText() after
+// each change.
 class TextField : public View
 {
 public:
@@ -32,7 +32,7 @@ public:
     // The user has pressed Return.
     void pressReturn();
 
-    // Whether it has the keyboard.
+    // Whether the field has the keyboard.
     [[nodiscard]] bool isFirstResponder() const { return _isFirstResponder; }
     void becomeFirstResponder();
     bool resignFirstResponder() override;

@@ -47,7 +47,7 @@ void View::removeFromSuperview()
     auto& siblings = std::exchange(_superview, nullptr)->_subviews;
     const auto found = std::find_if(siblings.begin(), siblings.end(),
                                     [this](const auto& view) { return view.get() == this; });
-    // The last owner may go with it.
+    // This may release the last owner.
     const std::shared_ptr<View> self = *found;
     siblings.erase(found);
     changed();

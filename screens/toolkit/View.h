@@ -8,10 +8,10 @@
 namespace orvane
 {
 
-// A rectangle of the screen and what is in it. Plain data: a front end draws it and feeds it what
-// the user does. Every change tells the screen that it needs an update.
+// A rectangle of the screen and its contents. It is plain data: a front end draws it and passes it
+// the user's input. Every change tells the screen that it needs an update.
 //
-// A view owns its subviews, which others may own as well.
+// A view shares the ownership of its subviews.
 class View
 {
 public:
@@ -29,17 +29,17 @@ public:
     [[nodiscard]] virtual bool isHidden() const { return _isHidden; }
     void setHidden(bool isHidden);
 
-    // Takes it out of where it was before. A null view is not added.
+    // Removes the view from its earlier superview. Does nothing for null.
     void addSubview(std::shared_ptr<View> view);
     void removeFromSuperview();
-    // Null for a view that is in no other, or whose superview has gone.
+    // Null if the view has no superview, or if that was destroyed.
     [[nodiscard]] View* superview() const { return _superview; }
     [[nodiscard]] const std::vector<std::shared_ptr<View>>& subviews() const { return _subviews; }
 
-    // The layout pass: puts the subviews where they belong within the bounds.
+    // Places the subviews within the bounds.
     virtual void layoutSubviews() {}
 
-    // Gives the keyboard back. True when the view does not have it any more.
+    // Gives the keyboard back. True if the view does not have it afterwards.
     virtual bool resignFirstResponder() { return true; }
 
 protected:

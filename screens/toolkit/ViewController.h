@@ -12,8 +12,8 @@ namespace orvane
 
 class NavigationController;
 
-// What fills the screen at a time: a view, and how it behaves when it comes and goes. Owned by the
-// navigation stack that it is on, or by what presented it, and by whoever made it.
+// A view that fills the screen, and its behaviour when it appears and disappears. The navigation
+// stack that it is on, the controller that presented it, and its creator share the ownership.
 class ViewController : public std::enable_shared_from_this<ViewController>
 {
 public:
@@ -22,7 +22,7 @@ public:
     ViewController(const ViewController&) = delete;
     ViewController& operator=(const ViewController&) = delete;
 
-    // Made when first asked for. Null where it could not be made.
+    // Made at the first call. Null if it could not be made.
     [[nodiscard]] const std::shared_ptr<View>& view();
 
     [[nodiscard]] const std::string& title() const { return _title; }
@@ -31,11 +31,11 @@ public:
     [[nodiscard]] const ToolbarItems& toolbarItems() const { return _toolbarItems; }
     void setToolbarItems(ToolbarItems items, bool animated);
 
-    // Null for one that is on no stack.
+    // Null if the controller is not on a stack.
     [[nodiscard]] NavigationController* navigationController() const { return _navigation; }
 
-    // Over this one, whose view stays beneath, until it is dismissed. One at a time: a second, or
-    // none at all, is not presented.
+    // Shows the controller in front of this one, whose view stays behind it, until it is dismissed.
+    // Does nothing for null, or while another one is presented.
     void presentModalViewController(std::shared_ptr<ViewController> controller, bool animated);
     void dismissModalViewController(bool animated);
     [[nodiscard]] const std::shared_ptr<ViewController>& modalViewController() const
@@ -48,7 +48,7 @@ public:
     virtual void viewWillDisappear(bool animated);
     virtual void didReceiveMemoryWarning() {}
     virtual void viewDidUnload() {}
-    // Gives the keyboard back, whichever part of the view has it.
+    // Gives the keyboard back if any part of the view has it.
     virtual bool resignFirstResponder() { return true; }
 
 protected:

@@ -8,8 +8,8 @@
 namespace orvane
 {
 
-// What the application fills the screen with. Shown from makeKeyAndVisible() until orderOut() or
-// its end.
+// The contents of the application's screen. Shown from makeKeyAndVisible() until orderOut() or
+// until it is destroyed.
 class Window : public View
 {
 public:
@@ -22,9 +22,9 @@ public:
     }
     void setRootViewController(std::shared_ptr<ViewController> controller);
 
-    // Makes it the screen's window; its root controller appears.
+    // Makes it the window of the screen. Its root controller appears.
     void makeKeyAndVisible();
-    // Takes it off the screen.
+    // Removes it from the screen.
     void orderOut();
 
 private:

@@ -17,7 +17,7 @@ class AlertWidget final : public Overlay
 public:
     AlertWidget(QWidget* parent, std::function<void()> dismiss);
 
-    // Null for none.
+    // Shows that alert; null hides it.
     void sync(const AlertView* alert);
     [[nodiscard]] FlatButton& button() const { return *_button; }
 

@@ -17,7 +17,7 @@ constexpr std::chrono::milliseconds kFrame{33};
 constexpr double kTurnMs = 1000;
 constexpr double kDegree = 16; // in Qt's unit of angles
 
-// One for all: an indicator that takes another's place goes on where that one was.
+// All indicators share one clock, so that a new one continues where the one before was.
 double angleNow()
 {
     static const QElapsedTimer clock = [] {

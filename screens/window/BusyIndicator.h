@@ -6,7 +6,7 @@
 namespace orvane
 {
 
-// An arc that turns while it is set to.
+// An arc that turns while the program is busy.
 class BusyIndicator final : public QWidget
 {
 public:

@@ -120,7 +120,7 @@ QPalette DesktopColours::paletteFor(Scheme scheme, const QPalette& desktop)
 
 void DesktopColours::apply(Scheme scheme)
 {
-    // Without one of our own, it is Qt's for this desktop.
+    // An empty palette gives Qt's own for this desktop.
     QApplication::setPalette(QPalette());
     QApplication::setPalette(paletteFor(scheme, QApplication::palette()));
 }

@@ -9,8 +9,8 @@ class QDBusVariant;
 namespace orvane
 {
 
-// Lets the palette follow the desktop's wish for light or dark, which it tells on the session bus,
-// where Qt itself has not heard of it. Without a bus, or a wish, the palette is Qt's.
+// Makes the palette light or dark as the desktop asks for on the session bus, for desktops whose
+// setting Qt does not read itself. Without a bus or a setting, the palette is Qt's.
 class DesktopColours final : public QObject
 {
     Q_OBJECT
@@ -21,7 +21,7 @@ public:
     DesktopColours();
 
     static void apply(Scheme scheme);
-    // What the program needs of its own where the desktop's palette is that one.
+    // The program's own palette if `desktop` does not fit the scheme, else an empty one.
     [[nodiscard]] static QPalette paletteFor(Scheme scheme, const QPalette& desktop);
 
 private slots:

@@ -29,8 +29,8 @@ Qt::Alignment alignmentOf(const Label& label)
     return Qt::AlignLeft;
 }
 
-// Values that hang at the right edge are measured with a little slack: their figures line up only
-// if they are drawn flush with that edge.
+// Values at the right edge are measured a little too wide. Their digits line up only if they are
+// drawn flush with that edge.
 bool hangsAtRightEdge(const DrawnLabel& label, const DrawnStrip& strip)
 {
     constexpr double kSamePlace = 0.01;
@@ -66,7 +66,7 @@ DrawnStrip stripOf(const ScrollView& view, const QPointF& origin)
     return strip;
 }
 
-// Small letters say more than an ellipsis.
+// Makes the letters smaller, then uses two lines, before the text is cut.
 void fit(DrawnLabel& label)
 {
     constexpr int kSmallest = 12;

@@ -11,14 +11,14 @@
 namespace orvane
 {
 
-// A label as a row draws it, in the row's coordinates or in those of the strip that it is in.
+// A label as a row draws it, in the coordinates of the row or of the strip that holds it.
 struct DrawnLabel {
     QRectF frame;
     QString text;
     QFont font;
     Qt::Alignment alignment;
     bool isWrapped = false;           // between its words, into two lines
-    [[nodiscard]] bool isCut() const; // for want of room
+    [[nodiscard]] bool isCut() const; // whether it is too long for its frame
     friend bool operator==(const DrawnLabel&, const DrawnLabel&) = default;
 };
 
@@ -30,7 +30,7 @@ struct DrawnStrip {
     friend bool operator==(const DrawnStrip&, const DrawnStrip&) = default;
 };
 
-// What a row shows: a copy of its cell, so that the next one can be compared with it.
+// The contents of a row: a copy of its cell, to be compared with the next one.
 struct DrawnRow {
     std::vector<DrawnLabel> labels;
     std::vector<DrawnStrip> strips;
@@ -40,11 +40,12 @@ struct DrawnRow {
     // Lays the cell out first.
     static DrawnRow of(TableViewCell& cell);
 
-    // The first text: what tells one row from another.
+    // The first text, which identifies the row.
     [[nodiscard]] QString key() const;
     // All texts, as a screen reader speaks them: "KEY, VALUE".
     [[nodiscard]] QString spokenText() const;
-    // What is not to be read in full, whatever is scrolled; empty for nothing.
+    // The first label that is cut; empty if none is. Labels in strips can be scrolled and do not
+    // count.
     [[nodiscard]] QString cutText() const;
     // How far the row can be scrolled sideways.
     [[nodiscard]] double sidewaysRange() const;

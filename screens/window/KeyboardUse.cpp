@@ -12,7 +12,7 @@ bool KeyboardUse::eventFilter(QObject*, QEvent* event)
 {
     switch (event->type()) {
     case QEvent::KeyPress:
-    case QEvent::ShortcutOverride: // all that comes of a shortcut's key
+    case QEvent::ShortcutOverride: // the only event for the key of a shortcut
         _isUnderWay = true;
         break;
     case QEvent::MouseButtonPress:

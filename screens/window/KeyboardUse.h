@@ -5,7 +5,8 @@
 namespace orvane
 {
 
-// Whether the user works with the keyboard: the last input was a key, not a touch or the mouse.
+// Tells whether the user works with the keyboard: whether the last input was a key, not a touch or
+// the mouse.
 class KeyboardUse final : public QObject
 {
 public:

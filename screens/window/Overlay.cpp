@@ -33,9 +33,9 @@ void Overlay::placeCard()
 
 bool Overlay::focusNextPrevChild(bool isNext)
 {
-    // Round and round within the card.
+    // Tab stays within the card.
     if (QWidget* next = partAfter(focusWidget() ? focusWidget() : _card, isNext)) {
-        next->clearFocus(); // it may be the only one; it is told how it was reached
+        next->clearFocus(); // it may be the only part: the reason must reach it all the same
         next->setFocus(isNext ? Qt::TabFocusReason : Qt::BacktabFocusReason);
     }
     return true;
@@ -83,8 +83,7 @@ void Overlay::paintEvent(QPaintEvent*)
 
 void Overlay::mousePressEvent(QMouseEvent* event)
 {
-    // What a press on an empty part of the card leaves over comes here as well.
-    // The way back is the window's.
+    // Presses on an empty part of the card arrive here too. The window handles the back button.
     event->setAccepted(event->button() != Qt::BackButton);
     if (event->button() == Qt::LeftButton)
         pressBackground();

@@ -7,21 +7,21 @@
 namespace orvane
 {
 
-// A card over a window whose other parts are shaded and out of reach, by touch and by keyboard,
-// while it is shown. Fills its parent.
+// A card in front of the window. While it is shown, the rest of the window is shaded and cannot be
+// reached by touch or keyboard. Fills its parent.
 class Overlay : public QWidget
 {
 public:
     explicit Overlay(QWidget* parent);
 
-    // Gives the keyboard to the card's text field, else to the first part that takes it; with a
-    // focus ring where the user works with the keyboard.
+    // Gives the keyboard to the card's text field, or to the first part that takes it. Shows a
+    // focus ring if the user works with the keyboard.
     void takeKeyboard();
 
 protected:
-    // The card's place within the given size.
+    // The rectangle of the card in an overlay of that size.
     [[nodiscard]] virtual QRect cardPlace(const QSize& size) const = 0;
-    // A press beside the card, or on what is empty of it.
+    // A press beside the card, or on an empty part of it.
     virtual void pressBackground() {}
 
     [[nodiscard]] QWidget& card() const { return *_card; }

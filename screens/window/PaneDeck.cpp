@@ -17,7 +17,7 @@ namespace
 {
 
 constexpr int kSlideMs = 250;
-constexpr double kParallax = 0.3; // the way of the pane beneath, as a part of the width
+constexpr double kParallax = 0.3; // how far the lower pane moves, as a part of the width
 
 } // namespace
 
@@ -40,7 +40,7 @@ void PaneDeck::sync(NavigationController* navigation)
     Panes panes = panesOf(navigation);
     PaneWidget* const before = std::exchange(_top, panes.empty() ? nullptr : panes.back().get());
     std::swap(_panes, panes);
-    // What remains in `panes` has left the stack.
+    // The panes that remain in `panes` have left the stack.
     if (before != _top) {
         const double from = _isSwipe ? _progress : 0;
         endSlide();
@@ -156,7 +156,7 @@ void PaneDeck::endSlide()
     _under = nullptr;
     if (_leaving) {
         _leaving->hide();
-        // It may be what this was called from.
+        // The call may come from this pane.
         _leaving.release()->deleteLater();
     }
     for (const auto& pane : _panes)

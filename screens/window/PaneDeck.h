@@ -14,8 +14,8 @@
 namespace orvane
 {
 
-// The panes of a navigation stack, of which the top one is seen. A pane that is pushed slides over
-// the one before, one that is popped slides away, with the finger where that began it.
+// The panes of a navigation stack. The top one is shown. A pushed pane slides over the one before;
+// a popped pane slides away, following the finger if a swipe began it.
 class PaneDeck final : public QWidget
 {
 public:
@@ -42,7 +42,7 @@ private:
     [[nodiscard]] PaneWidget* paneBelowTop() const;
     EdgeSwipe edgeSwipe();
 
-    // Where a slide is, 0 with `_over` in place and 1 with it gone to the right.
+    // The progress of a slide is 0 while `_over` is in place and 1 once it has left to the right.
     void startSlide(PaneWidget* over, PaneWidget* under, double from, double to, bool isAnimated);
     void showSliding(PaneWidget* over, PaneWidget* under);
     void showSlide(double progress);
@@ -51,13 +51,13 @@ private:
     QString _waitingHint;
     bool _isAnimated;
     std::function<void()> _pop;
-    Panes _panes;                         // those that have been seen, from the root upwards
+    Panes _panes;                         // panes shown so far, from the root upwards
     std::unique_ptr<PaneWidget> _leaving; // popped, and still sliding away
     PaneWidget* _top = nullptr;
     PaneWidget* _over = nullptr; // while something slides
     PaneWidget* _under = nullptr;
     double _progress = 0;
-    bool _isSwipe = false; // by a finger, or let go by it on its way back
+    bool _isSwipe = false; // a finger moves the pane, or has let it go
     QVariantAnimation _animation;
 };
 

@@ -13,14 +13,14 @@ namespace orvane
 class EmptyView;
 class TableWidget;
 
-// One view controller of the navigation stack: its table, or a word where that has no rows.
+// One view controller of the navigation stack: its table, or an EmptyView if that has no rows.
 class PaneWidget final : public QWidget
 {
 public:
     PaneWidget(QWidget* parent, const std::shared_ptr<ViewController>& controller,
                const QString& waitingHint, EdgeSwipe swipe);
 
-    // Null once the controller is no more.
+    // Null once the controller was destroyed.
     [[nodiscard]] std::shared_ptr<ViewController> controller() const { return _controller.lock(); }
     void sync();
 

@@ -70,7 +70,7 @@ QtScreen::QtScreen(Settings settings)
 
 QtScreen::~QtScreen()
 {
-    // Its widgets are the interface's own.
+    // The sheet must not destroy widgets that belong to an interface.
     _frame->sheet().sync(nullptr);
 }
 
@@ -97,7 +97,7 @@ std::unique_ptr<Interface> QtScreen::loadInterface(const std::string& name)
 
 void QtScreen::setNeedsUpdate()
 {
-    // What an update itself brings about, such as cells for rows, it draws itself.
+    // Changes made during an update, such as new cells, are drawn by that update.
     if (_isUpdating || std::exchange(_isUpdateQueued, true))
         return;
     QMetaObject::invokeMethod(

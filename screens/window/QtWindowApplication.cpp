@@ -16,15 +16,14 @@ namespace orvane
 namespace
 {
 
-// What Qt has to say is for those who read the log; the programs' standard error is for their
-// users.
+// Messages of Qt go to the log. Standard error is for messages to the user.
 void logMessage(QtMsgType type, const QMessageLogContext&, const QString& text)
 {
     logLine(type == QtCriticalMsg || type == QtFatalMsg ? LogPriority::Error : LogPriority::Info,
             "Qt: %s\n", qPrintable(text));
     if (type != QtFatalMsg)
         return;
-    // Qt would abort, as where there is no display.
+    // Qt would abort, for example if there is no display.
     std::fputs(
         "orvane: the window cannot be opened: try --ui terminal, or --log stderr to see why\n",
         stderr);

@@ -15,7 +15,7 @@ namespace orvane
 namespace
 {
 
-constexpr double kFade = 24; // points over which a text that goes on runs out
+constexpr double kFade = 24; // width of the fade at the edge of a text that goes on
 
 void drawLabels(QPainter& painter, const std::vector<DrawnLabel>& labels)
 {
@@ -29,7 +29,7 @@ void drawLabels(QPainter& painter, const std::vector<DrawnLabel>& labels)
     }
 }
 
-// Hides what is under the rectangle more and more towards its end, to the right or to the left.
+// Fades the rectangle into the background, towards its right or left end.
 void fade(QPainter& painter, const QRectF& rect, const QColor& background, bool isToTheRight)
 {
     QColor clear = background;

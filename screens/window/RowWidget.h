@@ -9,8 +9,8 @@
 namespace orvane
 {
 
-// One visible row of a table. It draws what its cell shows and keeps nothing else: presses, the
-// keyboard and scrolling are the table's. Set to what it shows already, it does nothing.
+// One visible row of a table. It only draws: the table handles presses, keys and scrolling. Setting
+// a value that it has already does nothing.
 class RowWidget final : public QWidget
 {
 public:
@@ -21,7 +21,7 @@ public:
 
     [[nodiscard]] const DrawnRow& content() const { return _content; }
     void setContent(DrawnRow content);
-    // How far its strips are scrolled.
+    // How far its strips are scrolled, in points.
     [[nodiscard]] double sideways() const { return _sideways; }
     void setSideways(double offset);
 

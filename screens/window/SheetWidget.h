@@ -7,14 +7,14 @@ namespace orvane
 
 class UiInterface;
 
-// The sheet over the panes on which an interface stands: over the whole width of a phone, a card in
-// the middle of a larger window.
+// Shows an interface in front of the panes: over the whole width on a phone, as a card in the
+// middle of a larger window.
 class SheetWidget final : public Overlay
 {
 public:
     explicit SheetWidget(QWidget* parent);
 
-    // Null for none. Not owned; shown until another call.
+    // Shows that interface until the next call; null hides the sheet. The interface is not owned.
     void sync(UiInterface* interface);
     [[nodiscard]] UiInterface* interface() const { return _interface; }
 

@@ -21,13 +21,13 @@ namespace
 constexpr double kEdge = 20;         // points from the left in which a swipe begins
 constexpr double kTapReach = 12;     // points that a finger may stray and still press
 constexpr double kDragStart = 0.002; // metres
-// A pan does not flash the rows that it begins on.
+// Longer than it takes to recognise a pan, so that the row under it does not flash.
 constexpr std::chrono::milliseconds kShowAfter{70};
 
 void setUpScroller(QScroller& scroller)
 {
     QScrollerProperties properties = scroller.scrollerProperties();
-    // Up and down, or sideways, never both.
+    // Either up and down or sideways, never both.
     properties.setScrollMetric(QScrollerProperties::AxisLockThreshold, 1.0);
     properties.setScrollMetric(QScrollerProperties::DragStartDistance, kDragStart);
     for (const auto policy : {QScrollerProperties::HorizontalOvershootPolicy,
@@ -108,7 +108,7 @@ void TableTouch::takeTouch(QTouchEvent& event)
 {
     if (event.pointCount() == 0)
         return;
-    // Further fingers are left out.
+    // Other fingers are ignored.
     const QEventPoint& first = event.point(0);
     const Finger finger{first.position(), first.globalPosition(), timeOf(event)};
     if (event.type() == QEvent::TouchBegin)
@@ -122,7 +122,7 @@ void TableTouch::takeTouch(QTouchEvent& event)
 void TableTouch::begin(const Finger& finger)
 {
     QScroller* scroller = QScroller::scroller(&_widget);
-    // A finger that stops a table in motion presses nothing.
+    // A touch that stops a moving table does not press a row.
     const bool wasInMotion = scroller->state() == QScroller::Scrolling;
     _isDown = true;
     _start = finger;

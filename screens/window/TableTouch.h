@@ -17,13 +17,13 @@ class QWidget;
 namespace orvane
 {
 
-// What one finger, or the left mouse button, does on a table: a press of a row; a pan along one
-// axis, with momentum; a swipe from the left edge.
+// Handles one finger, or the left mouse button, on a table: the press of a row, a pan along one
+// axis with momentum, and a swipe from the left edge.
 class TableTouch
 {
 public:
-    // What it asks of the table. Positions are in the widget's coordinates; what is scrolled
-    // sideways is the row that the pan began on.
+    // The table as this class uses it. Positions are in the coordinates of the widget. Sideways,
+    // the row is scrolled on which the pan began.
     class Table
     {
     public:
@@ -33,7 +33,7 @@ public:
         [[nodiscard]] virtual QPointF scrollRange(std::optional<std::size_t> row) const = 0;
         [[nodiscard]] virtual QPointF scrollPosition(std::optional<std::size_t> row) const = 0;
         virtual void scrollTo(std::optional<std::size_t> row, const QPointF& position) = 0;
-        // The row that is drawn as pressed is another one.
+        // pressedRow() has changed.
         virtual void showPress() = 0;
         // May destroy the table.
         virtual void pressRow(std::size_t row) = 0;
@@ -46,14 +46,14 @@ public:
 
     void setEdgeSwipe(EdgeSwipe swipe) { _edgeSwipe = std::move(swipe); }
 
-    // Whether the event was one of its own; then nothing else may take it.
+    // Handles the event. True if it was handled; then nothing else may handle it.
     bool takeEvent(QEvent& event);
-    // Rows were reloaded: a press of a row that is no longer there is over.
+    // Rows were reloaded. Drops the press of a row that no longer exists.
     void rowsChanged();
-    // Ends momentum, as before the table is scrolled by other means.
+    // Stops momentum. To be called before the table is scrolled in another way.
     void stop();
 
-    // The row to be drawn as pressed.
+    // The row to be drawn as pressed; nullopt for none.
     [[nodiscard]] std::optional<std::size_t> pressedRow() const;
 
 private:
@@ -63,10 +63,10 @@ private:
     };
     enum class Swipe { None, Possible, UnderWay };
 
-    // Where the finger or the mouse is, and when, in milliseconds.
+    // A position of the finger or the mouse, and its time in milliseconds.
     struct Finger {
         QPointF position; // in the widget's coordinates
-        QPointF onScreen; // there a swipe is measured: it moves the widget
+        QPointF onScreen; // for swipes, which move the widget itself
         qint64 time;
     };
 

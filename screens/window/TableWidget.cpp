@@ -156,7 +156,7 @@ void TableWidget::updateMarks()
     const auto selected = table ? table->selectedRow() : std::nullopt;
     const auto pressed = _touch.pressedRow();
     for (const auto& [row, widget] : _rows) {
-        // A row that leads nowhere is not left marked.
+        // A row that opens nothing does not stay marked.
         const bool leadsOn = widget->content().accessory == CellAccessory::DisclosureIndicator;
         widget->setPressed(pressed == row || (selected == row && leadsOn));
         widget->setRing(_isKeyboardUsed && hasFocus() && row == _currentRow);
@@ -237,7 +237,7 @@ void TableWidget::keyPressEvent(QKeyEvent* event)
     case Qt::Key_Up:
         return moveTo(_currentRow - std::min<std::size_t>(1, _currentRow));
     case Qt::Key_Down:
-        // The first key only shows where the keyboard is.
+        // The first press only shows which row has the keyboard.
         return moveTo(_isKeyboardUsed ? _currentRow + 1 : _currentRow);
     case Qt::Key_PageUp:
         return moveTo(_currentRow - std::min(page, _currentRow));

@@ -17,34 +17,34 @@ class QScrollBar;
 namespace orvane
 {
 
-// A table on the screen: widgets for the rows that are visible, taken for others as it scrolls.
+// A table on the screen. It has widgets for the visible rows, which are reused while it scrolls.
 //
-// What the user has of it stays through every reload: how far it is scrolled, up and sideways,
-// which row the keyboard is on, and a press under way as long as the same row is beneath it.
+// A reload keeps how far it is scrolled in both directions, which row has the keyboard, and a press
+// under way as long as the same row is under the finger.
 class TableWidget final : public QWidget, private TableTouch::Table
 {
 public:
     explicit TableWidget(QWidget* parent = nullptr);
     ~TableWidget() override;
 
-    // Shows that table from the next sync() on, as long as it lives.
+    // Shows that table from the next sync() on, for as long as the table exists.
     void setTable(const std::shared_ptr<TableView>& table) { _table = table; }
-    // Shows what the table holds now; touches only what has changed.
+    // Shows the current contents of the table. Changes only what differs.
     void sync();
 
     void setEdgeSwipe(EdgeSwipe swipe) { _touch.setEdgeSwipe(std::move(swipe)); }
 
-    // As high as all its rows.
+    // As high as all rows together.
     [[nodiscard]] QSize sizeHint() const override;
 
-    // The widget of a visible row, else null.
+    // The widget of a visible row; null for any other row.
     [[nodiscard]] RowWidget* rowWidget(std::size_t row) const;
     [[nodiscard]] std::size_t rowCount() const;
-    // The row that the keyboard is on.
+    // The row that has the keyboard.
     [[nodiscard]] std::size_t currentRow() const { return _currentRow; }
     // In points.
     [[nodiscard]] QScrollBar& scrollBar() const { return *_bar; }
-    // Does what a press on the row does.
+    // Does the same as a press on the row.
     void pressRow(std::size_t row) override;
 
 protected:

@@ -44,7 +44,7 @@ bool TextFieldBinding::eventFilter(QObject*, QEvent* event)
     const bool isIn = event->type() == QEvent::FocusIn;
     if (!field || (!isIn && event->type() != QEvent::FocusOut))
         return false;
-    // Another window in front leaves the keyboard with the field in this one.
+    // When another window comes to the front, the field keeps the keyboard of this one.
     if (static_cast<QFocusEvent*>(event)->reason() == Qt::ActiveWindowFocusReason)
         return false;
     _hadKeyboard = isIn;

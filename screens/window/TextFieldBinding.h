@@ -11,8 +11,8 @@ class QLineEdit;
 namespace orvane
 {
 
-// A text field and the widget in which the user edits it. Only what differs is set, so that typing,
-// with an input method as well, is never disturbed.
+// Connects a text field with the widget in which the user edits it. Only differences are set, so
+// that typing is never disturbed, also with an input method.
 class TextFieldBinding final : public QObject
 {
 public:

@@ -5,8 +5,8 @@
 namespace orvane
 {
 
-// One line of text, cut with an ellipsis where there is no room for it. Set to what it shows
-// already, it does nothing.
+// One line of plain text, cut with an ellipsis if there is not enough room. Setting the text that
+// it shows already does nothing.
 class TextLine final : public QWidget
 {
 public:
@@ -16,7 +16,7 @@ public:
     void setText(const QString& text);
     void setLineFont(const QFont& font);
     void setAlignment(Qt::Alignment alignment) { _alignment = alignment; }
-    // In the theme's quieter colour.
+    // Uses the theme's colour for less important texts.
     void setQuiet(bool isQuiet) { _isQuiet = isQuiet; }
 
     [[nodiscard]] QSize sizeHint() const override;

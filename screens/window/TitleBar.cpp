@@ -56,8 +56,8 @@ void TitleBar::resizeEvent(QResizeEvent*) { placeParts(); }
 
 void TitleBar::placeParts()
 {
-    // In the middle of the bar where that leaves room for the way back, else beside it. A long
-    // title has precedence over a long way back.
+    // The title is in the middle of the bar if that leaves room for the back button, else beside
+    // the button. A long title has precedence over a long button.
     const int titleWidth = _title->sizeHint().width();
     const int room = std::max(FlatButton::kSize, width() - titleWidth - 2 * kMargin);
     const int backWidth =

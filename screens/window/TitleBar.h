@@ -10,14 +10,14 @@ namespace orvane
 class FlatButton;
 class TextLine;
 
-// The bar above a pane: its title, the way back, and under the title a mark where what is shown is
-// simulated.
+// The bar above a pane: its title, a button that goes back and, for simulated data, a mark under
+// the title.
 class TitleBar final : public QWidget
 {
 public:
     TitleBar(QWidget* parent, const QString& mark, std::function<void()> goBack);
 
-    // Without a way back, `backTitle` is empty and `canGoBack` false.
+    // At the root, `backTitle` is empty and `canGoBack` false.
     void show(const QString& title, bool canGoBack, const QString& backTitle);
 
     [[nodiscard]] FlatButton& backButton() const { return *_back; }

@@ -12,8 +12,8 @@ class QHBoxLayout;
 namespace orvane
 {
 
-// The bar below a pane. The toolkit makes its items anew at every change; their widgets stay as
-// long as the items are of the same kinds.
+// The bar below a pane. The toolkit makes new items at every change. Their widgets are kept as long
+// as the kinds of the items stay the same.
 class ToolbarWidget final : public QWidget
 {
 public:
@@ -21,7 +21,7 @@ public:
     ToolbarWidget(QWidget* parent, std::function<void(std::size_t)> press);
 
     void sync(const ViewController::ToolbarItems& items);
-    // The widget of an item, else null; a flexible space has none.
+    // The widget of an item; null for a flexible space and for an index without an item.
     [[nodiscard]] QWidget* itemWidget(std::size_t index) const;
 
 protected:

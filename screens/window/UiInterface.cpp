@@ -18,9 +18,9 @@ namespace orvane
 namespace
 {
 
-constexpr double kTextSize = 15; // of what the file gives no other
+constexpr double kTextSize = 15; // for widgets whose size the file does not set
 
-// Knows the widgets of this layer by the names that interface files call them.
+// Makes the widgets of this layer by the names that interface files use.
 class Loader final : public QUiLoader
 {
 public:

@@ -14,29 +14,30 @@
 namespace orvane
 {
 
-// A screen that an interface file describes: the file's widgets, and a toolkit view for each table,
-// text field and button among them, and for the whole. What the user does to a widget its view
-// hears of; what is done to a view its widget shows after sync().
+// A screen made from an interface file: the widgets of the file, and a toolkit view for each table,
+// text field and button among them and for the whole. The views get the user's input; the widgets
+// show changes of the views after sync().
 class UiInterface
 {
 public:
-    // Reads the resource NAME.ui. Null, with an error line, where it is missing or no interface.
+    // Loads the resource NAME.ui. If it is missing or not an interface, logs an error and returns
+    // null.
     static std::unique_ptr<UiInterface> load(const std::string& name);
     ~UiInterface();
     UiInterface(const UiInterface&) = delete;
     UiInterface& operator=(const UiInterface&) = delete;
 
-    // The toolkit's side, once: the root view, and outlets by the widgets' names. This lives as
-    // long as anybody has the root view.
+    // The views for the toolkit: the root view, and outlets named after the widgets. To be called
+    // once. This object is needed for as long as the root view exists.
     [[nodiscard]] std::unique_ptr<Interface> takeInterface();
     [[nodiscard]] bool isAlive() const { return !_view.expired(); }
     [[nodiscard]] bool isOf(const View* view) const { return view && _view.lock().get() == view; }
 
     [[nodiscard]] QWidget& widget() const { return *_widget; }
     void sync();
-    // The user has pressed where there is nothing.
+    // The user has pressed an empty place.
     void pressBackground() const;
-    // Does what a press on the button of that name does. Nothing where there is none.
+    // Presses the button of that name. Does nothing if there is none.
     void pressButton(const char* name) const;
 
 private:

@@ -168,7 +168,7 @@ void WindowFrame::pressToolbarItem(std::size_t index)
 
 void WindowFrame::closeEvent(QCloseEvent* event)
 {
-    // The program ends, and takes its window off the screen in its own order.
+    // The program ends and closes its window itself.
     event->ignore();
     if (_settings.onClose)
         _settings.onClose();

@@ -18,8 +18,8 @@ class TitleBar;
 class ToolbarWidget;
 class UiInterface;
 
-// The window: the title bar, the panes, the toolbar and, where a recording is played, its controls;
-// over them the sheet and the alert.
+// The window: the title bar, the panes, the controls of a recording if there is one, and the
+// toolbar. The sheet and the alert are in front of them.
 class WindowFrame final : public QWidget
 {
 public:
@@ -34,11 +34,11 @@ public:
     WindowFrame(Screen& screen, Settings settings);
     ~WindowFrame() override;
 
-    // Shows what the toolkit's objects hold now; touches only what has changed. `findInterface`
-    // gives the interface of a modal screen's view, or null.
+    // Shows the current contents of the toolkit's objects. Changes only what differs.
+    // `findInterface` returns the interface of a modal screen's view, or null.
     void sync(const std::function<UiInterface*(const View*)>& findInterface);
 
-    // One step back: from the alert, from the sheet or from the top pane.
+    // Goes one step back: closes the alert, the sheet or the top pane.
     void goBack();
     void pressSave();
 

@@ -12,23 +12,22 @@
 namespace orvane
 {
 
-// How a display value reads as groups and rows, for whatever walks over one. Holding the array lock
-// is the caller's business.
+// How a display value is read as groups and rows. The caller holds the array lock.
 
-// A dictionary or an array; anything else is a row.
+// Whether the value is a group: a dictionary or an array. Any other value is a row.
 inline bool isDisplayGroup(const PropertyValue& value)
 {
     return value.asDictionary() || value.asArray();
 }
 
-// The text that a row shows: "(unknown)" for what is no text.
+// The text that a row shows: "(unknown)" if the value is not a text.
 std::string displayText(const PropertyValue& row);
 
 // Under a key "_sorted" the keys are shown in the order of their characters, not of numbers: "10;Y"
 // before "2;X".
 inline constexpr const char* kSortedKey = "_sorted";
-// What such a key is shown as: "01;Serving Cell" as "Serving Cell"; one of any other number of
-// parts is kept whole.
+// The name that is shown for such a key: "Serving Cell" for "01;Serving Cell". A key with any other
+// number of parts is shown whole.
 std::string_view nameOfSortedKey(std::string_view key);
 
 // A name as it is shown: cut after this many bytes, at the end of a character.
