@@ -63,7 +63,7 @@ PropertyValue valueOf(const QDBusArgument& argument, int depth)
     case QDBusArgument::VariantType:
         return valueOf(argument.asVariant(), depth + 1);
     default:
-        // What is not read would be met again.
+        // Read all the same: the argument would otherwise stay where it is.
         (void)argument.asVariant();
         return {};
     }

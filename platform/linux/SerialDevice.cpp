@@ -122,7 +122,7 @@ public:
         _writeWatcher.reset();
         if (!_descriptor)
             return;
-        // What the device has not taken by now would else keep the closing waiting.
+        // Otherwise close() may wait for the device to take what is left.
         ::tcflush(_descriptor.get(), TCOFLUSH);
         ::ioctl(_descriptor.get(), TIOCNXCL);
         _descriptor.reset();

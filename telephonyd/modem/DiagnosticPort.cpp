@@ -190,7 +190,7 @@ void DiagnosticPort::setMask(std::uint32_t group, const std::set<std::uint32_t>&
     ask(DiagnosticRequest::setMask(group, count, places),
         [this, group, count](const DiagnosticAnswer& answer) {
             if (answer.kind == DiagnosticAnswer::Kind::Done)
-                _counts[group] = count;
+                _acceptedCounts[group] = count;
             else
                 _events.refused(refusedCodes(group));
         });
@@ -219,8 +219,8 @@ std::uint32_t DiagnosticPort::codesInGroup(std::uint32_t group,
     if (_ranges)
         return std::min((*_ranges)[group], kMostCodesInGroup);
     // A shorter mask than before might leave the codes beyond it on.
-    const auto accepted = _counts.find(group);
-    const std::uint32_t before = accepted == _counts.end() ? 1 : accepted->second;
+    const auto accepted = _acceptedCounts.find(group);
+    const std::uint32_t before = accepted == _acceptedCounts.end() ? 1 : accepted->second;
     return places.empty() ? before : std::max(before, *places.rbegin() + 1);
 }
 

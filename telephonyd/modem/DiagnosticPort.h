@@ -109,9 +109,9 @@ private:
     std::uint64_t _sent = 0; // tells the time-out of a request from those before
     std::optional<LogRanges> _ranges;
     LogCodes _wanted;
-    Groups _asked;                                  // what the modem was last asked for
-    std::map<std::uint32_t, std::uint32_t> _counts; // codes of a group as last accepted, if unknown
-    bool _mayBeOn = false;                          // a mask was sent since all was switched off
+    Groups _asked;                                          // what the modem was last asked for
+    std::map<std::uint32_t, std::uint32_t> _acceptedCounts; // of codes, by group
+    bool _mayBeOn = false; // a mask was sent since all was switched off
     bool _isSettled = false;
     std::function<void()> _finish;
     Counts _totals;

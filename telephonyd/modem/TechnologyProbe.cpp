@@ -55,7 +55,7 @@ void TechnologyProbe::settled()
 
 bool TechnologyProbe::isShownBy(std::uint16_t code) const
 {
-    // An item that comes before the codes are switched on is of somebody else's asking.
+    // An item that comes before the codes are switched on is of an earlier program.
     return _isWatching && _candidates[_current].codes.contains(code);
 }
 
