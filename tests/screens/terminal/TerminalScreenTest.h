@@ -69,10 +69,7 @@ protected:
     {
         PathDictionary paths;
         const NodePointer tree = OrvaneModelNode::makeTreeFromObject(dictionary(rows), paths);
-        reloadPanes(*navigation, tree, [&](const std::string& path) -> NodePointer {
-            const auto found = paths.find(path);
-            return found == paths.end() ? nullptr : found->second;
-        });
+        reloadPanes(*navigation, tree, [&](const std::string& path) { return paths.at(path); });
         if (OrvanePaneController* pane = topPane(*navigation))
             pane->setStatus("Updated now", false);
         queue.runPending();
