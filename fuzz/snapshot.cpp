@@ -39,7 +39,7 @@ void play(const std::shared_ptr<ByteSource>& log)
     const auto technology = technologyOfLog(bytes);
     if (!technology)
         return;
-    SeekableLog timeline(log, *technology);
+    SeekableLog timeline(log, "fuzzed.dlf", *technology);
     while (timeline.readSlice()) {
     }
     const PropertyValue atEnd = timeline.display().deepCopy();
