@@ -7,8 +7,8 @@
 build_packages=(g++ cmake ninja-build libexpat1-dev libncurses-dev qt6-base-dev qt6-tools-dev
     libqt6opengl6-dev)
 # shellcheck disable=SC2034
-check_packages=(clang libclang-rt-dev llvm clang-format libgtest-dev libgmock-dev libbenchmark-dev
-    libvterm-dev python3 python3-dbusmock modemmanager dbus-daemon libglib2.0-bin)
+check_packages=(clang libclang-rt-dev lld llvm clang-format libgtest-dev libgmock-dev
+    libbenchmark-dev libvterm-dev python3 python3-dbusmock modemmanager dbus-daemon libglib2.0-bin)
 
 say() { printf '%s\n' "$*" >&2; }
 
@@ -18,6 +18,7 @@ command_of() {
     g++) echo c++ ;;
     ninja-build) echo ninja ;;
     clang) echo clang++ ;;
+    lld) echo ld.lld ;;
     llvm) echo llvm-symbolizer ;;
     cmake | clang-format | clang-tidy | gcovr) echo "$1" ;;
     esac
@@ -36,6 +37,7 @@ purpose_of() {
     libqt6opengl6-dev) echo "Qt OpenGL's CMake package, which that of Qt UI Tools asks for" ;;
     clang) echo "clang 14 or newer" ;;
     libclang-rt-dev) echo "clang's sanitizers and libFuzzer" ;;
+    lld) echo "lld, which links faster than the compiler's own linker" ;;
     llvm) echo "llvm-symbolizer, for readable sanitizer reports" ;;
     clang-format) echo "clang-format 14 (other versions format differently)" ;;
     clang-tidy) echo "clang-tidy 14" ;;
