@@ -13,8 +13,8 @@ namespace
 
 constexpr std::size_t kHistoryLimit = 5;
 
-// Stops at the first value that the state lacks: a state without "DisplayState" gives an empty
-// entry, one without "Display" only the "DisplayState". This is meant.
+// Deliberate: stops at the first value that the state lacks. A state without "DisplayState" gives
+// an empty entry, one without "Display" only the "DisplayState".
 PropertyValue historyEntry(const PropertyDictionary& state)
 {
     PropertyValue entry = PropertyValue::newDictionary();

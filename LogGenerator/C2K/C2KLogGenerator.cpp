@@ -68,7 +68,7 @@ void C2KLogGenerator::updateFromLog(ByteView packet, const PropertyValue& usingL
     if (packet.size() < kLogHeaderBytes)
         return;
     const ByteView message = unwrappedMessage(packet);
-    // Goes on all the same, whatever the line says. This is meant.
+    // Deliberate: the message is decoded all the same, whatever the line says.
     if (message[0] != kModemItem)
         logError("Invalid log type: %x. Dropping.", message[0]);
     const std::span<const C2KDecoder> decoders = c2kDecoders();

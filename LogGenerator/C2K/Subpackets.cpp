@@ -20,7 +20,7 @@ std::optional<PacketView> findSubpacket(PacketView packet, std::uint8_t identifi
     for (unsigned i = 0; i < count && packet.holds(start, kSubpacketHeaderBytes); ++i) {
         const PacketView subpacket = packet.from(start);
         const auto size = subpacket.unsignedAt(2, 2).value_or(0);
-        // Measured from the first subpacket, not from the packet's end. This is meant.
+        // Deliberate: measured from the first subpacket, not from the packet's end.
         if (start + size >= kFirstSubpacket + packet.size()) {
             logError("Log code error in subpkt#%d: bad size (%d).", static_cast<int>(i),
                      static_cast<int>(size));

@@ -6,8 +6,8 @@
 namespace orvane
 {
 
-// The packets of the sets that empty their list with every active set packet and never add a cell
-// to it. That their lists are always empty is meant.
+// The packets of the sets that empty their list with every active set packet. Deliberate: they
+// never add a cell to it.
 inline constexpr PacketLayout kAlwaysEmptySetPackets[] = {ownPacket(kUmtsActiveSetCode, 16)};
 
 } // namespace orvane

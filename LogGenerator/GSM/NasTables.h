@@ -5,8 +5,8 @@
 namespace orvane
 {
 
-// Names of non-access-stratum states; values that a table lacks show "Unknown". Spellings, and
-// the blanks inside texts, are meant.
+// Names of non-access-stratum states; values that a table lacks show "Unknown". Deliberate:
+// the spellings, and the blanks inside texts.
 
 inline constexpr ValueName kRegistrationStates[] = {
     {0, "REG_STATE_INACTIVE"        },

@@ -22,7 +22,7 @@ constexpr PacketLayout kPackets[] = {
     {kRegistrationCode, 16, kRegistrationFields},
 };
 
-// Logs as the circuit-switched section does. This is meant.
+// Deliberate: logs as the circuit-switched section does.
 constexpr SectionLayout kLayout = {"Process CO", "ProcessCS", UnknownCode::Report, kPackets};
 
 } // namespace

@@ -12,7 +12,7 @@ namespace
 constexpr Field kMmFields[] = {
     bytesField("MM State", 13, 1, named<kMmStates>),
     bytesField("MM Sub State", 14, 1, named<kMmSubStates>),
-    // Named a cause, although it is the update status. This is meant.
+    // Deliberate: named a cause, although it is the update status.
     bytesField("LU Reject Cause", 15, 1, named<kLocationUpdateStatuses>),
 };
 

@@ -9,8 +9,8 @@ namespace orvane
 namespace
 {
 
-// The rows carry the names of the circuit-switched ones, and the update status that of a cause.
-// Both are meant.
+// Deliberate: the rows carry the names of the circuit-switched ones, and the update status that of
+// a cause.
 constexpr Field kGmmFields[] = {
     bytesField("MM State", 13, 1, named<kGmmStates>),
     bytesField("MM Sub State", 14, 1, named<kGmmSubStates>),

@@ -7,7 +7,7 @@ namespace orvane
 {
 
 // The cell reselection ranking: a count of UMTS records, a count of GSM records, and the records.
-// Both sections read theirs from the same offset on. This is meant.
+// Deliberate: both sections read theirs from the same offset on.
 constexpr std::size_t kRankingMinimumBytes = 15;
 constexpr auto kUmtsRankingCount = countAt<13>;
 constexpr auto kGsmRankingCount = countAt<14>;
