@@ -7,16 +7,15 @@
 namespace orvane
 {
 
-// Where the reader of a log takes the bytes from: a file of any length, of which only a window need
-// be in memory.
+// The bytes of a log: a file of any length, of which only a window has to be in memory.
 class ByteSource
 {
 public:
     virtual ~ByteSource() = default;
-    // In bytes. Becomes less where bytes turn out not to be there any more, never more.
+    // In bytes. Becomes less if bytes turn out to be gone, never more.
     [[nodiscard]] virtual std::uint64_t size() const = 0;
-    // The bytes from `position` on: `count` of them or more, or all up to the end where there are
-    // fewer. They stay until the next call.
+    // The bytes from `position` on: `count` or more, or all up to the end if there are fewer. They
+    // stay valid until the next call.
     [[nodiscard]] virtual ByteView bytes(std::uint64_t position, std::size_t count) = 0;
 };
 

@@ -29,13 +29,13 @@ struct DlfItem {
 // so that its item follows the one before and counts as type 1, or the wrapper's 0x81, which leaves
 // two bytes.
 //
-// Bytes that are no item (damage, gaps, messages too short or of a bad type) are passed over one by
-// one and counted. An item is placed when
+// Other bytes (damage, gaps, messages too short or of a bad type) are skipped one by one and
+// counted. An item is placed when
 // - its length is 12 or more, it lies whole in the file and its code is not 0;
 // - right after it comes the file's end or, possibly behind a type byte or a wrapper, such an item:
-//   one look ahead is enough, for a chain that had to reach the file's end would lose every item
-//   before a damage. So the last item before foreign bytes or before an item cut short is not
-//   placed: it cannot be told from one that lost its own tail;
+//   one item of look-ahead is enough: requiring an unbroken chain to the end of the file would drop
+//   everything before a damaged spot. So the last item before foreign bytes, or before an item that
+//   was cut, is not placed: it might have lost its own tail;
 // - neither it nor the one after it swallows the start of a better item. In a long file nearly any
 //   two foreign bytes are a length that fits. Two items in a row with different timestamps within
 //   an hour of each other, and within a month of what was placed last, are no accident, though: the

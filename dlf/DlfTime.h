@@ -13,8 +13,9 @@ namespace orvane
 constexpr std::uint64_t kDlfStepsPerSecond = 800;
 constexpr std::uint64_t kDlfStepsPerDay = 24 * 3600 * kDlfStepsPerSecond;
 
-// Nothing before March 1980, the time of a clock that was never set: small numbers are common in
-// payloads. Nothing after 2150: the bytes of an erased block all look alike.
+// Plausible timestamps begin in March 1980: earlier ones are those of a clock that was never set,
+// and small numbers are common in payloads. They end in 2150: later ones are the bytes of erased
+// blocks.
 constexpr std::uint64_t kFirstTimelyTimestamp = std::uint64_t{1} << 48;
 constexpr std::uint64_t kFirstFutureTimestamp = std::uint64_t{0x400} << 48;
 

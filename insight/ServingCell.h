@@ -16,17 +16,17 @@ struct ServingCellGroup {
     std::span<const char* const> rows;
 };
 
-// Tells when the serving cell that a display shows becomes another one. A row that shows nothing
-// (any more) leaves the cell what it was.
+// Detects changes of the serving cell that a display shows. A row that shows nothing (any more)
+// changes nothing.
 class ServingCell
 {
 public:
-    // For displays of the generator of that technology constant; never another one for technologies
-    // whose displays have no such rows.
+    // For displays of the generator of that technology constant. There are never changes for
+    // technologies whose displays have no such rows.
     explicit ServingCell(std::string_view technology);
 
-    // Whether the display shows another cell than all that were noted before; the first cell is
-    // another one, too.
+    // Whether the display shows a cell other than the one noted last. The first cell counts as a
+    // change.
     bool note(const PropertyValue& display);
 
 private:

@@ -9,10 +9,10 @@ namespace orvane
 namespace
 {
 
-// However large they are, so many are kept.
+// So many are kept, however large they are.
 constexpr std::size_t kFewest = 8;
 
-// The last of those for which the test holds, it being true for those up to some place.
+// The last one for which the test holds. It must hold for all up to some place, and for none after.
 template <typename Test>
 const LogDecoder::Checkpoint* lastOf(const std::vector<LogDecoder::Checkpoint>& all,
                                      const Test& test)

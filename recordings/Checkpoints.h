@@ -9,9 +9,9 @@
 namespace orvane
 {
 
-// Places along a log from which a play can go on, so that any place is reached by decoding a small
-// part of the log. Their number and memory are bounded: when there are too many, every second one
-// is given up, and the next ones are taken twice as far apart.
+// Places in a log from which decoding can continue, so that any place is reached by decoding a
+// small part of the log. Their number and memory are bounded: when there are too many, every second
+// one is removed, and the next ones are taken twice as far apart.
 class Checkpoints
 {
 public:
@@ -21,10 +21,10 @@ public:
     // Takes a checkpoint if it is time for one. Call at the log's start and after every item.
     void pass(const LogDecoder& decoder);
 
-    // The last one whose items are all of earlier times than `time`; the log's start if there is no
-    // other. Null before the first call of pass().
+    // The last checkpoint whose items are all earlier than `time`; if there is none, the start of
+    // the log. Null before the first call of pass().
     [[nodiscard]] const LogDecoder::Checkpoint* before(LogTime time) const;
-    // The last one at which the serving cell had changed no more often than that.
+    // The last checkpoint at which the serving cell had changed at most that often.
     [[nodiscard]] const LogDecoder::Checkpoint* withCellChanges(std::uint64_t most) const;
 
     [[nodiscard]] std::size_t size() const { return _all.size(); }

@@ -14,12 +14,12 @@
 namespace orvane
 {
 
-// A diagnostic log on its way through the generator of its technology, item by item in file order,
-// as if each came from a telephony server.
+// Passes the items of a diagnostic log to the generator of its technology, one after the other in
+// file order, as if each came from a telephony server.
 //
-// The time is that of the latest item taken. It never goes back, and an item without a timestamp,
-// or with one that those of the next items contradict, has the time of the one before. What a
-// message makes a decoder throw costs that message only.
+// The time is that of the last item taken. It never goes back. An item without a timestamp, or with
+// one that the next items contradict, has the time of the item before. If a decoder throws, only
+// that message is lost.
 class LogDecoder
 {
 public:
@@ -27,15 +27,15 @@ public:
     LogDecoder(std::shared_ptr<ByteSource> log, const std::string& technology);
     ~LogDecoder();
 
-    // Looks for the next item where that has not been found yet, and gives up for now after a
-    // megabyte that holds none.
+    // Looks for the next item, unless it has been found already. Stops after a megabyte without an
+    // item; call it again to go on.
     void lookAhead();
     [[nodiscard]] bool hasNext() const { return _place.hasNext; }
     // No item is left.
     [[nodiscard]] bool isAtEnd() const { return !hasNext() && reader().isAtEnd(); }
-    // The next item's time, where it has been found.
+    // The time of the next item, if that has been found.
     [[nodiscard]] LogTime nextTime() const { return _place.nextTime; }
-    // Decodes the next item and looks ahead for the one after it. Nothing where none was found.
+    // Decodes the next item, if it has been found, and looks ahead for the one after it.
     void takeNext();
 
     [[nodiscard]] std::uint64_t itemsTaken() const { return _place.itemsTaken; }
@@ -43,25 +43,25 @@ public:
     [[nodiscard]] const LogClock& clock() const { return _place.clock; }
     // What is shown now; absent before the first item.
     [[nodiscard]] const PropertyValue& display() const;
-    // How often the serving cell became another one, the first one included, of those that were
-    // shown after all items of one time.
+    // How often the serving cell has changed, the first cell included. Only the cells that are
+    // shown after all items of one time count.
     [[nodiscard]] std::uint64_t servingCellChanges() const { return _place.servingCellChanges; }
 
     // One line that says why nothing is shown although items were decoded, and what to do: the
     // technology's display template is missing or damaged.
     [[nodiscard]] std::optional<std::string> problem() const;
 
-    // How many items that were found so far have a time that cannot be.
+    // How many of the items found so far have an impossible time.
     [[nodiscard]] std::uint64_t impossibleTimes() const { return _place.impossibleTimes; }
 
-    // For how far reading has come, and what could not be placed.
+    // Tells how far the log has been read, and what could not be placed.
     [[nodiscard]] const DlfReader& reader() const { return _place.reader; }
 
-    // Error lines about messages go to the process's log; by default no line does.
+    // Whether error lines about messages go to the process's log; not by default.
     void setTellsErrors(bool tells) { _tellsErrors = tells; }
 
 private:
-    // All that it goes on from beside the generator and the generator's state.
+    // Everything that decides what comes next, except the generator and its state.
     struct Place {
         DlfReader reader; // behind the next item
         ServingCell servingCell;
@@ -77,7 +77,7 @@ private:
     };
 
 public:
-    // Where it was, to go on from exactly there.
+    // A place to continue from.
     struct Checkpoint {
         Place place;
         GeneratorCheckpoint generator;

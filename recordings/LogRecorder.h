@@ -19,9 +19,9 @@ namespace orvane
 // message as it comes, without type bytes and wrappers, across all reconnections. What the server
 // made itself has no place in such a file.
 //
-// Each item is written at once, so that the end of the process loses none; what was written is made
-// safe from a power cut within a second. The first failure, a full disk as a rule, ends the
-// recording with one line to the owner, and leaves the whole items in the file.
+// Each item is written at once, so that no item is lost when the process ends. What was written is
+// safe from a power cut within a second. The first failure (a full disk, a deleted file) ends the
+// recording with one line to the owner; the file keeps the whole items.
 class LogRecorder final : public LogChannelObserver
 {
 public:

@@ -10,7 +10,7 @@ namespace orvane
 // What a recording is opened with.
 struct RecordingSettings {
     std::string name;                      // what the person calls the file: for messages
-    std::optional<std::string> technology; // the constant; nothing where a log's codes are to tell
+    std::optional<std::string> technology; // the constant; nullopt: found by the log's codes
     std::chrono::nanoseconds refreshPeriod = std::chrono::seconds(2); // more than 0
 };
 

@@ -10,9 +10,9 @@
 namespace orvane
 {
 
-// What is put aside on disk while a recording is read: texts and numbers, read again in the order
-// in which they were written. In a file without a name below the system's temporary directory,
-// which goes with the spool or the program.
+// Texts and numbers that are put aside on disk while a recording is read, and read again in the
+// order in which they were written. The file has no name: it is below the system's temporary
+// directory and disappears with the spool or the program.
 class RowSpool
 {
 public:

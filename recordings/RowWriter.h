@@ -14,7 +14,7 @@ namespace orvane
 class RowWriter
 {
 public:
-    // Takes one or more whole lines. False where nobody reads on.
+    // Takes one or more whole lines. False if nobody reads on.
     using Output = std::function<bool(std::string_view lines)>;
 
     virtual ~RowWriter() = default;
@@ -23,7 +23,7 @@ public:
     virtual bool takePeriod(const std::string& time, const RowTable& table) = 0;
     // The last period has been taken.
     virtual void finish(const RowTable&) {}
-    // One line for the user where something went wrong that is not the output's.
+    // One line for the user if something other than the output failed.
     [[nodiscard]] virtual std::optional<std::string> problem() const { return std::nullopt; }
 };
 

@@ -30,7 +30,7 @@ std::optional<std::int64_t> secondsOf(const std::string& date)
     if (fields != 6 || static_cast<std::size_t>(end) != date.size())
         return std::nullopt;
     const std::int64_t seconds = secondsSince1970(time);
-    // What is no date, as February 30, comes back as another one.
+    // An impossible date, such as February 30, comes back as another one.
     if (absoluteDateText(static_cast<double>(seconds)) != date)
         return std::nullopt;
     return seconds;

@@ -11,8 +11,8 @@
 namespace orvane
 {
 
-// A saved snapshot: what was kept of a live view, with what the user wrote about it. Whatever a
-// file lacks, or has of the wrong kind, is empty here.
+// A saved snapshot: the kept displays and messages of a live view, and the user's description. What
+// is missing in the file, or of the wrong type, is empty here.
 struct Snapshot {
     // One of the things that were saved: a display as it was, or the log.
     struct Entry {
@@ -22,7 +22,7 @@ struct Snapshot {
         PropertyValue display;                     // absent where the entry has none
         std::shared_ptr<ByteSource> log;           // a diagnostic log; null where it has none
 
-        // "2026-11-21T10:00:00.000Z"; nothing where the date cannot be read.
+        // "2026-11-21T10:00:00.000Z"; nullopt if the date cannot be read.
         [[nodiscard]] std::optional<std::string> isoDate() const;
     };
 
@@ -31,7 +31,7 @@ struct Snapshot {
     std::vector<Entry> entries;
 };
 
-// Nothing for what is no dictionary with any of a snapshot's keys.
+// nullopt unless the value is a dictionary with a snapshot key.
 std::optional<Snapshot> snapshotFrom(const PropertyValue& value);
 
 } // namespace orvane

@@ -10,9 +10,8 @@
 namespace orvane
 {
 
-// A snapshot as a tree of rows and groups: what the user wrote, when, and a group for each entry
-// that holds the display as it was. The group of a log is empty: what it shows is for a player to
-// tell.
+// A snapshot as a tree: rows for description and time, and a group for each entry with the display
+// as it was. The group of a log is empty; a player fills it.
 class SnapshotTree
 {
 public:

@@ -8,23 +8,23 @@
 namespace orvane
 {
 
-// The timestamps of the next few items of a log, which tell whether that of the item before them is
-// to be believed: one that damage has made up would else take the whole log to its time, from where
-// time never comes back.
+// The timestamps of the next few items of a log. They decide whether the timestamp before them is
+// plausible: time never goes back, so one corrupt timestamp would otherwise drag the rest of the
+// log to it.
 class TimesAhead
 {
 public:
-    // Farther than that from one item to the next is a leap.
+    // A longer step from one item to the next is a leap.
     static constexpr LogTime kLongestStep = std::chrono::hours(24);
 
-    // Takes the items that follow, of its own copy of the reader: three with a timestamp, if they
-    // are near.
+    // Reads the items that follow with its own copy of the reader, until three have a timestamp or
+    // sixteen have been read.
     explicit TimesAhead(DlfReader reader);
 
-    // Whether a log may begin at that timestamp: not if the next items agree on some other day.
+    // Whether a log may begin at that timestamp: not if the next items agree on another day.
     [[nodiscard]] bool allowStart(std::uint64_t timestamp) const;
-    // Whether time may leap to that timestamp, which is a leap from the time reached: not if the
-    // next items are back by then.
+    // Whether time may leap to that timestamp from the time reached: not if most of the next items
+    // are back at the time reached.
     [[nodiscard]] bool allowLeap(std::uint64_t timestamp, const LogClock& clock,
                                  LogTime reached) const;
 
