@@ -137,7 +137,7 @@ TEST_F(SnapshotFileTest, AFileThatCannotBeWrittenFailsWithItsReason)
     const SnapshotResult result = writeSnapshotFile(files, PropertyValue::newArray(), 0, "");
     EXPECT_FALSE(result.isWritten);
     EXPECT_THAT(services.log.errors(), ElementsAre("Unable to write snapshot to " + result.path,
-                                                   "The snapshot was not saved: Is a directory"));
+                                                   "The snapshot was not saved: File exists"));
 }
 
 TEST_F(SnapshotFileTest, ASecondSaveWithinTheSecondReplacesTheFirst)
