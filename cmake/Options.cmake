@@ -14,9 +14,9 @@ target_compile_options(
             $<$<AND:$<CONFIG:Release>,$<CXX_COMPILER_ID:GNU>>:-Wno-restrict>)
 
 # lld links the programs in a quarter of the time. It does not know the objects of g++'s
-# interprocedural optimisation.
+# interprocedural optimisation; sanitized programs use the compiler's own linker.
 find_program(ORVANE_LLD ld.lld)
-if(ORVANE_LLD AND NOT CMAKE_INTERPROCEDURAL_OPTIMIZATION)
+if(ORVANE_LLD AND NOT CMAKE_INTERPROCEDURAL_OPTIMIZATION AND NOT ORVANE_SANITIZERS)
   target_link_options(orvane_options INTERFACE -fuse-ld=lld)
 endif()
 
