@@ -102,12 +102,15 @@ TEST_F(LogSurveyTest, TextsAndProgramsAreNoLogs)
     EXPECT_FALSE(survey.technology());
     EXPECT_THAT(survey.complaint("x.txt"), HasSubstr("is neither a diagnostic log"));
 
-    Bytes start = readFile("/proc/self/exe").value_or(Bytes());
-    ASSERT_GT(start.size(), 500'000U);
-    start.resize(500'000);
-    const LogSurvey program = read(sourceOf(start));
-    EXPECT_FALSE(program.technology());
-    EXPECT_THAT(program.complaint("x"), HasSubstr("is neither a diagnostic log"));
+    // Not this program: what it holds depends on the compiler and the linker.
+    for (const char* const path : {"/bin/sh", "/bin/bash", "/bin/tar", "/bin/grep"}) {
+        Bytes start = readFile(path).value_or(Bytes());
+        ASSERT_GT(start.size(), 100'000U) << path;
+        start.resize(std::min<std::size_t>(start.size(), 500'000));
+        const LogSurvey program = read(sourceOf(start));
+        EXPECT_FALSE(program.technology()) << path;
+        EXPECT_THAT(program.complaint("x"), HasSubstr("is neither a diagnostic log")) << path;
+    }
 
     // Like a program's tables: addresses and small numbers.
     Bytes table;
