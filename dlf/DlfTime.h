@@ -27,7 +27,7 @@ constexpr std::uint64_t kFirstFutureTimestamp = std::uint64_t{0x400} << 48;
 [[nodiscard]] double dlfSecondsSince1970(std::uint64_t timestamp);
 
 // The inverse, to the nearest fraction. A time that is a whole step as near as a double can say it
-// becomes that step with fraction 0. Times before 1980-01-06, and what is no number, become 0;
+// becomes that step with fraction 0. Times before 1980-01-06, and not-a-number, become 0;
 // times beyond the last timestamp become that one.
 [[nodiscard]] std::uint64_t dlfTimestamp(double secondsSince1970);
 
